@@ -1,0 +1,13 @@
+# SPDX-License-Identifier: Apache-2.0
+# Warnings and sanitizers for everything that is built here.
+add_compile_options(
+  -Wall -Wextra -Wpedantic -Wshadow -Wformat=2 -Wundef
+  $<$<COMPILE_LANGUAGE:CXX>:-Wnon-virtual-dtor>
+  $<$<COMPILE_LANGUAGE:CXX>:-Woverloaded-virtual>)
+if(IMS_WERROR)
+  add_compile_options(-Werror)
+endif()
+if(IMS_SANITIZE)
+  add_compile_options(-fsanitize=${IMS_SANITIZE} -fno-sanitize-recover=all -fno-omit-frame-pointer)
+  add_link_options(-fsanitize=${IMS_SANITIZE})
+endif()
