@@ -1,0 +1,185 @@
+/*
+ * SPDX-License-Identifier: Apache-2.0
+ */
+#ifndef KELVO_IMS_TYPES_H
+#define KELVO_IMS_TYPES_H
+
+#include <stdbool.h>
+#include <stddef.h>
+#include <stdint.h>
+
+/**
+ * @file ims_types.h
+ * @brief The handle, the result codes, the callbacks and the notification ids.
+ *
+ * @section requests Requests
+ *
+ * A request or query is one method call on the IMS service: bus name `org.kelvo.ims` on
+ * the system bus, object `/org/kelvo/ims/sub<slot>`, one interface per module. The functions that
+ * take an #ims_response_cb are asynchronous: they return as soon as the call is queued, and the
+ * outcome reaches the callback. The queries are synchronous: they block for at most 60 s. A bus
+ * that is not configured otherwise lets one process wait for 128 answers at a time.
+ *
+ * Every function, the ones that only clear a record excepted, first asks the platform whether the
+ * device has the IMS feature. No argument is looked at before that.
+ *
+ * What every function can return:
+ *  - #IMS_ERROR_NONE: an asynchronous request was queued; a query has filled its record.
+ *  - #IMS_ERROR_NOT_SUPPORTED: the device's IMS feature is switched off.
+ *  - #IMS_ERROR_OPERATION_FAILED: the feature could not be queried. For a query also: the service
+ *    could not be reached, did not answer in time, answered with something that is not the
+ *    operation's reply, or reported a failure of its own.
+ *  - #IMS_ERROR_INVALID_PARAMETER: the handle or a required pointer is NULL, a text is not valid
+ *    UTF-8, or the request would be larger than 16 MiB. Nothing was sent.
+ *  - #IMS_ERROR_PERMISSION_DENIED (queries and ims_init()): the bus or the service refused the
+ *    caller.
+ *
+ * @section threads Threads
+ *
+ * The library starts no thread and takes no lock. Use a handle from one thread. Replies and
+ * notifications are delivered in the GLib main context that was thread-default when the request or
+ * the subscription was made; an application that iterates no main context receives none. A
+ * synchronous query blocks the thread and never runs that context.
+ *
+ * @section ownership Ownership
+ *
+ * Records and texts that the application passes in are read during the call only; the exceptions
+ * are stated with the functions. Whatever a callback receives is valid while the callback runs,
+ * unless its documentation says that the application takes it over: then free() releases it.
+ */
+
+#ifdef __GNUC__
+#define IMS_API __attribute__((visibility("default")))
+#else
+#define IMS_API
+#endif
+
+#ifdef __cplusplus
+extern "C" {
+#endif
+
+/** A client of one subscription slot. Made by ims_init(), released by ims_deinit(). */
+typedef struct ims_client_s *ims_h;
+
+/** What every function of the library returns. */
+typedef enum ims_error_e {
+    /** Success. For an asynchronous request: the call was handed to D-Bus. */
+    IMS_ERROR_NONE = 0,
+    /** A required pointer or argument is missing or out of range. */
+    IMS_ERROR_INVALID_PARAMETER = -22,
+    /** The caller was refused. */
+    IMS_ERROR_PERMISSION_DENIED = -13,
+    /** The platform's IMS feature is switched off (0xC0000002). */
+    IMS_ERROR_NOT_SUPPORTED = -1073741822,
+    /** The feature query, the bus or the service failed (0xEFFB0001). */
+    IMS_ERROR_OPERATION_FAILED = -268763135
+} ims_error_e;
+
+/** The results that the library itself gives to an #ims_response_cb. */
+enum {
+    /** The D-Bus call failed: no service, no answer within 60 s, or an answer of another shape. */
+    IMS_RESPONSE_FAILED = 1,
+    /** The bus or the service refused the caller. */
+    IMS_RESPONSE_ACCESS_DENIED = 2
+};
+
+/**
+ * @brief Receives the outcome of one asynchronous request, once.
+ *
+ * It is not called when the request's D-Bus call was cancelled.
+ *
+ * @param handle     the handle that the request was made on
+ * @param result     the service's result, where 0 is success and every other value is the
+ *                   service's own; #IMS_RESPONSE_FAILED or #IMS_RESPONSE_ACCESS_DENIED when the
+ *                   service's answer never came
+ * @param data       what the request's documentation says; NULL on every failure of the D-Bus
+ *                   call. Valid while the callback runs
+ * @param user_data  the pointer that was given with the request
+ */
+typedef void (*ims_response_cb)(ims_h handle, int result, void *data, void *user_data);
+
+/**
+ * @brief Receives one kind of event, every time it happens.
+ *
+ * ims_unset_notification_cb() and ims_deinit() may be called from here.
+ *
+ * @param handle     the handle that the callback was set on
+ * @param noti_id    the #ims_noti_id_e of the event
+ * @param event      the event record of that id, valid while the callback runs
+ * @param user_data  the pointer that was given to ims_set_notification_cb()
+ */
+typedef void (*ims_notification_cb)(ims_h handle, int noti_id, void *event, void *user_data);
+
+/**
+ * The events that ims_set_notification_cb() takes. Each is one D-Bus signal of the service. The
+ * push-to-talk ones (IMS_NOTI_POC_) can be asked for, but this version does not deliver them yet.
+ */
+typedef enum ims_noti_id_e {
+    IMS_NOTI_REG_REGISTRATION_STATUS =
+        0x101, /**< Registration.RegistrationStatus: #ims_registration_info_s */
+    IMS_NOTI_REG_EMERGENCY_REGISTRATION_STATUS =
+        0x102, /**< Registration.EmergencyRegistrationStatus: #ims_emergency_registration_info_s */
+
+    IMS_NOTI_CALL_INCOMING_IND = 0x201,   /**< Call.CallIncomingInd: #ims_call_incoming_s */
+    IMS_NOTI_CALL_IN_PROGRESS = 0x202,    /**< Call.CallInProgress: #ims_call_session_s */
+    IMS_NOTI_CALL_ALERTING = 0x203,       /**< Call.CallAlerting: #ims_call_session_s */
+    IMS_NOTI_CALL_BUSY = 0x204,           /**< Call.CallBusy: #ims_call_session_s */
+    IMS_NOTI_CALL_ESTABLISHED = 0x205,    /**< Call.CallEstablished: #ims_call_established_s */
+    IMS_NOTI_CALL_HELD = 0x206,           /**< Call.CallHeld: #ims_call_held_s */
+    IMS_NOTI_CALL_RESUMED = 0x207,        /**< Call.CallResumed: #ims_call_resumed_s */
+    IMS_NOTI_CALL_FORWARDED = 0x208,      /**< Call.CallForwarded: #ims_call_session_s */
+    IMS_NOTI_CALL_ENDED = 0x209,          /**< Call.CallEnded: #ims_call_ended_s */
+    IMS_NOTI_CALL_SWITCHED = 0x20A,       /**< Call.CallSwitched: #ims_call_switched_s */
+    IMS_NOTI_CALL_CHANGE_REQUEST = 0x20B, /**< Call.CallChangeRequest: #ims_call_change_request_s */
+    IMS_NOTI_CALL_CONF_NOTIFY_RECEIVED =
+        0x20C, /**< Call.CallConfNotifyReceived: #ims_call_conf_notify_s */
+    IMS_NOTI_CALL_EARLY_MEDIA_START =
+        0x20D,                             /**< Call.CallEarlyMediaStart: #ims_call_early_media_s */
+    IMS_NOTI_CALL_STOP_ALERT_TONE = 0x20E, /**< Call.CallStopAlertTone: #ims_call_session_s */
+    IMS_NOTI_CALL_ERROR = 0x20F,           /**< Call.CallError: #ims_call_error_s */
+    IMS_NOTI_CALL_CONFERENCE_CALL_ESTABLISHED =
+        0x210, /**< Call.CallConfernceCallEstablished: #ims_call_conference_event_s */
+    IMS_NOTI_CALL_CONFERENCE_CALL_PARTICIPANT_ADDED =
+        0x211, /**< Call.CallConfernceCallParticipantAdded: #ims_call_conference_event_s */
+    IMS_NOTI_CALL_CONFERENCE_CALL_PARTICIPANT_REMOVED =
+        0x212, /**< Call.CallConfernceCallParticipantRemoved: #ims_call_conference_event_s */
+    IMS_NOTI_CALL_USSD_INDICATION =
+        0x213,                        /**< Call.CallUssdIndication: #ims_call_ussd_indication_s */
+    IMS_NOTI_CALL_DTMF_EVENT = 0x223, /**< Call.CallDtmfEvent: #ims_call_dtmf_event_s */
+
+    IMS_NOTI_SMS_INCOMING_SMS = 0x301, /**< Sms.IncomingSms: #ims_sms_incoming_s */
+    IMS_NOTI_SMS_SEND_SMS_ACK = 0x302, /**< Sms.SendSmsAck: #ims_sms_send_ack_s */
+    IMS_NOTI_SMS_DELIVERY_REPORT_ACK =
+        0x303, /**< Sms.DeliveryReportAck: #ims_sms_delivery_report_ack_s */
+
+    IMS_NOTI_POC_CALL_INCOMING_IND = 0x401,           /**< Poc.PocCallIncomingInd */
+    IMS_NOTI_POC_CALL_IN_PROGRESS = 0x402,            /**< Poc.PocCallInProgress */
+    IMS_NOTI_POC_CALL_ALERTING = 0x403,               /**< Poc.PocCallAlerting */
+    IMS_NOTI_POC_CALL_ESTABLISHED = 0x404,            /**< Poc.PocCallEstablished */
+    IMS_NOTI_POC_CALL_ENDED = 0x405,                  /**< Poc.PocCallEnded */
+    IMS_NOTI_POC_CALL_FLOOR_GRANTED = 0x406,          /**< Poc.PocCallFloorGranted */
+    IMS_NOTI_POC_CALL_FLOOR_REJECTED = 0x407,         /**< Poc.PocCallFloorRejected */
+    IMS_NOTI_POC_CALL_FLOOR_IDLE = 0x408,             /**< Poc.PocCallFloorIdle */
+    IMS_NOTI_POC_CALL_FLOOR_QUEUE_POSITION = 0x409,   /**< Poc.PocCallFloorQueuePosition */
+    IMS_NOTI_POC_CALL_FLOOR_CANCELED = 0x40A,         /**< Poc.PocCallFloorCanceled */
+    IMS_NOTI_POC_CALL_FLOOR_TAKEN = 0x40B,            /**< Poc.PocCallFloorTaken */
+    IMS_NOTI_POC_CALL_MODIFY_REQUEST = 0x40C,         /**< Poc.PocCallModifyRequest */
+    IMS_NOTI_POC_CALL_MODIFY_STATUS = 0x40D,          /**< Poc.PocCallModifyStatus */
+    IMS_NOTI_POC_CALL_FLOOR_REQUEST_TIMEOUT = 0x40E,  /**< Poc.PocCallFloorRequestTimeout */
+    IMS_NOTI_POC_CALL_CRISIS_CALL_INITIATED = 0x40F,  /**< Poc.PocCallCrisisCallInitiated */
+    IMS_NOTI_POC_GROUP_ADVERTISEMENT = 0x410,         /**< Poc.PocGroupAdvertisement */
+    IMS_NOTI_POC_GROUP_CONF_PARTICIPANT_INFO = 0x411, /**< Poc.PocGroupConfParticipantInfo */
+    IMS_NOTI_POC_INCOMING_MSG_INFO = 0x412,           /**< Poc.PocIncomingMsgInfo */
+    IMS_NOTI_POC_MSG_NOTIFICATION = 0x413,            /**< Poc.PocMsgNotification */
+    IMS_NOTI_POC_INCOMING_FILE_TRANSFER = 0x414,      /**< Poc.PocIncomingFileTransfer */
+    IMS_NOTI_POC_FILE_TRANSFER_PROGRESS = 0x415,      /**< Poc.PocFileTransferProgress */
+    IMS_NOTI_POC_FILE_TRANSFER_TERMINATED = 0x416,    /**< Poc.PocFileTransferTerminated */
+
+    IMS_NOTI_LOGIN_STATE = 0x501 /**< Login.LoginState: #ims_login_state_s */
+} ims_noti_id_e;
+
+#ifdef __cplusplus
+}
+#endif
+
+#endif

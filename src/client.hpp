@@ -1,0 +1,31 @@
+// SPDX-License-Identifier: Apache-2.0
+// What a handle is.
+#pragma once
+
+#include "glib.hpp"
+#include "ims_types.h"
+
+#include <cstdint>
+
+struct ims_client_s {
+    ims::Connection connection;
+    ims::Text object_path;
+    // The signal string, "interface:member", to its ims_noti_cb_info_s; both freed with g_free.
+    ims::HashTable noti_table;
+    // What the service gave this client when it registered; part of most requests.
+    std::int32_t app_id;
+};
+
+// One subscription to a signal.
+struct ims_noti_cb_info_s {
+    guint subscription_id;
+    ims_notification_cb callback;
+    void *user_data;
+};
+
+// What travels with one asynchronous request.
+struct ims_request_ctx_s {
+    ims_h handle;
+    ims_response_cb callback;
+    void *user_data;
+};

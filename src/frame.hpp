@@ -1,0 +1,138 @@
+// SPDX-License-Identifier: Apache-2.0
+// What every exported function shares: gate and argument checks, the asynchronous request with its
+// response, the synchronous query.
+//
+// An exported function admits its arguments, packs its tuple and requests:
+//
+//     if (const int refused = admit({handle, info}))
+//         return refused;
+//     return request(handle, kInterface, "AnswerCall", pack<"(ii)">(handle->app_id, info->...),
+//                    {on_response_call_answer_call, callback, user_data});
+//
+// Its response handler completes the request with the signature of the reply:
+//
+//     complete<"(ii)">(source, outcome, context, kSecondByPointer);
+#pragma once
+
+#include "client.hpp"
+#include "log.hpp"
+#include "wire.hpp"
+
+#include <initializer_list>
+
+namespace ims {
+
+inline constexpr const char *kServiceName = "org.kelvo.ims";
+inline constexpr int kRequestTimeoutMs = 60000;
+
+// 0 when the device has the IMS feature and none of the pointers is NULL, in this order.
+int admit(std::initializer_list<const void *> required = {}, Site site = here()) noexcept;
+
+// Logs and returns what a bad argument earns.
+int invalid_parameter(Site site = here()) noexcept;
+
+// Who takes the answer to a request.
+struct Response {
+    GAsyncReadyCallback handler;
+    ims_response_cb callback;
+    void *user_data;
+};
+
+// Queues one method call. A tuple that could not be packed, or is too
+// large for the bus, is an invalid parameter; an empty one is
+// sent as no parameters.
+int request(ims_h handle, const char *interface, const char *method, const Variant &tuple,
+            Response response, Site site = here()) noexcept;
+
+// Makes one method call, waits for its reply and stores it.
+int query(ims_h handle, const char *interface, const char *method, const Variant &tuple,
+          Variant &reply, int timeout_ms = kRequestTimeoutMs, Site site = here()) noexcept;
+
+// The application's side of a finished request.
+class Completion {
+  public:
+    explicit Completion(gpointer context) noexcept
+        : context_{static_cast<ims_request_ctx_s *>(context)} {}
+
+    bool is_wanted() const noexcept { return context_ && context_->callback != nullptr; }
+    void operator()(int result, void *data = nullptr) const noexcept {
+        if (is_wanted())
+            context_->callback(context_->handle, result, data, context_->user_data);
+    }
+
+  private:
+    std::unique_ptr<ims_request_ctx_s> context_;
+};
+
+// The reply, or nothing: then the application has been told what it is to know of the failure.
+Variant finish(GObject *source, GAsyncResult *outcome, const Completion &done, Site site) noexcept;
+
+namespace frame {
+
+// What the members of a reply are unpacked to: texts are borrowed from the reply.
+template <char Letter>
+struct ReplyMember {
+    using Type = Variant;
+};
+template <>
+struct ReplyMember<'b'> {
+    using Type = bool;
+};
+template <>
+struct ReplyMember<'i'> {
+    using Type = std::int32_t;
+};
+template <>
+struct ReplyMember<'u'> {
+    using Type = std::uint32_t;
+};
+template <>
+struct ReplyMember<'s'> {
+    using Type = const char *;
+};
+
+template <Literal Format, std::size_t... Index>
+auto reply_members(std::index_sequence<Index...>)
+    -> std::tuple<typename ReplyMember<Signature<Format>::member(Index)[0]>::Type...>;
+
+} // namespace frame
+
+// Ends a request whose reply has this signature: `deliver` gets the completion and the reply's
+// members, and calls the completion. A reply of another type is a failed call.
+template <Literal Format, typename Deliver>
+void complete(GObject *source, GAsyncResult *outcome, gpointer context, const Deliver &deliver,
+              Site site = here()) noexcept {
+    const Completion done{context};
+    const Variant reply = finish(source, outcome, done, site);
+    if (!reply)
+        return;
+    decltype(frame::reply_members<Format>(
+        std::make_index_sequence<Signature<Format>::size()>{})) members{};
+    const auto unpack_members = [&reply](auto &...member) {
+        return unpack<Format>(reply.get(), member...);
+    };
+    if (std::apply(unpack_members, members))
+        std::apply([&](auto &...member) { deliver(done, member...); }, members);
+    else
+        done(IMS_RESPONSE_FAILED);
+}
+
+// The usual deliveries: the result alone whatever follows it, a pointer to the second member, the
+// second member itself in the pointer's place.
+inline constexpr auto kResultOnly = [](const Completion &done, std::int32_t result,
+                                       const auto &...) { done(result); };
+inline constexpr auto kSecondByPointer = [](const Completion &done, std::int32_t result,
+                                            auto &second) { done(result, &second); };
+inline constexpr auto kSecondInPlace = [](const Completion &done, std::int32_t result,
+                                          std::int32_t second) {
+    // NOLINTNEXTLINE(performance-no-int-to-ptr): applications read the value from the pointer.
+    done(result, reinterpret_cast<void *>(static_cast<std::intptr_t>(second)));
+};
+
+// Ends a request whose reply is the result alone.
+inline void complete(GObject *source, GAsyncResult *outcome, gpointer context,
+                     Site site = here()) noexcept {
+    complete<"(i)">(source, outcome, context, kResultOnly, site);
+}
+
+} // namespace ims

@@ -1,0 +1,188 @@
+// SPDX-License-Identifier: Apache-2.0
+// Handle and connection, notification registry, routing.
+#include "ims.h"
+
+#include "frame.hpp"
+#include "notifications.hpp"
+
+#include <cerrno>
+#include <cstring>
+#include <new>
+
+namespace ims {
+namespace {
+
+constexpr const char *kObjectPathPrefix = "/org/kelvo/ims";
+constexpr const char *kRegistrationInterface = "org.kelvo.ims.Registration";
+constexpr int kRegisterTimeoutMs = kRequestTimeoutMs / 10;
+
+// Releases a client's parts in the order in which they depend on each other: the table's
+// subscriptions live on the connection.
+struct ClientReleaser {
+    void operator()(ims_client_s *client) const noexcept {
+        client->object_path.reset();
+        client->noti_table.reset();
+        client->connection.reset();
+        *client = {};
+        delete client;
+    }
+};
+using Client = std::unique_ptr<ims_client_s, ClientReleaser>;
+
+struct Route {
+    const char *interface;
+    Decoder decode;
+};
+
+constexpr Route kRoutes[] = {
+    {"org.kelvo.ims.Call", on_call_signal_emit_handler},
+    {"org.kelvo.ims.Sms", on_sms_signal_emit_handler},
+    {"org.kelvo.ims.Registration", on_reg_signal_emit_handler},
+    {"org.kelvo.ims.Login", on_login_signal_emit_handler},
+};
+
+const Notification *find_notification(int noti_id) noexcept {
+    for (const Notification &notification : notifications()) {
+        if (notification.id == noti_id)
+            return &notification;
+    }
+    return nullptr;
+}
+
+Text signal_string(const char *interface, const char *member) noexcept {
+    return Text{g_strdup_printf("%s:%s", interface, member)};
+}
+
+// 0 for a signal that is no notification's.
+int notification_id(const char *interface, const char *member) noexcept {
+    for (const Notification &notification : notifications()) {
+        if (g_str_equal(notification.interface, interface) &&
+            g_str_equal(notification.member, member))
+            return notification.id;
+    }
+    return 0;
+}
+
+void on_signal_callback(GDBusConnection *, const char *, const char *, const char *interface,
+                        const char *member, GVariant *parameters, gpointer user_data) noexcept {
+    const auto handle = static_cast<ims_h>(user_data);
+    if (handle == nullptr) {
+        log_error(here(), "Invalid parameter");
+        return;
+    }
+    const Text noti_str = signal_string(interface, member);
+    const auto *found = static_cast<const ims_noti_cb_info_s *>(
+        g_hash_table_lookup(handle->noti_table.get(), noti_str.get()));
+    if (found == nullptr) {
+        log_error(here(), "can't find noti_str(%s) callback info", noti_str.get());
+        return;
+    }
+    for (const Route &route : kRoutes) {
+        if (g_str_equal(route.interface, interface))
+            return route.decode(handle, notification_id(interface, member), parameters, found);
+    }
+    log_error(here(), "unhandled signal!!");
+}
+
+// For g_hash_table_foreach_remove(): TRUE removes the entry.
+gboolean unsubscribe_entry(gpointer, gpointer value, gpointer connection) noexcept {
+    g_dbus_connection_signal_unsubscribe(
+        static_cast<GDBusConnection *>(connection),
+        static_cast<const ims_noti_cb_info_s *>(value)->subscription_id);
+    return TRUE;
+}
+
+} // namespace
+} // namespace ims
+
+using namespace ims;
+
+int ims_init(int slot, ims_h *handle) {
+    if (const int refused = admit({handle}))
+        return refused;
+    Client client{new (std::nothrow) ims_client_s{}};
+    if (!client) {
+        log_error(here(), "Memory allocation failed!");
+        return IMS_ERROR_OPERATION_FAILED;
+    }
+    GError *failure = nullptr;
+    client->connection.reset(g_bus_get_sync(G_BUS_TYPE_SYSTEM, nullptr, &failure));
+    const Error error{failure};
+    if (!client->connection) {
+        log_error(here(), "Error creating dbus connection: %s\n", error ? error->message : "");
+        return IMS_ERROR_OPERATION_FAILED;
+    }
+    client->object_path.reset(g_strdup_printf("%s/sub%d", kObjectPathPrefix, slot));
+    client->noti_table.reset(g_hash_table_new_full(g_str_hash, g_str_equal, g_free, g_free));
+
+    // A program's name is bytes; a D-Bus text is UTF-8.
+    const Text program{g_utf8_make_valid(program_invocation_name, -1)};
+    Variant reply;
+    if (const int failed = query(client.get(), kRegistrationInterface, "RegisterApplication",
+                                 pack<"(is)">(slot, program.get()), reply, kRegisterTimeoutMs))
+        return failed;
+    std::int32_t result = 1;
+    if (!unpack<"(ii)">(reply.get(), result, client->app_id))
+        return IMS_ERROR_OPERATION_FAILED;
+    if (result != 0) {
+        log_error(here(), "Failed to get registration info: %d", result);
+        return IMS_ERROR_OPERATION_FAILED;
+    }
+    *handle = client.release();
+    return IMS_ERROR_NONE;
+}
+
+int ims_deinit(ims_h handle) {
+    if (const int refused = admit({handle}))
+        return refused;
+    const Client client{handle};
+    g_hash_table_foreach_remove(client->noti_table.get(), unsubscribe_entry,
+                                client->connection.get());
+    return IMS_ERROR_NONE;
+}
+
+int ims_set_notification_cb(ims_h handle, int noti_id, ims_notification_cb callback,
+                            void *user_data) {
+    if (const int refused = admit({reinterpret_cast<const void *>(callback), handle}))
+        return refused;
+    const Notification *notification = find_notification(noti_id);
+    if (notification == nullptr)
+        return invalid_parameter();
+    Text noti_str = signal_string(notification->interface, notification->member);
+    if (g_hash_table_contains(handle->noti_table.get(), noti_str.get())) {
+        log_error(here(), "noti_str[%s] is already registered", noti_str.get());
+        return IMS_ERROR_INVALID_PARAMETER;
+    }
+    auto *subscription = g_new0(ims_noti_cb_info_s, 1);
+    subscription->callback = callback;
+    subscription->user_data = user_data;
+    subscription->subscription_id = g_dbus_connection_signal_subscribe(
+        handle->connection.get(), kServiceName, notification->interface, notification->member,
+        handle->object_path.get(), nullptr, G_DBUS_SIGNAL_FLAGS_NONE, on_signal_callback, handle,
+        nullptr);
+    g_hash_table_insert(handle->noti_table.get(), noti_str.release(), subscription);
+    return IMS_ERROR_NONE;
+}
+
+int ims_unset_notification_cb(ims_h handle, int noti_id) {
+    if (const int refused = admit({handle}))
+        return refused;
+    if (!handle->connection)
+        return invalid_parameter();
+    const Notification *notification = find_notification(noti_id);
+    if (notification == nullptr)
+        return invalid_parameter();
+    const Text noti_str = signal_string(notification->interface, notification->member);
+    const auto *subscription = static_cast<const ims_noti_cb_info_s *>(
+        g_hash_table_lookup(handle->noti_table.get(), noti_str.get()));
+    if (subscription == nullptr) {
+        log_error(here(), "noti hasn't registered");
+        return IMS_ERROR_INVALID_PARAMETER;
+    }
+    g_dbus_connection_signal_unsubscribe(handle->connection.get(), subscription->subscription_id);
+    if (!g_hash_table_remove(handle->noti_table.get(), noti_str.get())) {
+        log_error(here(), "Fail to deregister noti_str [%s]", noti_str.get());
+        return IMS_ERROR_OPERATION_FAILED;
+    }
+    return IMS_ERROR_NONE;
+}
