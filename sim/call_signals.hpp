@@ -1,0 +1,14 @@
+// SPDX-License-Identifier: Apache-2.0
+#pragma once
+
+#include "sim/call_events.hpp"
+#include "sim/service.hpp"
+
+#include <span>
+
+namespace sim {
+
+Signal to_signal(const CallEvent &event);
+std::span<const SignalInfo> call_signals();
+
+} // namespace sim

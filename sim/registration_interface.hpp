@@ -1,0 +1,33 @@
+// SPDX-License-Identifier: Apache-2.0
+#pragma once
+
+#include "sim/applications.hpp"
+#include "sim/registrations.hpp"
+#include "sim/service.hpp"
+
+namespace sim {
+
+// org.kelvo.ims.Registration: the applications, and the device in the network.
+class RegistrationInterface {
+  public:
+    RegistrationInterface(Applications &applications, Registrations &registrations)
+        : applications_(applications), registrations_(registrations) {}
+
+    static constexpr std::string_view kName = "org.kelvo.ims.Registration";
+    Interface describe();
+
+  private:
+    Answer<Variant> register_application(const Request &request);
+    Answer<Variant> register_connection(const Request &request);
+    Answer<Variant> get_registration_info(const Request &request);
+    Answer<Variant> enable_flight_mode(const Request &request);
+
+    static const MethodRow<RegistrationInterface> kMethods[];
+
+    Applications &applications_;
+    Registrations &registrations_;
+};
+
+Signal to_signal(const RegistrationEvent &event);
+
+} // namespace sim

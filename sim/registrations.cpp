@@ -1,0 +1,87 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "sim/registrations.hpp"
+
+namespace sim {
+
+namespace {
+
+constexpr std::chrono::milliseconds kRegistrationTime{300};
+
+constexpr std::uint32_t kNoNetwork = 0;
+constexpr std::uint32_t kLte = 1;
+constexpr std::uint32_t kVoice = 1;
+constexpr std::uint32_t kVideo = 2;
+constexpr std::uint32_t kShortMessages = 4;
+constexpr std::uint32_t kUssd = 8;
+constexpr std::int32_t kSipOk = 200;
+constexpr std::int32_t kGrantedSeconds = 3600;
+
+} // namespace
+
+Registrations::Registrations(int slots, Timers &timers, Sink sink)
+    : timers_(timers), sink_(std::move(sink)), slots_(static_cast<std::size_t>(slots)) {}
+
+void Registrations::start() {
+    for (int slot = 0; slot < static_cast<int>(slots_.size()); ++slot)
+        begin(slot);
+}
+
+RegistrationInfo Registrations::info(int slot) const {
+    switch (at(slot).state) {
+    case State::kRegistered:
+        return {true, kLte, kVoice | kVideo | kShortMessages | kUssd, {}, kSipOk, kGrantedSeconds};
+    case State::kFlightMode:
+        return {.reason = RegistrationReason::kFlightMode};
+    case State::kRegistering:
+        break;
+    }
+    return {.reason = RegistrationReason::kUnderWay};
+}
+
+std::optional<Refusal> Registrations::radio_off(int slot) const {
+    if (at(slot).state != State::kFlightMode)
+        return std::nullopt;
+    return refuse(Result::kWrongState,
+                  "slot {} is in flight mode: RegisterApplication without "
+                  "parameters leaves it",
+                  slot);
+}
+
+Status Registrations::enable_flight_mode(int slot) {
+    if (auto refusal = radio_off(slot))
+        return *refusal;
+    const bool announced = registered(slot);
+    at(slot).timer.cancel();
+    at(slot).state = State::kFlightMode;
+    for (const auto &listener : lost_)
+        listener(slot);
+    if (emergency_bearer(slot))
+        set_bearer(slot, false, RegistrationReason::kFlightMode);
+    if (announced)
+        sink_(slot, info(slot));
+    return Done{};
+}
+
+void Registrations::switch_on(int slot) {
+    if (at(slot).state == State::kFlightMode)
+        begin(slot);
+}
+
+void Registrations::begin(int slot) {
+    at(slot).state = State::kRegistering;
+    at(slot).timer = timers_.after(kRegistrationTime, [this, slot] { complete(slot); });
+}
+
+void Registrations::complete(int slot) {
+    at(slot).state = State::kRegistered;
+    sink_(slot, info(slot));
+    for (const auto &listener : registered_)
+        listener(slot);
+}
+
+void Registrations::set_bearer(int slot, bool registered, RegistrationReason reason) {
+    at(slot).emergency_bearer = registered;
+    sink_(slot, EmergencyRegistrationStatus{registered, registered ? kLte : kNoNetwork, reason});
+}
+
+} // namespace sim

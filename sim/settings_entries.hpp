@@ -1,0 +1,18 @@
+// SPDX-License-Identifier: Apache-2.0
+#pragma once
+
+#include "sim/settings_model.hpp"
+
+namespace sim {
+
+// What a dictionary changes: each place once.
+using SettingsChanges = std::vector<std::pair<std::size_t, SettingValue>>;
+
+// Every entry must be a key of these fields, in the form that `direction` has for it.
+Answer<SettingsChanges> check_entries(const SettingsFields &fields, Form SettingsField::*direction,
+                                      const OfferedEntries &entries);
+
+// The decimal text of a number, and nothing else.
+std::optional<std::int32_t> parse_decimal(std::string_view text);
+
+} // namespace sim

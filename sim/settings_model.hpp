@@ -1,0 +1,71 @@
+// SPDX-License-Identifier: Apache-2.0
+#pragma once
+
+#include "sim/result.hpp"
+#include "sim/settings_fields.hpp"
+
+#include <functional>
+
+namespace sim {
+
+// A value of a type that no key has.
+struct ForeignValue {
+    std::string type;
+};
+
+// An entry of a dictionary as it came.
+struct OfferedEntry {
+    std::string key;
+    std::variant<std::int32_t, bool, std::string, ForeignValue> value;
+};
+using OfferedEntries = std::vector<OfferedEntry>;
+
+// All that one slot keeps.
+struct SlotSettings {
+    std::int32_t network_environment = 0;
+    std::vector<SettingsRecord> sets;
+    std::vector<SettingsRecord> profiles;
+
+    static SlotSettings shipped();
+    bool operator==(const SlotSettings &) const = default;
+};
+
+// The settings sets, profiles and network environment of each slot. A request changes all that it
+// names or nothing.
+class SettingsModel {
+  public:
+    // Makes a slot's settings durable. What went wrong, or nothing.
+    using Keeper = std::function<std::optional<std::string>(int slot, const SlotSettings &)>;
+
+    static constexpr std::int32_t kLastNetworkEnvironment = 3;
+
+    explicit SettingsModel(int slots);
+
+    int slots() const { return static_cast<int>(slots_.size()); }
+    const SlotSettings &of(int slot) const { return slots_[static_cast<std::size_t>(slot)]; }
+    void restore(int slot, SlotSettings settings);
+    void keep_with(Keeper keeper) { keeper_ = std::move(keeper); }
+
+    Answer<const SettingsRecord *> find_set(int slot, std::string_view name) const;
+    Status update_set(int slot, const OfferedEntries &entries);
+    Status add_set(int slot, const OfferedEntries &entries);
+    Status delete_set(int slot, std::string_view name);
+
+    Status update_profile(int slot, const OfferedEntries &entries);
+    Status add_profile(int slot, const OfferedEntries &entries);
+    Status delete_profile(int slot, std::int32_t id);
+
+    Status set_network_environment(int slot, std::int32_t type);
+
+  private:
+    // Becomes the slot's state once it is durable.
+    Status commit(int slot, SlotSettings next);
+
+    std::vector<SlotSettings> slots_;
+    Keeper keeper_;
+};
+
+// What makes kept state impossible, or nothing.
+std::optional<std::string> find_contradiction(const SlotSettings &settings);
+
+} // namespace sim

@@ -1,0 +1,12 @@
+// SPDX-License-Identifier: Apache-2.0
+#pragma once
+
+#include "sim/settings_model.hpp"
+
+namespace sim {
+
+// Gives the model what this directory holds and keeps its changes there, one file a slot. What
+// went wrong, or nothing. A file that cannot be used is left as it is.
+std::optional<std::string> keep_settings(const std::string &directory, SettingsModel &model);
+
+} // namespace sim

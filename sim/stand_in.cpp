@@ -1,0 +1,69 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "sim/stand_in.hpp"
+
+#include "sim/call_signals.hpp"
+#include "sim/settings_store.hpp"
+
+#include <ctime>
+
+namespace sim {
+
+namespace {
+
+template <typename Interface>
+auto sink_of(Service &service) {
+    return [&service](int slot, const auto &event) {
+        const Signal signal = to_signal(event);
+        service.emit(slot, Interface::kName, signal.member, signal.body);
+    };
+}
+
+} // namespace
+
+StandIn::StandIn(const Options &options, const Log &log, MainLoop &loop)
+    : log_(log), plan_(options.numbers), timers_(options.speed, &MainLoop::now),
+      service_(bus_, log_, applications_, plan_.slots()),
+      registrations_(plan_.slots(), timers_, sink_of<RegistrationInterface>(service_)),
+      services_(plan_, registrations_),
+      calls_(plan_, timers_, registrations_, services_,
+             std::chrono::duration_cast<std::chrono::nanoseconds>(options.ring_time),
+             sink_of<CallInterface>(service_)),
+      ussd_(plan_, timers_, registrations_, sink_of<CallInterface>(service_)),
+      logins_(plan_.slots(), timers_, registrations_, sink_of<LoginInterface>(service_)),
+      centre_(plan_, timers_, registrations_, std::time(nullptr), sink_of<SmsInterface>(service_)),
+      settings_(plan_.slots()), registration_interface_(applications_, registrations_),
+      login_interface_(logins_), call_interface_(calls_, ussd_), sms_interface_(centre_),
+      ss_interface_(services_), settings_interface_(settings_) {
+    loop.drive(timers_);
+    service_.add(registration_interface_.describe());
+    service_.add(login_interface_.describe());
+    service_.add(call_interface_.describe());
+    service_.add(sms_interface_.describe());
+    service_.add(ss_interface_.describe());
+    service_.add(settings_interface_.describe());
+}
+
+std::optional<std::string> StandIn::restore(const std::string &state_directory) {
+    return state_directory.empty() ? std::nullopt : keep_settings(state_directory, settings_);
+}
+
+std::optional<std::string> StandIn::start(const std::string &address,
+                                          std::function<void(const std::string &why)> lost) {
+    if (auto error = bus_.connect(address))
+        return fmt::format("cannot reach the bus: {}", *error);
+    bus_.listen({.call = [this](GDBusMessage *call) { service_.handle(call); },
+                 .peer_gone =
+                     [this](const std::string &connection) {
+                         if (const auto gone = applications_.forget(connection))
+                             log_.trace(
+                                 "{} has left the bus with {} application(s); its calls stay",
+                                 connection, gone);
+                     },
+                 .lost = std::move(lost)});
+    if (auto error = bus_.own_name(std::string(Service::kName)))
+        return error;
+    registrations_.start();
+    return std::nullopt;
+}
+
+} // namespace sim

@@ -1,0 +1,61 @@
+// SPDX-License-Identifier: Apache-2.0
+#pragma once
+
+#include "sim/applications.hpp"
+#include "sim/bus.hpp"
+#include "sim/call_interface.hpp"
+#include "sim/call_model.hpp"
+#include "sim/clock.hpp"
+#include "sim/log.hpp"
+#include "sim/login_interface.hpp"
+#include "sim/main_loop.hpp"
+#include "sim/number_plan.hpp"
+#include "sim/options.hpp"
+#include "sim/registration_interface.hpp"
+#include "sim/service.hpp"
+#include "sim/settings_interface.hpp"
+#include "sim/sms_interface.hpp"
+#include "sim/ss_interface.hpp"
+#include "sim/ussd.hpp"
+
+#include <functional>
+#include <optional>
+#include <string>
+
+namespace sim {
+
+// The whole service: the network, its models and their interfaces on one bus.
+class StandIn {
+  public:
+    StandIn(const Options &options, const Log &log, MainLoop &loop);
+
+    // Before `start`. What went wrong, or nothing.
+    std::optional<std::string> restore(const std::string &state_directory);
+    // Takes the name once everything can answer. What went wrong, or nothing.
+    std::optional<std::string> start(const std::string &address,
+                                     std::function<void(const std::string &why)> lost);
+
+  private:
+    const Log &log_;
+    NumberPlan plan_;
+    Timers timers_;
+    Bus bus_;
+    Applications applications_;
+    Service service_;
+    // In flight mode a slot loses what these hold in this order.
+    Registrations registrations_;
+    SupplementaryServices services_;
+    CallModel calls_;
+    UssdService ussd_;
+    Logins logins_;
+    ServiceCentre centre_;
+    SettingsModel settings_;
+    RegistrationInterface registration_interface_;
+    LoginInterface login_interface_;
+    CallInterface call_interface_;
+    SmsInterface sms_interface_;
+    SsInterface ss_interface_;
+    SettingsInterface settings_interface_;
+};
+
+} // namespace sim

@@ -1,0 +1,50 @@
+// SPDX-License-Identifier: Apache-2.0
+#pragma once
+
+#include "sim/call_events.hpp"
+#include "sim/clock.hpp"
+#include "sim/number_plan.hpp"
+#include "sim/registrations.hpp"
+#include "sim/result.hpp"
+
+#include <functional>
+#include <string>
+#include <vector>
+
+namespace sim {
+
+// The network's side of USSD: a small tree of pages, one dialogue at a time in each slot.
+class UssdService {
+  public:
+    using Sink = std::function<void(int slot, const CallEvent &event)>;
+
+    UssdService(const NumberPlan &plan, Timers &timers, Registrations &registrations, Sink sink);
+
+    Status send(int slot, UssdRequest type, int coding_scheme, const std::string &text);
+
+  private:
+    enum class State { kIdle, kNetworkAnswers, kUserAnswers };
+    struct Dialogue {
+        State state = State::kIdle;
+        int number = 0;
+        int coding_scheme = 0;
+        std::string path;
+        Timer timer;
+    };
+
+    Status start(int slot, int coding_scheme, const std::string &code);
+    Status reply(int slot, int coding_scheme, const std::string &text);
+    void await_network(int slot);
+    void turn_page(int slot);
+    void indicate(int slot, UssdAnswer type, std::string text);
+    void release(int slot, std::string why);
+    Dialogue &dialogue(int slot) { return dialogues_[static_cast<std::size_t>(slot)]; }
+
+    const NumberPlan &plan_;
+    Timers &timers_;
+    const Registrations &registrations_;
+    Sink sink_;
+    std::vector<Dialogue> dialogues_;
+};
+
+} // namespace sim

@@ -1,0 +1,49 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "sim/wire.hpp"
+
+#include <algorithm>
+
+namespace sim::wire {
+
+namespace {
+
+bool is_base64_letter(char letter) {
+    return g_ascii_isalnum(letter) || letter == '+' || letter == '/';
+}
+
+} // namespace
+
+std::optional<std::string> decode_base64(const std::string &text) {
+    const auto padding = text.size() - std::min(text.size(), text.find_last_not_of('=') + 1);
+    const auto letters = std::string_view(text).substr(0, text.size() - padding);
+    if (text.size() % 4 != 0 || padding > 2 || !std::ranges::all_of(letters, is_base64_letter))
+        return std::nullopt;
+    gsize length = 0;
+    guchar *const bytes = g_base64_decode(text.c_str(), &length);
+    std::string decoded(reinterpret_cast<const char *>(bytes), length);
+    g_free(bytes);
+    return decoded;
+}
+
+std::string encode_base64(std::string_view bytes) {
+    return GText(g_base64_encode(reinterpret_cast<const guchar *>(bytes.data()), bytes.size()))
+        .get();
+}
+
+Variant refusal(std::string_view signature, std::size_t result_index, Result code) {
+    const std::string type_text(signature);
+    const auto *type = G_VARIANT_TYPE(type_text.c_str());
+    // No data at all stands for the default of every member.
+    const Variant empty(g_variant_new_from_data(type, nullptr, 0, FALSE, nullptr, nullptr));
+    std::vector<GVariant *> members;
+    for (gsize i = 0; i < g_variant_n_children(empty.get()); ++i)
+        members.push_back(i == result_index ? write(code)
+                                            : g_variant_get_child_value(empty.get(), i));
+    Variant tuple(g_variant_new_tuple(members.data(), members.size()));
+    for (std::size_t i = 0; i < members.size(); ++i)
+        if (i != result_index)
+            g_variant_unref(members[i]);
+    return tuple;
+}
+
+} // namespace sim::wire

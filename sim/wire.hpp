@@ -1,0 +1,122 @@
+// SPDX-License-Identifier: Apache-2.0
+#pragma once
+
+#include "sim/glib_ref.hpp"
+#include "sim/result.hpp"
+
+#include <concepts>
+#include <cstdint>
+#include <optional>
+#include <span>
+#include <string>
+#include <string_view>
+#include <tuple>
+#include <type_traits>
+#include <vector>
+
+// Between C++ values and the members of a D-Bus tuple. What comes in has had its signature
+// checked; what a variant holds has not.
+namespace sim::wire {
+
+// A variant that should hold an array of texts; nothing when it holds something else.
+using Texts = std::optional<std::vector<std::string>>;
+
+template <typename T>
+T read(GVariant *member) {
+    if constexpr (std::same_as<T, std::int32_t>)
+        return g_variant_get_int32(member);
+    else if constexpr (std::same_as<T, std::uint8_t>)
+        return g_variant_get_byte(member);
+    else if constexpr (std::same_as<T, bool>)
+        return g_variant_get_boolean(member) != FALSE;
+    else if constexpr (std::same_as<T, std::string>)
+        return g_variant_get_string(member, nullptr);
+    else {
+        static_assert(std::same_as<T, Texts>);
+        const auto content = Variant::adopt(g_variant_get_variant(member));
+        if (!g_variant_is_of_type(content.get(), G_VARIANT_TYPE_STRING_ARRAY))
+            return std::nullopt;
+        std::vector<std::string> texts;
+        for (gsize i = 0; i < g_variant_n_children(content.get()); ++i) {
+            const auto text = Variant::adopt(g_variant_get_child_value(content.get(), i));
+            texts.emplace_back(g_variant_get_string(text.get(), nullptr));
+        }
+        return texts;
+    }
+}
+
+// All members of a tuple, in order. The types must be those of the checked signature.
+template <typename... Ts>
+std::tuple<Ts...> unpack(GVariant *tuple) {
+    gsize index = 0;
+    const auto next = [&]<typename T>(std::type_identity<T>) {
+        return read<T>(Variant::adopt(g_variant_get_child_value(tuple, index++)).get());
+    };
+    return std::tuple<Ts...>{next(std::type_identity<Ts>{})...};
+}
+
+inline GVariant *write(std::int32_t value) {
+    return g_variant_new_int32(value);
+}
+inline GVariant *write(std::uint32_t value) {
+    return g_variant_new_uint32(value);
+}
+inline GVariant *write(std::uint8_t value) {
+    return g_variant_new_byte(value);
+}
+inline GVariant *write(bool value) {
+    return g_variant_new_boolean(value);
+}
+GVariant *write(const char *value) = delete; // would become a boolean
+inline GVariant *write(const std::string &value) {
+    return g_variant_new_string(value.c_str());
+}
+inline GVariant *write(const Variant &value) {
+    return value.get();
+}
+inline GVariant *write(std::span<const std::int32_t> values) {
+    return g_variant_new_variant(g_variant_new_fixed_array(G_VARIANT_TYPE_INT32, values.data(),
+                                                           values.size(), sizeof(std::int32_t)));
+}
+inline GVariant *write(std::span<const std::string> values) {
+    GVariantBuilder builder;
+    g_variant_builder_init(&builder, G_VARIANT_TYPE_STRING_ARRAY);
+    for (const auto &value : values)
+        g_variant_builder_add(&builder, "s", value.c_str());
+    return g_variant_new_variant(g_variant_builder_end(&builder));
+}
+template <typename T>
+requires std::is_enum_v<T> GVariant *write(T value) {
+    return g_variant_new_int32(static_cast<std::int32_t>(value));
+}
+
+template <typename... Ts>
+Variant pack(const Ts &...values) {
+    GVariant *const members[] = {write(values)...};
+    return Variant(g_variant_new_tuple(members, sizeof...(values)));
+}
+
+// An "aa{sv}" of one dictionary for each entry. `fill` is given the entry and a function that takes
+// a key and its value.
+template <typename T, typename Fill>
+Variant dictionaries(const std::vector<T> &entries, Fill fill) {
+    GVariantBuilder list;
+    g_variant_builder_init(&list, G_VARIANT_TYPE("aa{sv}"));
+    for (const auto &entry : entries) {
+        g_variant_builder_open(&list, G_VARIANT_TYPE_VARDICT);
+        fill(entry, [&](const char *key, const auto &value) {
+            g_variant_builder_add(&list, "{sv}", key, write(value));
+        });
+        g_variant_builder_close(&list);
+    }
+    return Variant(g_variant_builder_end(&list));
+}
+
+// Standard alphabet with padding, and nothing else.
+std::optional<std::string> decode_base64(const std::string &text);
+std::string encode_base64(std::string_view bytes);
+
+// A tuple of this type with empty members around its result.
+Variant refusal(std::string_view signature, std::size_t result_index, Result code);
+
+} // namespace sim::wire
