@@ -1,0 +1,64 @@
+// SPDX-License-Identifier: Apache-2.0
+// The arguments of one verb. What is returned holds its value once the command line is parsed.
+#pragma once
+
+#include "service_values.hpp"
+#include "session_choice.hpp"
+
+#include <CLI/CLI.hpp>
+#include <memory>
+#include <string>
+#include <vector>
+
+namespace imsctl {
+
+template <class Type>
+using Argument = std::shared_ptr<Type>;
+
+// Names are as CLI11 has them: "NUMBER" is a place, "--number" an option, "NUMBER,--number" both.
+class Arguments {
+  public:
+    explicit Arguments(CLI::App &verb) : verb_(verb) {}
+
+    // Required.
+    Argument<std::int32_t> number(const std::string &names, const std::string &help);
+    Argument<std::int32_t> choice(const std::string &names, const std::string &help,
+                                  NamedValues values);
+    Argument<std::string> text(const std::string &names, const std::string &help);
+    Argument<std::string> name(const std::string &names, const std::string &help,
+                               const std::vector<std::string> &known);
+    Argument<std::vector<std::string>> texts(const std::string &names, const std::string &help);
+
+    // May be left out.
+    Argument<std::int32_t> number(const std::string &names, const std::string &help,
+                                  std::int32_t fallback);
+    Argument<std::int32_t> number_from(std::int32_t least, std::int32_t most,
+                                       const std::string &names, const std::string &help,
+                                       std::int32_t fallback);
+    Argument<std::int32_t> choice(const std::string &names, const std::string &help,
+                                  NamedValues values, std::int32_t fallback);
+    Argument<std::string> text_or(const std::string &names, const std::string &help,
+                                  std::string fallback);
+    Argument<std::vector<std::string>> some_texts(const std::string &names,
+                                                  const std::string &help);
+    Argument<std::vector<std::string>> some_names(const std::string &names, const std::string &help,
+                                                  const std::vector<std::string> &known);
+    Argument<bool> flag(const std::string &names, const std::string &help);
+
+    Argument<double> seconds(const std::string &names, const std::string &help, double fallback);
+
+    SessionChoice session(const std::string &names, const Fitting &fitting);
+    SessionChoice session_place(const Fitting &fitting);
+    SessionChoice session_option(const Fitting &fitting);
+
+  private:
+    CLI::App &verb_;
+};
+
+// More than 0 and at most kLongestWait.
+Seconds seconds_or_refusal(const std::string &name, const std::string &text);
+
+// Throws what CLI11 throws for an argument of the wrong form.
+[[noreturn]] void refuse_argument(const std::string &name, const std::string &problem);
+
+} // namespace imsctl

@@ -1,0 +1,13 @@
+// SPDX-License-Identifier: Apache-2.0
+// The whole program but for main().
+#pragma once
+
+#include <cstdio>
+#include <span>
+
+namespace imsctl {
+
+// Returns the exit status: 0 done, 1 failed, 2 wrong usage.
+int run(std::span<const char *const> arguments, std::FILE *out, std::FILE *err);
+
+} // namespace imsctl

@@ -1,0 +1,244 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "settings_file.hpp"
+
+#include "failure.hpp"
+
+#include <algorithm>
+#include <cerrno>
+#include <cstdio>
+#include <cstring>
+#include <fcntl.h>
+#include <fmt/format.h>
+#include <fmt/ranges.h>
+#include <iterator>
+#include <memory>
+
+namespace imsctl {
+namespace {
+
+// Which line the last character that was read stands in.
+struct Progress {
+    void read(char character) {
+        line += line_is_over;
+        line_is_over = character == '\n';
+    }
+
+    std::size_t line = 1;
+    bool line_is_over = false;
+};
+
+// The parser reads through this, so that it is known how far it has come.
+class Reader {
+  public:
+    using iterator_category = std::input_iterator_tag;
+    using value_type = char;
+    using difference_type = std::ptrdiff_t;
+    using pointer = const char *;
+    using reference = const char &;
+
+    Reader(const char *at, Progress &progress) : at_(at), progress_(&progress) {}
+
+    reference operator*() const { return *at_; }
+    Reader &operator++() {
+        progress_->read(*at_++);
+        return *this;
+    }
+    bool operator==(const Reader &other) const { return at_ == other.at_; }
+    bool operator!=(const Reader &other) const { return at_ != other.at_; }
+
+  private:
+    const char *at_;
+    Progress *progress_;
+};
+
+struct Problem {
+    std::size_t line;
+    std::string text;
+};
+
+struct Entry {
+    std::size_t line;
+    std::string name;
+    Json value;
+};
+
+class Entries {
+  public:
+    explicit Entries(const std::string &document) {
+        const char *begin = document.data();
+        Json::sax_parse(Reader(begin, progress_), Reader(begin + document.size(), progress_), this);
+    }
+
+    const std::vector<Entry> &found() const { return found_; }
+    const std::vector<Problem> &problems() const { return problems_; }
+
+    // What the parser calls.
+    bool null() { return value(nullptr); }
+    bool boolean(bool flag) { return value(flag); }
+    bool number_integer(Json::number_integer_t number) { return value(number); }
+    bool number_unsigned(Json::number_unsigned_t number) { return value(number); }
+    bool number_float(Json::number_float_t number, const std::string &) { return value(number); }
+    bool string(std::string &text) { return value(text); }
+    bool binary(Json::binary_t &) { return false; } // not in JSON text
+    bool start_object(std::size_t) { return start(Json::object()); }
+    bool start_array(std::size_t) { return start(Json::array()); }
+    bool end_object() { return end(); }
+    bool end_array() { return end(); }
+
+    bool key(const std::string &name) {
+        if (depth_ == 1)
+            found_.push_back({line(), name, {}});
+        return true;
+    }
+
+    bool parse_error(std::size_t, const std::string &, const Json::exception &error) {
+        // The parser's own names for the error and the place stand in front.
+        std::string_view text = error.what();
+        for (const std::string_view end : {"] ", ": "})
+            if (const auto found = text.find(end); found != std::string_view::npos)
+                text.remove_prefix(found + end.size());
+        problems_.push_back({line(), escape(text)});
+        return false;
+    }
+
+  private:
+    bool value(Json value) {
+        if (depth_ == 1)
+            found_.back().value = std::move(value);
+        return depth_ > 0 || no_object();
+    }
+
+    // Of a value that has parts it only matters that it is none of those expected.
+    bool start(Json empty) {
+        if (depth_ == 0 && !empty.is_object())
+            return no_object();
+        if (depth_ == 1)
+            found_.back().value = std::move(empty);
+        ++depth_;
+        return true;
+    }
+
+    bool end() {
+        --depth_;
+        return true;
+    }
+
+    bool no_object() {
+        problems_.push_back({line(), "this is not a JSON object"});
+        return false;
+    }
+
+    std::size_t line() const { return progress_.line; }
+
+    Progress progress_;
+    std::size_t depth_ = 0;
+    std::vector<Entry> found_;
+    std::vector<Problem> problems_;
+};
+
+class Checker {
+  public:
+    explicit Checker(const Entries &entries) : problems_(entries.problems()) {
+        for (const Entry &entry : entries.found())
+            check(entry);
+    }
+
+    Assignments<SettingsRecord> assignments_or_failure(const std::string &name) const {
+        if (problems_.empty())
+            return assignments_;
+        std::vector<std::string> texts;
+        Numbers lines;
+        for (const Problem &problem : problems_) {
+            lines.push_back(static_cast<std::int32_t>(problem.line));
+            texts.push_back(
+                fmt::format("{}: line {}: {}", escape(name), problem.line, problem.text));
+        }
+        throw Failure(FailureKind::kInput, fmt::format("{}", fmt::join(texts, "\n")),
+                      "help: imsctl settings import --help", {{"file", name}, {"lines", lines}});
+    }
+
+  private:
+    void check(const Entry &entry) {
+        const auto *key = find_key<SettingsRecord>(entry.name);
+        if (key == nullptr)
+            return refuse(entry, unknown_key<SettingsRecord>(entry.name));
+        const auto is_same = [&](const Entry *each) { return each->name == entry.name; };
+        const auto earlier = std::find_if(seen_.begin(), seen_.end(), is_same);
+        if (earlier != seen_.end())
+            return refuse(
+                entry, fmt::format("{} already stands in line {}", entry.name, (*earlier)->line));
+        seen_.push_back(&entry);
+        // The service left the key out when the file was made.
+        if (entry.value.is_null())
+            return;
+        try {
+            assignments_.push_back({key, value_from_json(type_of(*key), entry.value)});
+        } catch (const WrongValue &wrong) {
+            refuse(entry, fmt::format("{}: {}", entry.name, wrong.what()));
+        }
+    }
+
+    void refuse(const Entry &entry, const std::string &text) {
+        problems_.push_back({entry.line, text});
+    }
+
+    std::vector<const Entry *> seen_;
+    std::vector<Problem> problems_;
+    Assignments<SettingsRecord> assignments_;
+};
+
+struct Close {
+    void operator()(std::FILE *file) const { std::fclose(file); }
+};
+using File = std::unique_ptr<std::FILE, Close>;
+
+Failure file_failure(FailureKind kind, const char *what, const std::string &name, int error) {
+    return {kind,
+            fmt::format("cannot {} {}: {}", what, quote(name), std::strerror(error)),
+            "",
+            {{"file", name}}};
+}
+
+std::string read_all(std::FILE *file, const std::string &name) {
+    std::string content;
+    char block[4096];
+    while (const std::size_t length = std::fread(block, 1, sizeof block, file))
+        content.append(block, length);
+    if (std::ferror(file))
+        throw file_failure(FailureKind::kInput, "read", name, errno);
+    return content;
+}
+
+} // namespace
+
+std::string read_file(const std::string &name) {
+    if (name == kStandardStream)
+        return read_all(stdin, "standard input");
+    const File file(std::fopen(name.c_str(), "re"));
+    if (!file)
+        throw file_failure(FailureKind::kInput, "read", name, errno);
+    return read_all(file.get(), name);
+}
+
+void write_file(const std::string &name, const std::string &content) {
+    const int descriptor =
+        open(name.c_str(), O_WRONLY | O_CREAT | O_TRUNC | O_CLOEXEC, S_IRUSR | S_IWUSR);
+    File file(descriptor < 0 ? nullptr : fdopen(descriptor, "w"));
+    const bool written =
+        file && std::fwrite(content.data(), 1, content.size(), file.get()) == content.size();
+    // Only closing brings the last block to the disk.
+    if (!written || std::fclose(file.release()) != 0)
+        throw file_failure(FailureKind::kOutput, "write", name, errno);
+}
+
+std::string settings_document(const SettingsRecord &settings) {
+    Json object = Json::object();
+    add_json(object, fields_of(settings));
+    return object.dump(2, ' ', false, Json::error_handler_t::replace);
+}
+
+Assignments<SettingsRecord> parse_settings(const std::string &document, const std::string &name) {
+    return Checker(Entries(document)).assignments_or_failure(name);
+}
+
+} // namespace imsctl

@@ -1,0 +1,25 @@
+// SPDX-License-Identifier: Apache-2.0
+// Settings sets in JSON files.
+#pragma once
+
+#include "settings_record.hpp"
+
+#include <string>
+
+namespace imsctl {
+
+// "-" stands for standard input and output.
+inline constexpr const char *kStandardStream = "-";
+
+// Throw an input or output failure. A file that write_file() makes is its owner's alone: it may
+// hold passwords.
+std::string read_file(const std::string &name);
+void write_file(const std::string &name, const std::string &content);
+
+// One key a line, in the record's order.
+std::string settings_document(const SettingsRecord &settings);
+
+// The keys that have a value. Throws an input failure that names every line that is wrong.
+Assignments<SettingsRecord> parse_settings(const std::string &document, const std::string &name);
+
+} // namespace imsctl

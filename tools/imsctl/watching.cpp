@@ -1,0 +1,65 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "watching.hpp"
+
+#include <fmt/format.h>
+#include <limits>
+
+namespace imsctl {
+namespace {
+
+// Long enough for any service that is alive, short enough for a user who waits for the first line.
+constexpr Seconds kSettleTime = 2;
+
+// For answers to requests that are on their way already.
+constexpr Seconds kLastMoment = 1;
+
+} // namespace
+
+WatchLimits watch_limits(Arguments &arguments) {
+    constexpr auto kMost = std::numeric_limits<std::int32_t>::max();
+    return {arguments.number_from(1, kMost, "--count", "end after so many events", 0),
+            arguments.seconds("--for", "end after so many seconds", 0)};
+}
+
+Watch::Watch(Invocation &run, const WatchLimits &limits, const std::vector<const EventRow *> &rows,
+             std::string_view what)
+    : run_(run), limits_(limits) {
+    for (const EventRow *row : rows)
+        run.client().watch(*row);
+    run.client().settle(kSettleTime);
+    run.output().note(fmt::format("{} slot {}", what, run.settings().slot));
+}
+
+void Watch::until_end(const std::function<bool(const Event &)> &show) {
+    std::int32_t left = *limits_.count;
+    const auto finished = [&] {
+        while (run_.client().has_event()) {
+            const bool counts = show(run_.client().take_event());
+            if (counts && *limits_.count > 0 && --left == 0)
+                return true;
+        }
+        return signals_.arrived();
+    };
+    const Seconds limit = *limits_.seconds;
+    run_until(limit > 0 ? std::optional(limit) : std::nullopt, finished);
+    check_bus();
+}
+
+void Watch::finish(const std::function<bool()> &done) {
+    const bool ending = signals_.arrived();
+    run_until(ending ? kLastMoment : run_.settings().timeout,
+              [&] { return done() || (!ending && signals_.arrived()); });
+    check_bus();
+}
+
+void Watch::check_bus() const {
+    if (signals_.own())
+        throw bus_break_failure();
+}
+
+void show_event(const Invocation &run, const Event &event) {
+    const Output &output = run.output();
+    output.line(output.json() ? dump(to_json(event, run.settings().slot)) : to_text(event));
+}
+
+} // namespace imsctl
