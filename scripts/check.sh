@@ -1,0 +1,28 @@
+#!/usr/bin/env bash
+# SPDX-License-Identifier: Apache-2.0
+# The checks beyond the tests: formatting, shell scripts; for the library a second compiler, static
+# analysis, and an installation that others can build against.
+set -euo pipefail
+cd "$(dirname "$0")/.."
+
+step() { printf '\n=== %s\n' "$*"; }
+
+scripts/dependencies.sh check
+
+step "Formatting"
+git ls-files '*.c' '*.h' '*.cpp' '*.hpp' | xargs clang-format --dry-run --Werror
+
+step "Shell scripts"
+git ls-files '*.sh' .ci/run | xargs shellcheck
+
+step "The library with the second compiler"
+cmake --preset debug -B build/clang -DIMS_BUILD_TOOLS=OFF \
+    -DCMAKE_C_COMPILER=clang -DCMAKE_CXX_COMPILER=clang++ >/dev/null
+cmake --build build/clang
+
+step "Static analysis of the library"
+git ls-files 'src/*.cpp' 'platform/*.cpp' |
+    xargs -P "$(nproc)" -n 4 clang-tidy --quiet -p build/clang
+
+step "Installation"
+scripts/check-install.sh
