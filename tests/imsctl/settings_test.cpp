@@ -1,0 +1,347 @@
+// SPDX-License-Identifier: Apache-2.0
+// Settings and profiles as far as no service is needed: keys, values, files and wrong usage.
+#include "command_line.hpp"
+#include "failure.hpp"
+#include "settings_file.hpp"
+#include "settings_record.hpp"
+
+#include <algorithm>
+#include <cstdlib>
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+namespace imsctl {
+namespace {
+
+using testing::ElementsAre;
+using testing::HasSubstr;
+
+template <class Record>
+std::ptrdiff_t count_of(KeyType type) {
+    const auto keys = keys_of<Record>();
+    return std::count_if(keys.begin(), keys.end(),
+                         [&](const Key<Record> &key) { return type_of(key) == type; });
+}
+
+TEST(SettingsKeys, AreThoseOfTheRecords) {
+    EXPECT_EQ(count_of<SettingsRecord>(KeyType::kNumber), 163);
+    EXPECT_EQ(count_of<SettingsRecord>(KeyType::kFlag), 13);
+    EXPECT_EQ(count_of<SettingsRecord>(KeyType::kText), 158);
+    EXPECT_EQ(count_of<ProfileRecord>(KeyType::kNumber), 27);
+    EXPECT_EQ(count_of<ProfileRecord>(KeyType::kFlag), 4);
+    EXPECT_EQ(count_of<ProfileRecord>(KeyType::kText), 20);
+}
+
+// Another value for each place, as far as the type allows.
+Value value_for(KeyType type, std::size_t place) {
+    switch (type) {
+    case KeyType::kNumber:
+        return static_cast<std::int64_t>(place) - 100;
+    case KeyType::kFlag:
+        return place % 2 == 0;
+    case KeyType::kText:
+        break;
+    }
+    return "text \"" + std::to_string(place) + "\"\n\u00e4";
+}
+
+template <class Record>
+RecordPtr<Record> filled_record() {
+    auto record = new_record<Record>();
+    for (std::size_t place = 0; const auto &key : keys_of<Record>())
+        store(*record, key, value_for(type_of(key), ++place));
+    return record;
+}
+
+template <class Record>
+void expect_every_key_of_its_own() {
+    const auto record = filled_record<Record>();
+    for (std::size_t place = 0; const auto &key : keys_of<Record>()) {
+        EXPECT_EQ(to_text(value_of(*record, key)), to_text(value_for(type_of(key), ++place)))
+            << key.name;
+        EXPECT_EQ(find_key<Record>(key.name), &key);
+    }
+}
+
+TEST(SettingsRecords, KeepEachValueByItself) {
+    expect_every_key_of_its_own<SettingsRecord>();
+    expect_every_key_of_its_own<ProfileRecord>();
+}
+
+TEST(SettingsRecords, HaveTheKeysUnderTheNamesOfTheMembers) {
+    const auto settings = filled_record<SettingsRecord>();
+    settings->ringing_timer = 4711;
+    settings->poc_invite_timeout.value = 12;
+    EXPECT_EQ(value_of(*settings, *find_key<SettingsRecord>("ringing_timer")),
+              Value(std::int64_t{4711}));
+    EXPECT_EQ(value_of(*settings, *find_key<SettingsRecord>("poc_invite_timeout")),
+              Value(std::int64_t{12}));
+    EXPECT_EQ(find_key<SettingsRecord>("rtp_timeout_b2bptt"), nullptr);
+    EXPECT_EQ(find_key<SettingsRecord>(""), nullptr);
+}
+
+TEST(SettingsRecords, TellATimerThatIsNoNumberFromOneThatDidNotCome) {
+    const auto settings = new_record<SettingsRecord>();
+    const auto *timer = find_key<SettingsRecord>("poc_ringing_timer");
+    EXPECT_EQ(value_of(*settings, *timer), Value());
+    settings->poc_ringing_timer.text = strdup("soon");
+    EXPECT_EQ(value_of(*settings, *timer), Value("soon"));
+}
+
+TEST(SettingsRecords, AreCompletedWhereTheServiceLeftSomethingOut) {
+    const auto settings = filled_record<SettingsRecord>();
+    EXPECT_TRUE(fill_gaps(*settings).empty());
+    std::free(settings->network);
+    settings->network = nullptr;
+    std::free(settings->poc_ringing_timer.text);
+    settings->poc_ringing_timer.text = strdup("soon");
+    EXPECT_THAT(fill_gaps(*settings), ElementsAre("network", "poc_ringing_timer"));
+    EXPECT_STREQ(settings->network, "");
+    EXPECT_EQ(settings->poc_ringing_timer.value, 0);
+}
+
+TEST(SettingsRecords, TellWhatIsDifferent) {
+    const auto first = filled_record<SettingsRecord>();
+    const auto second = filled_record<SettingsRecord>();
+    EXPECT_TRUE(differences(*first, *second).empty());
+    second->ringing_timer = 7;
+    store(*second, *find_key<SettingsRecord>("min_se"), std::string("90"));
+    const Changes changes = differences(*first, *second);
+    ASSERT_EQ(changes.size(), 2u);
+    EXPECT_EQ(changes[0].key, "ringing_timer");
+    EXPECT_EQ(changes[0].to, Value(std::int64_t{7}));
+    EXPECT_EQ(changes[1].key, "min_se");
+}
+
+TEST(SettingsValues, AreOfTheKeysType) {
+    EXPECT_EQ(value_from_text(KeyType::kNumber, "-5"), Value(std::int64_t{-5}));
+    EXPECT_EQ(value_from_text(KeyType::kFlag, "true"), Value(true));
+    EXPECT_EQ(value_from_text(KeyType::kText, "a=b"), Value("a=b"));
+    for (const char *text : {"", "2147483648", "1.5", "x"})
+        EXPECT_THROW(value_from_text(KeyType::kNumber, text), WrongValue) << text;
+    for (const char *text : {"", "1", "True", "yes"})
+        EXPECT_THROW(value_from_text(KeyType::kFlag, text), WrongValue) << text;
+    EXPECT_THROW(value_from_text(KeyType::kText, "\xff"), WrongValue);
+}
+
+TEST(SettingsValues, InJsonAreOfTheKeysTypeToo) {
+    EXPECT_EQ(value_from_json(KeyType::kNumber, -2147483648), Value(std::int64_t{INT32_MIN}));
+    EXPECT_EQ(value_from_json(KeyType::kNumber, 2147483647u), Value(std::int64_t{INT32_MAX}));
+    const struct {
+        KeyType type;
+        const char *json;
+    } wrong[] = {{KeyType::kNumber, "2147483648"},  {KeyType::kNumber, "-2147483649"},
+                 {KeyType::kNumber, "1.0"},         {KeyType::kNumber, "18446744073709551615"},
+                 {KeyType::kNumber, "\"1\""},       {KeyType::kNumber, "true"},
+                 {KeyType::kNumber, "[]"},          {KeyType::kFlag, "1"},
+                 {KeyType::kFlag, "\"true\""},      {KeyType::kText, "1"},
+                 {KeyType::kText, "\"a\\u0000b\""}, {KeyType::kText, "{}"}};
+    for (const auto &row : wrong)
+        EXPECT_THROW(value_from_json(row.type, Json::parse(row.json)), WrongValue) << row.json;
+}
+
+TEST(SettingsValues, AreHiddenWhenTheyAreSecrets) {
+    const Fields fields = {
+        {"http_password_mcptt", "secret"}, {"password", ""}, {"authname", "alice"}};
+    EXPECT_EQ(Shown(false).fields(fields),
+              "http_password_mcptt=********\npassword=\"\"\nauthname=\"alice\"");
+    EXPECT_THAT(Shown(true).fields(fields), HasSubstr("http_password_mcptt=\"secret\"\n"));
+    const Changes changes = {{"password", "old", "new"}};
+    EXPECT_EQ(Shown(false).changes(changes, "->"), "password: ******** -> ********");
+    EXPECT_EQ(Shown(true).changes(changes, "->"), "password: \"old\" -> \"new\"");
+}
+
+TEST(SettingsFile, HasOneKeyALineInTheOrderOfTheRecord) {
+    const auto settings = filled_record<SettingsRecord>();
+    const std::string document = settings_document(*settings);
+    EXPECT_EQ(std::count(document.begin(), document.end(), '\n'), 335);
+    std::vector<std::string> names;
+    const Json parsed = Json::parse(document);
+    for (const auto &[name, value] : parsed.items())
+        names.push_back(name);
+    EXPECT_EQ(names, key_names<SettingsRecord>());
+}
+
+TEST(SettingsFile, GivesBackEveryValue) {
+    const auto settings = filled_record<SettingsRecord>();
+    const auto read = new_record<SettingsRecord>();
+    const auto assignments = parse_settings(settings_document(*settings), "file");
+    EXPECT_EQ(assignments.size(), 334u);
+    assign_all(*read, assignments);
+    EXPECT_TRUE(differences(*settings, *read).empty());
+}
+
+TEST(SettingsFile, LeavesOutWhatHasNoValue) {
+    EXPECT_TRUE(parse_settings(R"({"network": null})", "file").empty());
+    EXPECT_TRUE(parse_settings("{}", "file").empty());
+}
+
+struct FileRow {
+    const char *document;
+    const char *message;
+};
+
+void PrintTo(const FileRow &row, std::ostream *out) {
+    *out << row.document;
+}
+
+const FileRow kWrongFiles[] = {
+    {"", "f: line 1: syntax error"},
+    {"[]", "f: line 1: this is not a JSON object"},
+    {"7", "f: line 1: this is not a JSON object"},
+    {"{\n\"id\": 1,\n}", "f: line 3: syntax error"},
+    {"{\n\"id\": 1,\n\"name\n", "f: line 3: syntax error"},
+    {"{\n\"id\": 1\n", "f: line 2: syntax error"},
+    {"{\n\"id\": 1\n}\n{", "f: line 4: syntax error"},
+    {"{\n\"id\": 1e999\n}", "f: line 2: number overflow"},
+    {"{\n\"name\": \"\xff\"\n}", "f: line 2: syntax error"},
+    {"{\n\n\"ringing_timr\": 1}",
+     "f: line 3: there is no key \"ringing_timr\"; did you mean \"ringing_timer\"?"},
+    {"{\n\"id\": 1,\n\"ringing_timer\": \"1\"\n}",
+     "f: line 3: ringing_timer: \\\"1\\\" is not a whole number of 32 bits"},
+    {"{\"id\": 4294967296}", "f: line 1: id: 4294967296 is not a whole number of 32 bits"},
+    {"{\n\"is_rcs_enabled\": 1}", "f: line 2: is_rcs_enabled: 1 is neither true nor false"},
+    {"{\n\"http_password\": 1234}",
+     "f: line 2: http_password: this is not a text but of type number"},
+    {"{\n\"name\":\n{\"id\": [1,\n2]},\n\"min_se\": 1}",
+     "f: line 2: name: this is not a text but of type object\nf: line 5: min_se: "},
+    {"{\n\"id\": 1,\n\"name\": \"a\",\n\"id\": 2}", "f: line 4: id already stands in line 2"},
+};
+
+class WrongFiles : public ::testing::TestWithParam<FileRow> {};
+
+TEST_P(WrongFiles, AreRefusedWithTheLine) {
+    try {
+        parse_settings(GetParam().document, "f");
+        FAIL() << "taken";
+    } catch (const Failure &failure) {
+        EXPECT_EQ(failure.kind, FailureKind::kInput);
+        EXPECT_EQ(failure.exit_status(), 1);
+        EXPECT_THAT(failure.what(), HasSubstr(GetParam().message));
+    }
+}
+
+INSTANTIATE_TEST_SUITE_P(All, WrongFiles, ::testing::ValuesIn(kWrongFiles));
+
+TEST(SettingsFile, NamesAllLinesThatAreWrong) {
+    try {
+        parse_settings("{\n\"a\": 1,\n\"id\": 1,\n\"b\": 1\n}", "f");
+        FAIL() << "taken";
+    } catch (const Failure &failure) {
+        EXPECT_EQ(failure.to_json()["lines"], Json({2, 4}));
+        EXPECT_EQ(failure.to_json()["file"], "f");
+    }
+}
+
+struct Outcome {
+    int status;
+    std::string output;
+    std::string error;
+};
+
+std::string take(char *data, std::size_t size) {
+    std::string text(data, size);
+    std::free(data);
+    return text;
+}
+
+Outcome run_words(const std::vector<const char *> &words) {
+    char *out_data = nullptr;
+    char *err_data = nullptr;
+    std::size_t out_size = 0;
+    std::size_t err_size = 0;
+    std::FILE *out = open_memstream(&out_data, &out_size);
+    std::FILE *err = open_memstream(&err_data, &err_size);
+    const int status = run(words, out, err);
+    std::fclose(out);
+    std::fclose(err);
+    return {status, take(out_data, out_size), take(err_data, err_size)};
+}
+
+struct UsageRow {
+    std::vector<const char *> words;
+    const char *message;
+};
+
+void PrintTo(const UsageRow &row, std::ostream *out) {
+    for (const char *word : row.words)
+        *out << word << ' ';
+}
+
+const UsageRow kMistakes[] = {
+    {{"settings"}, "a verb is missing: list-keys, get, set, add, delete, export, import, diff"},
+    {{"profile"}, "a verb is missing: list, list-keys, show, set, add, delete"},
+    {{"network-environment"}, "a verb is missing: get, set"},
+    {{"settings", "get"}, "NAME is required"},
+    {{"settings", "get", "a", "ringing_timr"},
+     "there is none called \"ringing_timr\"; did you mean \"ringing_timer\""},
+    {{"settings", "set", "a"}, "CHANGE is required"},
+    {{"settings", "set", "a", "ringing_timer"}, "\"ringing_timer\" is not KEY=VALUE"},
+    {{"settings", "set", "a", "ringing_timr=1"},
+     "there is no key \"ringing_timr\"; did you mean \"ringing_timer\""},
+    {{"settings", "set", "a", "ringing_timer=x"},
+     "ringing_timer: \"x\" is not a whole number of 32 bits"},
+    {{"settings", "set", "a", "is_rcs_enabled=1"}, "is_rcs_enabled: \"1\" is neither true nor"},
+    {{"settings", "set", "a", "id=1", "id=1"}, "id is given twice"},
+    {{"settings", "set", "a", "name=b"}, "name cannot be set: it says which set is meant"},
+    {{"settings", "set", "a", "audio_port_end=1"}, "audio_port_end cannot be set: the service"},
+    {{"settings", "set", "a", "is_enable_srtp=1"}, "is_enable_srtp cannot be set: the service"},
+    {{"settings", "add", "a", "is_enable_srtp=1"}, "is_enable_srtp cannot be set: the service"},
+    {{"settings", "diff", "a"}, "SECOND is required"},
+    {{"settings", "export", "a"}, "FILE is required"},
+    {{"settings", "import"}, "FILE is required"},
+    {{"profile", "show"}, "PROFILE is required"},
+    {{"profile", "show", "1", "prot"}, "did you mean \"port\""},
+    {{"profile", "set", "1", "id=2"}, "id cannot be set: it says which profile is meant"},
+    {{"profile", "set", "1", "port=99999999999"}, "is not a whole number of 32 bits"},
+    {{"profile", "add", "a", "name=b"}, "name cannot be set: it is given as NAME"},
+    {{"network-environment", "set", "x"}, "TYPE: \"x\" is not a whole number of 32 bits"},
+};
+
+class SettingsMistakes : public ::testing::TestWithParam<UsageRow> {};
+
+TEST_P(SettingsMistakes, ExitWithTwoAndSayWhatToType) {
+    const Outcome outcome = run_words(GetParam().words);
+    EXPECT_EQ(outcome.status, 2);
+    EXPECT_EQ(outcome.output, "");
+    EXPECT_THAT(outcome.error, HasSubstr(GetParam().message));
+    EXPECT_THAT(outcome.error,
+                testing::AnyOf(HasSubstr("\nhelp: imsctl "), HasSubstr("\ntry: imsctl ")));
+}
+
+INSTANTIATE_TEST_SUITE_P(All, SettingsMistakes, ::testing::ValuesIn(kMistakes));
+
+TEST(SettingsVerbs, NameTheLinesOfAFileThatIsNotThere) {
+    const Outcome outcome = run_words({"settings", "import", "/nonexistent/a.json", "--json"});
+    EXPECT_EQ(outcome.status, 1);
+    EXPECT_EQ(Json::parse(outcome.output)["error"]["kind"], "input");
+    EXPECT_THAT(outcome.error, HasSubstr("cannot read \"/nonexistent/a.json\": No such file"));
+}
+
+TEST(SettingsVerbs, ListKeysWithoutAService) {
+    const Outcome text = run_words({"settings", "list-keys"});
+    EXPECT_EQ(text.status, 0);
+    EXPECT_THAT(text.output, HasSubstr("\naudio_port_start number\naudio_port_end number "
+                                       "read-only\n"));
+    EXPECT_THAT(text.output, HasSubstr("\nconference_factory_uri text\n"));
+    const Outcome json = run_words({"settings", "list-keys", "--json"});
+    const Json keys = Json::parse(json.output)["keys"];
+    EXPECT_EQ(keys.size(), 334u);
+    EXPECT_EQ(keys[3], Json({{"key", "is_rcs_enabled"}, {"type", "boolean"}, {"writable", true}}));
+    EXPECT_EQ(Json::parse(run_words({"profile", "list-keys", "--json"}).output)["keys"].size(),
+              51u);
+}
+
+TEST(SettingsCompletion, OffersKeys) {
+    EXPECT_EQ(run_words({"__complete", "settings", "get", "default", "poc_r"}).output,
+              "poc_ringing_timer\n");
+    EXPECT_EQ(run_words({"__complete", "settings", "set", "default", "poc_r"}).output,
+              "poc_ringing_timer=\n");
+    EXPECT_EQ(run_words({"__complete", "profile", "show", "1", "mtu"}).output, "mtuSize\n");
+    EXPECT_EQ(run_words({"__complete", "settings", "set", "default", "audio_port_e"}).output,
+              "audio_port_end_B2BPTT=\naudio_port_end_MCPTT=\n");
+    EXPECT_EQ(run_words({"__complete", "settings", "get", "i"}).output, "");
+}
+
+} // namespace
+} // namespace imsctl

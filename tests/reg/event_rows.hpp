@@ -1,0 +1,14 @@
+// SPDX-License-Identifier: Apache-2.0
+// The registration notifications: what the service sends and what the application gets.
+#pragma once
+
+#include "event_row.hpp"
+
+namespace test {
+
+inline constexpr EventModule kRegEvents{"ims_reg.cpp", "org.kelvo.ims.Registration",
+                                        "on_reg_signal_emit_handler"};
+
+std::span<const EventRow> reg_event_rows();
+
+} // namespace test

@@ -1,0 +1,154 @@
+// SPDX-License-Identifier: Apache-2.0
+// Every method that only registered applications may call, one row each: what it takes, what it
+// answers and where it learns who asks.
+#include "bus_client.hpp"
+
+#include "sim/result.hpp"
+
+#include <ostream>
+
+namespace sim::test {
+namespace {
+
+using testing::HasSubstr;
+
+enum Application { kNotNamed, kFirst, kLast };
+
+struct Row {
+    const char *interface;
+    const char *method;
+    const char *in;
+    const char *out;
+    Application application;
+    gsize result_at = 0;
+};
+
+std::ostream &operator<<(std::ostream &out, const Row &row) {
+    return out << row.method;
+}
+
+constexpr Row kRows[] = {
+    {kCall, "MakeCall", "(isissss)", "(ii)", kFirst},
+    {kCall, "SendUssd", "(iiis)", "(i)", kFirst},
+    {kCall, "AnswerCall", "(iiii)", "(i)", kFirst},
+    {kCall, "EndCall", "(iiii)", "(i)", kFirst},
+    {kCall, "RejectCall", "(iii)", "(i)", kFirst},
+    {kCall, "HoldCall", "(ii)", "(i)", kFirst},
+    {kCall, "ResumeCall", "(ii)", "(i)", kFirst},
+    {kCall, "SwapCall", "(i)", "(i)", kFirst},
+    {kCall, "UpgradeCall", "(iii)", "(i)", kFirst},
+    {kCall, "DowngradeCall", "(iii)", "(i)", kFirst},
+    {kCall, "ChangeCall", "(iii)", "(iis)", kFirst},
+    {kCall, "AcceptChangeRequest", "(ii)", "(i)", kFirst},
+    {kCall, "RejectChangeRequest", "(ii)", "(i)", kFirst},
+    {kCall, "SendDtmf", "(iis)", "(i)", kFirst},
+    {kCall, "StartDtmf", "(iiy)", "(i)", kFirst},
+    {kCall, "StopDtmf", "(ii)", "(i)", kFirst},
+    {kCall, "VoiceRecord", "(iiis)", "(i)", kFirst},
+    {kCall, "SendTtyData", "(iis)", "(i)", kFirst},
+    {kCall, "SetTtyMode", "(ii)", "(i)", kFirst},
+    {kCall, "GetTtyMode", "()", "(iiis)", kNotNamed},
+    {kCall, "IsMuted", "(ii)", "(ib)", kFirst},
+    {kCall, "ToggleMute", "(ii)", "(i)", kFirst},
+    {kCall, "SetSpeakerMode", "(iii)", "(i)", kFirst},
+    {kCall, "SetVolume", "(iii)", "(i)", kFirst},
+    {kCall, "GetMaxVolume", "(ii)", "(ii)", kFirst},
+    {kCall, "AddUserForConferenceCall", "(iisi)", "(i)", kFirst},
+    {kCall, "IndicateSrvccHoStarted", "(ii)", "(i)", kFirst},
+    {kCall, "IndicateSrvccHoFailed", "(ii)", "(i)", kFirst},
+    {kCall, "SetAutoResponse", "(iii)", "(i)", kFirst},
+    {kCall, "SetEmergencyPdnInfo", "(isivs)", "(i)", kFirst},
+    {kCall, "RegisterEmergencyPdn", "()", "(i)", kNotNamed},
+    {kCall, "DeregisterEmergencyPdn", "()", "(i)", kNotNamed},
+    {kCall, "StartNwayConferenceCall", "(iiii)", "(ii)", kFirst},
+    {kCall, "MergeCalls", "(i)", "(ii)", kFirst},
+    {kCall, "AddParticipantToNwayConferenceCall", "(iii)", "(i)", kFirst},
+    {kCall, "RemoveParticipantFromNwayConferenceCall", "(iii)", "(i)", kFirst},
+    {kCall, "IsInEpdgCall", "(i)", "(ib)", kFirst},
+    {kCall, "UpdateSsacInfo", "(iiiiii)", "(i)", kFirst},
+    {kCall, "ChangeEpdgAudioPath", "(ii)", "(i)", kFirst},
+    {kCall, "StartConference", "(iiv)", "(ii)", kNotNamed},
+    {kCall, "ModifyParticipantsInConference", "(iiiv)", "(ii)", kNotNamed},
+    {kCall, "CallListInfo", "(i)", "(iuaa{sv})", kFirst},
+    {kRegistration, "GetRegistrationInfo", "()", "(buuiiii)", kNotNamed, 6},
+    {kRegistration, "EnableFlightMode", "()", "(i)", kNotNamed},
+    {kLogin, "Login", "(ssii)", "(i)", kLast},
+    {kLogin, "Logout", "(i)", "(i)", kFirst},
+    {kLogin, "GetLoginState", "(ii)", "(iiui)", kLast},
+    {kSms, "SendSms", "(isisi)", "(iiii)", kFirst},
+    {kSms, "SendDeliverReport", "(iisii)", "(iiii)", kFirst},
+    {kSs, "SetCallWaiting", "(iii)", "(i)", kFirst},
+    {kSs, "GetCallWaiting", "(ii)", "(iuaa{sv})", kFirst},
+    {kSs, "SetCallForwarding", "(iiiiiiis)", "(i)", kFirst},
+    {kSs, "GetCallForwarding", "(iii)", "(iuaa{sv})", kFirst},
+    {kSs, "SetCallBarring", "(iiiis)", "(i)", kFirst},
+    {kSs, "GetCallBarring", "(iii)", "(iuaa{sv})", kFirst},
+};
+
+// Zeros, empty texts and empty variants, with this application in its place.
+Variant empty_arguments(const Row &row, int application) {
+    std::vector<GVariant *> members;
+    for (const char *letter = row.in + 1; *letter != ')'; ++letter) {
+        const bool names = (row.application == kFirst && members.empty()) ||
+                           (row.application == kLast && letter[1] == ')');
+        if (*letter == 'i')
+            members.push_back(g_variant_new_int32(names ? application : 0));
+        else if (*letter == 's')
+            members.push_back(g_variant_new_string(""));
+        else if (*letter == 'y')
+            members.push_back(g_variant_new_byte(0));
+        else
+            members.push_back(g_variant_new_variant(g_variant_new_strv(nullptr, 0)));
+    }
+    return Variant(g_variant_new_tuple(members.data(), members.size()));
+}
+
+gint32 result_of(const Reply &reply, const Row &row) {
+    gint32 result = -1;
+    g_variant_get_child(reply.value.get(), row.result_at, "i", &result);
+    return result;
+}
+
+class BusMethods : public Served, public testing::WithParamInterface<Row> {
+  protected:
+    Reply ask(Variant arguments) {
+        return client_->call(slot_path(0), GetParam().interface, GetParam().method,
+                             std::move(arguments));
+    }
+};
+
+TEST_P(BusMethods, IsRefusedToAnApplicationThatIsNotRegistered) {
+    const auto reply = ask(empty_arguments(GetParam(), 9));
+    ASSERT_EQ(reply.type, GetParam().out) << reply.error << ": " << reply.text;
+    EXPECT_EQ(result_of(reply, GetParam()), static_cast<gint32>(Result::kUnknownApplication));
+    EXPECT_THAT(program_->read_errors("refused"), HasSubstr("call RegisterApplication first"));
+}
+
+TEST_P(BusMethods, AnswersInItsTypeOnceRegistered) {
+    const int application = client_->register_application(0);
+    const auto reply = ask(empty_arguments(GetParam(), application));
+    ASSERT_EQ(reply.type, GetParam().out) << reply.error << ": " << reply.text;
+    EXPECT_NE(result_of(reply, GetParam()), static_cast<gint32>(Result::kUnknownApplication));
+}
+
+TEST_P(BusMethods, TakesNoOtherSignature) {
+    client_->register_application(0);
+    const Row &row = GetParam();
+    const Variant arguments = empty_arguments(row, 1);
+    std::vector<GVariant *> members;
+    std::vector<Variant> owners;
+    for (gsize i = 0; i < g_variant_n_children(arguments.get()); ++i) {
+        owners.push_back(Variant::adopt(g_variant_get_child_value(arguments.get(), i)));
+        members.push_back(owners.back().get());
+    }
+    members.push_back(g_variant_new_string("too much"));
+    const auto reply = ask(Variant(g_variant_new_tuple(members.data(), members.size())));
+    EXPECT_EQ(reply.error, "org.freedesktop.DBus.Error.InvalidArgs");
+    EXPECT_THAT(reply.text, HasSubstr(fmt::format("{} takes \"{}\"", row.method, row.in)));
+}
+
+INSTANTIATE_TEST_SUITE_P(All, BusMethods, testing::ValuesIn(kRows),
+                         [](const auto &test) { return std::string(test.param.method); });
+
+} // namespace
+} // namespace sim::test

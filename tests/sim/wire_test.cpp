@@ -1,0 +1,91 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "sim/wire.hpp"
+
+#include "sim/call_signals.hpp"
+
+#include <algorithm>
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+#include <set>
+
+namespace sim {
+namespace {
+
+TEST(Wire, PacksAndUnpacksMembersInOrder) {
+    const auto tuple = wire::pack(std::int32_t{-3}, std::string("text"), true, std::uint8_t{7},
+                                  std::uint32_t{9}, CallType::kVideo);
+    EXPECT_EQ(tuple.print(), "(-3, 'text', true, 0x07, 9, 1)");
+    const auto [number, text, flag, byte] =
+        wire::unpack<std::int32_t, std::string, bool, std::uint8_t>(tuple.get());
+    EXPECT_EQ(number, -3);
+    EXPECT_EQ(text, "text");
+    EXPECT_TRUE(flag);
+    EXPECT_EQ(byte, 7);
+}
+
+TEST(Wire, AVariantOfTextsMayHoldSomethingElse) {
+    const auto texts = wire::pack(std::vector<std::string>{"a", "b"});
+    EXPECT_EQ(std::get<0>(wire::unpack<wire::Texts>(texts.get())),
+              (std::vector<std::string>{"a", "b"}));
+    const auto numbers = wire::pack(std::vector<std::int32_t>{1, 2});
+    EXPECT_EQ(std::get<0>(wire::unpack<wire::Texts>(numbers.get())), std::nullopt);
+}
+
+TEST(Wire, Base64IsStrict) {
+    EXPECT_EQ(wire::decode_base64("aGVsbG8="), "hello");
+    EXPECT_EQ(wire::decode_base64("aGk="), "hi");
+    EXPECT_EQ(wire::decode_base64("YQ=="), "a");
+    EXPECT_EQ(wire::decode_base64(""), "");
+    for (const auto *bad : {"aGVsbG8", "a", "====", "YQ=a", "Y===", "aGV sbG8=", "aGVs\n", "YQ-_"})
+        EXPECT_EQ(wire::decode_base64(bad), std::nullopt) << bad;
+    const std::string bytes("\0\xff\x80zero", 7);
+    EXPECT_EQ(wire::decode_base64(wire::encode_base64(bytes)), bytes);
+}
+
+TEST(Wire, ARefusalHasTheTypeOfTheReplyAndNothingButTheResult) {
+    EXPECT_EQ(wire::refusal("(i)", 0, Result::kWrongState).print(), "(13,)");
+    EXPECT_EQ(wire::refusal("(iis)", 0, Result::kWrongState).print(), "(13, 0, '')");
+    const auto list = wire::refusal("(iuaa{sv})", 0, Result::kUnknownApplication);
+    EXPECT_STREQ(g_variant_get_type_string(list.get()), "(iuaa{sv})");
+    EXPECT_EQ(list.print(), "(11, 0, [])");
+    EXPECT_EQ(wire::refusal("(bui)", 2, Result::kFailed).print(), "(false, 0, 17)");
+}
+
+// One event of each kind: the table that objects describe themselves with must tell the truth.
+TEST(CallSignals, HaveTheTypesThatTheTableNames) {
+    const CallEvent events[] = {
+        CallIncomingInd{},     CallInProgress{},     CallAlerting{},       CallBusy{},
+        CallEstablished{},     CallHeld{},           CallResumed{},        CallForwarded{},
+        CallEnded{},           CallSwitched{},       CallChangeRequest{},  CallConfNotifyReceived{},
+        CallEarlyMediaStart{}, CallStopAlertTone{},  CallError{},          ConferenceEstablished{},
+        ParticipantAdded{},    ParticipantRemoved{}, CallUssdIndication{}, CallDtmfEvent{},
+    };
+    std::set<std::string_view> members;
+    for (const auto &event : events) {
+        const auto signal = to_signal(event);
+        const auto row = std::ranges::find(call_signals(), signal.member, &SignalInfo::member);
+        ASSERT_NE(row, call_signals().end()) << signal.member;
+        EXPECT_EQ(g_variant_get_type_string(signal.body.get()), row->signature) << signal.member;
+        EXPECT_TRUE(members.insert(signal.member).second) << signal.member;
+    }
+    EXPECT_EQ(members.size(), std::variant_size_v<CallEvent>);
+    EXPECT_EQ(members.size(), call_signals().size());
+}
+
+TEST(CallSignals, CarryTheirMembersInOrder) {
+    EXPECT_EQ(to_signal(CallIncomingInd{
+                            3, "tel:+1", CallType::kVideo, "tel:+2", {"a", "b", "c", "d"}, true})
+                  .body.print(),
+              "(3, 'tel:+1', 1, 'tel:+2', 'a', 'b', 'c', 'd', true)");
+    EXPECT_EQ(to_signal(CallResumed{3, true, false, CallType::kVideo}).body.print(),
+              "(3, true, false, 1)");
+    EXPECT_EQ(to_signal(CallConfNotifyReceived{3, {1, 3}, {"a", "b"}}).body.print(),
+              "(3, <[1, 3]>, 2, <['a', 'b']>, 2)");
+    EXPECT_EQ(
+        to_signal(CallUssdIndication{UssdAnswer::kReplyExpected, 15, 2, "hello"}).body.print(),
+        "(2, 15, 2, 'aGVsbG8=')");
+    EXPECT_EQ(to_signal(CallEnded{3, EndReason::kBusy}).body.print(), "(3, 2)");
+}
+
+} // namespace
+} // namespace sim
