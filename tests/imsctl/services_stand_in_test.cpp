@@ -21,7 +21,8 @@ std::string repeated(std::string_view piece, int count) {
 
 class Services : public ::testing::Test {
   protected:
-    Services() { service_.wait_for_error("is ready"); }
+    // Both slots have registered: no such event of theirs is under way any more.
+    Services() { service_.wait_for_error("sub1 signal RegistrationStatus (true"); }
 
     // The stand-in's clock runs fast: nothing here takes long.
     static Outcome run(const std::string &line) { return run_imsctl(split(line)); }
@@ -186,7 +187,7 @@ TEST_F(Services, ForwardCalls) {
     expect_ok("--slot 1 ss forwarding set unconditional on --to +15550150");
     EXPECT_EQ(run("--slot 1 ss forwarding get unconditional --class voice").output,
               "CLASS  STATUS  CONDITION      SECONDS  TARGET\n"
-              "voice  on      unconditional  20       +15550150\n");
+              "voice  on      unconditional  0        +15550150\n");
     EXPECT_EQ(run("--slot 1 ss forwarding get --json").json()["entries"].size(), 8u);
     const Outcome call = run("call dial +15550101 --wait");
     EXPECT_EQ(call.status, 0) << call.error;

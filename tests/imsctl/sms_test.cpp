@@ -126,7 +126,7 @@ TEST_F(Sms, SendsEachPartWithAnAddressOfItsOwn) {
     for (std::size_t i = 0; i < calls.size(); ++i) {
         const Sent sent = read_sent(calls[i]);
         // Eleven digits: the count of octets in front, and always the same.
-        EXPECT_EQ(sent.service_centre, "0791515505990000F0");
+        EXPECT_EQ(sent.service_centre, "07915155909900F0");
         EXPECT_EQ(sent.option, i < 2 ? 1 : 0);
         EXPECT_TRUE(sent.submit.status_report_request);
         const auto part = tpdu::find_concatenation(*sent.submit.user_data.header);
@@ -154,8 +154,9 @@ TEST_F(Sms, SendsDataClassValidityAndOption) {
 }
 
 TEST_F(Sms, StopsAtThePartThatIsRefused) {
-    peer_.on(kSendSms, [sent = 0](const Call &) mutable {
-        return ++sent == 2 ? reply("(iiii)", "(77, 0, 0, 0)") : reply("(iiii)", "(0, 0, 0, 0)");
+    constexpr std::size_t kSecondPart = 2; // call 0 registers the application
+    peer_.on(kSendSms, [](const Call &call) {
+        return reply("(iiii)", call.number == kSecondPart ? "(77, 0, 0, 0)" : "(0, 0, 0, 0)");
     });
     const std::string text(400, 'a');
     const Outcome outcome =
