@@ -1,17 +1,14 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "dictionary.hpp"
 
+#include "field_at.hpp"
+
 #include <bitset>
 #include <charconv>
 #include <cstring>
 
 namespace ims {
 namespace {
-
-template <typename T>
-T &at(void *record, std::size_t offset) noexcept {
-    return *reinterpret_cast<T *>(static_cast<std::byte *>(record) + offset);
-}
 
 std::int32_t number_in(std::string_view text) noexcept {
     std::int32_t number = 0;
@@ -48,11 +45,6 @@ bool read_field(GVariant *value, const FieldRow &row, void *record) noexcept {
         return true;
     }
     return false;
-}
-
-template <typename T>
-const T &at(const void *record, std::size_t offset) noexcept {
-    return *reinterpret_cast<const T *>(static_cast<const std::byte *>(record) + offset);
 }
 
 // A floating value, or NULL for a text that cannot cross the bus.
