@@ -46,6 +46,7 @@ enum class RowKind : std::uint8_t {
     kFlag,       // "b", one byte
     kNumber,     // "x", an int32_t: widened when sent, cut to 32 bits when read
     kText,       // "s", left out when NULL; a copy when read
+    kBytes,      // "s", base64 text that is read into bytes and their count
     kInlineText, // "s", a buffer in the record
     kPart,       // "a{sv}", a record in this one, or some of this one's own fields
     kPointer,    // "a{sv}", a pointer to a record; empty when NULL
@@ -71,7 +72,7 @@ struct TreeRow {
     Keys keys;
     RowKind kind;
     std::size_t offset;
-    std::size_t extent = 0; // a buffer's size; the offset of an array's count or of a selector
+    std::size_t extent = 0; // a buffer's size; the offset of a count or of a selector
     Tree tree{};
     const TreeChoice *choices = nullptr;
     std::size_t choice_count = 0;
@@ -147,6 +148,13 @@ consteval RowOf<Record> value(Keys keys, Place<Record, Member> place) {
     }
 }
 
+// Bytes that come as base64 text; they are never sent.
+template <typename Record>
+consteval RowOf<Record> bytes(const char *key, Place<Record, const std::uint8_t *> place,
+                              Place<Record, std::uint32_t> count) {
+    return {{only_read(key), RowKind::kBytes, place.offset, count.offset}};
+}
+
 // A value that is alone in its dictionary and may be read under any key.
 template <typename Record, typename Member>
 consteval RowOf<Record> value_by_any_key(Keys keys, Place<Record, Member> place) {
@@ -181,7 +189,7 @@ consteval RowOf<Record> single(Keys keys, Place<Record, Target *> place,
 
 template <typename Record, typename Link, std::size_t Count>
 consteval RowOf<Record> chain(Keys keys, Place<Record, Link *> place,
-                              const RecordTree<Link, Count> &tree) {
+                              const RecordTree<std::remove_const_t<Link>, Count> &tree) {
     static_assert(std::is_same_v<decltype(Link::next), Link *>);
     return {{keys, RowKind::kChain, place.offset, 0, tree.view()}};
 }

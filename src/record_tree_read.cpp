@@ -2,6 +2,7 @@
 // Record trees from dictionaries, and their release.
 #include "field_at.hpp"
 #include "record_tree.hpp"
+#include "wire.hpp"
 
 #include <algorithm>
 #include <cstring>
@@ -15,13 +16,6 @@ void *after(void *record, std::size_t offset) noexcept {
     return static_cast<std::byte *>(record) + offset;
 }
 
-Variant peeled(GVariant *value) noexcept {
-    Variant content{g_variant_ref(value)};
-    while (g_variant_is_of_type(content.get(), G_VARIANT_TYPE_VARIANT))
-        content.reset(g_variant_get_variant(content.get()));
-    return content;
-}
-
 const GVariantType *type_of(RowKind kind) noexcept {
     switch (kind) {
     case RowKind::kFlag:
@@ -29,6 +23,7 @@ const GVariantType *type_of(RowKind kind) noexcept {
     case RowKind::kNumber:
         return G_VARIANT_TYPE_INT64;
     case RowKind::kText:
+    case RowKind::kBytes:
     case RowKind::kInlineText:
         return G_VARIANT_TYPE_STRING;
     case RowKind::kPart:
@@ -87,6 +82,12 @@ void read_scalar(GVariant *value, const TreeRow &row, void *record) noexcept {
     case RowKind::kText:
         at<char *>(record, row.offset) = g_variant_dup_string(value, nullptr);
         break;
+    case RowKind::kBytes: {
+        Decoded decoded = base64_decode(g_variant_get_string(value, nullptr));
+        at<const guchar *>(record, row.offset) = decoded.bytes.release();
+        at<std::uint32_t>(record, row.extent) = static_cast<std::uint32_t>(decoded.count);
+        break;
+    }
     case RowKind::kInlineText:
         copy_bounded(&at<char>(record, row.offset), row.extent,
                      g_variant_get_string(value, nullptr));
@@ -229,7 +230,8 @@ void release_fields(const Tree &tree, void *record) noexcept {
         case RowKind::kInlineText:
             break;
         case RowKind::kText:
-            g_free(at<char *>(record, row.offset));
+        case RowKind::kBytes:
+            g_free(at<void *>(record, row.offset));
             break;
         case RowKind::kPart:
             release_fields(row.tree, after(record, row.offset));

@@ -69,6 +69,8 @@ Variant value_of(const TreeRow &row, const void *record) noexcept {
         const char *text = at<const char *>(record, row.offset);
         return text_value(text, std::strlen(text));
     }
+    case RowKind::kBytes:
+        break;
     case RowKind::kInlineText: {
         const char *text = &at<char>(record, row.offset);
         return text_value(text, tree::whole_length(text, row.extent - 1));

@@ -4,6 +4,14 @@
 #include <algorithm>
 
 namespace ims {
+
+Variant peeled(GVariant *value) noexcept {
+    Variant content{g_variant_ref(value)};
+    while (g_variant_is_of_type(content.get(), G_VARIANT_TYPE_VARIANT))
+        content.reset(g_variant_get_variant(content.get()));
+    return content;
+}
+
 namespace wire {
 
 Variant to_variant(const char *text, const char *) noexcept {
@@ -24,6 +32,17 @@ void from_variant(GVariant *child, std::int32_t &value) noexcept {
 void from_variant(GVariant *child, Variant &value) noexcept {
     value.reset(g_variant_is_of_type(child, G_VARIANT_TYPE_VARIANT) ? g_variant_get_variant(child)
                                                                     : g_variant_ref(child));
+}
+
+void fill(std::span<std::int32_t> values, GVariant *boxed_array) noexcept {
+    std::fill(values.begin(), values.end(), 0);
+    const Variant array = peeled(boxed_array);
+    if (!has_type(array.get(), "ai"))
+        return;
+    gsize count = 0;
+    const auto *first = static_cast<const std::int32_t *>(
+        g_variant_get_fixed_array(array.get(), &count, sizeof(std::int32_t)));
+    std::copy_n(first, std::min(count, values.size()), values.begin());
 }
 
 Variant tuple_of(std::span<const Variant> children) noexcept {

@@ -17,6 +17,9 @@ namespace ims {
 // A member that unpack() reads past.
 struct Skipped {};
 
+// What is inside a value, however many variants are around it.
+Variant peeled(GVariant *value) noexcept;
+
 namespace wire {
 
 template <typename T, typename... Accepted>
@@ -39,10 +42,13 @@ consteval bool carries(std::string_view type) {
     return is_one_of<T, Variant>;
 }
 
-// What unpack() can store a member of this type in. A "b" may go to a 32-bit boolean.
+// What unpack() can store a member of this type in. A "b" may go to a 32-bit boolean, a "v" with an
+// "ai" in it to an array of fixed size.
 template <typename T>
 consteval bool receives(std::string_view type) {
-    return carries<T>(type) || is_one_of<T, Skipped> || (type == "b" && is_one_of<T, std::int32_t>);
+    return carries<T>(type) || is_one_of<T, Skipped> ||
+           (type == "b" && is_one_of<T, std::int32_t>) ||
+           (type == "v" && is_one_of<std::remove_extent_t<T>, std::int32_t> && std::is_array_v<T>);
 }
 
 // Each returns nothing when the value cannot cross the bus.
@@ -85,6 +91,12 @@ inline void from_variant(GVariant *child, const char *&value) noexcept {
 inline void from_variant(GVariant *child, char *&value) noexcept {
     value = g_variant_dup_string(child, nullptr);
 }
+// As many integers as there is room for; what is missing, or all of something else, is 0.
+void fill(std::span<std::int32_t> values, GVariant *boxed_array) noexcept;
+template <std::size_t Size>
+void from_variant(GVariant *child, std::int32_t (&values)[Size]) noexcept {
+    fill(values, child);
+}
 // The value itself; of a variant its content.
 void from_variant(GVariant *child, Variant &value) noexcept;
 inline void from_variant(GVariant *, const Skipped &) noexcept {}
@@ -126,7 +138,7 @@ bool unpack(std::index_sequence<Index...>, GVariant *tuple, Out &...out) noexcep
 // The members of a plain record, in order.
 template <std::size_t Count, typename Record>
 auto members(Record &record) noexcept {
-    static_assert(Count >= 1 && Count <= 9, "add the missing size here");
+    static_assert((Count >= 1 && Count <= 10) || Count == 14, "add the missing size here");
     if constexpr (Count == 1) {
         auto &[a] = record;
         return std::tie(a);
@@ -151,9 +163,15 @@ auto members(Record &record) noexcept {
     } else if constexpr (Count == 8) {
         auto &[a, b, c, d, e, f, g, h] = record;
         return std::tie(a, b, c, d, e, f, g, h);
-    } else {
+    } else if constexpr (Count == 9) {
         auto &[a, b, c, d, e, f, g, h, i] = record;
         return std::tie(a, b, c, d, e, f, g, h, i);
+    } else if constexpr (Count == 10) {
+        auto &[a, b, c, d, e, f, g, h, i, j] = record;
+        return std::tie(a, b, c, d, e, f, g, h, i, j);
+    } else {
+        auto &[a, b, c, d, e, f, g, h, i, j, k, l, m, n] = record;
+        return std::tie(a, b, c, d, e, f, g, h, i, j, k, l, m, n);
     }
 }
 

@@ -229,6 +229,41 @@ TEST(RecordTree, KeepsTheLaterFittingValueOfARepeatedKey) {
     EXPECT_STREQ(received.record.links->text, "2");
 }
 
+struct Blob {
+    const std::uint8_t *bytes;
+    std::uint32_t count;
+    const Blob *next;
+};
+struct Blobs {
+    const Blob *first;
+};
+
+constexpr auto kBlob = ims::record_tree({
+    ims::bytes("bytes", IMS_PLACE(Blob, bytes), IMS_PLACE(Blob, count)),
+});
+constexpr auto kBlobs = ims::record_tree({ims::chain("blobs", IMS_PLACE(Blobs, first), kBlob)});
+
+TEST(RecordTree, ReadsBase64TextAsBytesWithTheirCountAndNeverSendsIt) {
+    const Variant dictionary =
+        parse("a{sv}", "{'blobs': <[{'bytes': <'AP9h'>}, {'bytes': <''>}, {'bytes': <[0x61]>}]>}");
+    const ims::Received<kBlobs> received{dictionary.get()};
+    const Blob *blob = received.record.first;
+    ASSERT_NE(blob, nullptr);
+    ASSERT_EQ(blob->count, 3U);
+    EXPECT_EQ(std::memcmp(blob->bytes,
+                          "\0\xff"
+                          "a",
+                          3),
+              0);
+    EXPECT_EQ(to_text(ims::write_record(kBlob, blob).get()), expected("{}"));
+    blob = blob->next;
+    EXPECT_EQ(blob->count, 0U);
+    blob = blob->next;
+    EXPECT_EQ(blob->bytes, nullptr);
+    EXPECT_EQ(blob->count, 0U);
+    EXPECT_EQ(blob->next, nullptr);
+}
+
 TEST(RecordTree, ReadsNothingFromWhatIsNoDictionary) {
     const Variant number = parse("v", "<int64 1>");
     EXPECT_EQ(ims::read_new(number.get(), kLeaf), nullptr);
