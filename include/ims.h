@@ -13,6 +13,7 @@
 
 #include "ims_call.h"
 #include "ims_login.h"
+#include "ims_poc.h"
 #include "ims_reg.h"
 #include "ims_settings.h"
 #include "ims_sms.h"

@@ -110,10 +110,7 @@ typedef void (*ims_response_cb)(ims_h handle, int result, void *data, void *user
  */
 typedef void (*ims_notification_cb)(ims_h handle, int noti_id, void *event, void *user_data);
 
-/**
- * The events that ims_set_notification_cb() takes. Each is one D-Bus signal of the service. The
- * push-to-talk ones (IMS_NOTI_POC_) can be asked for, but this version does not deliver them yet.
- */
+/** The events that ims_set_notification_cb() takes. Each is one D-Bus signal of the service. */
 typedef enum ims_noti_id_e {
     IMS_NOTI_REG_REGISTRATION_STATUS =
         0x101, /**< Registration.RegistrationStatus: #ims_registration_info_s */
@@ -152,28 +149,41 @@ typedef enum ims_noti_id_e {
     IMS_NOTI_SMS_DELIVERY_REPORT_ACK =
         0x303, /**< Sms.DeliveryReportAck: #ims_sms_delivery_report_ack_s */
 
-    IMS_NOTI_POC_CALL_INCOMING_IND = 0x401,           /**< Poc.PocCallIncomingInd */
-    IMS_NOTI_POC_CALL_IN_PROGRESS = 0x402,            /**< Poc.PocCallInProgress */
-    IMS_NOTI_POC_CALL_ALERTING = 0x403,               /**< Poc.PocCallAlerting */
-    IMS_NOTI_POC_CALL_ESTABLISHED = 0x404,            /**< Poc.PocCallEstablished */
-    IMS_NOTI_POC_CALL_ENDED = 0x405,                  /**< Poc.PocCallEnded */
-    IMS_NOTI_POC_CALL_FLOOR_GRANTED = 0x406,          /**< Poc.PocCallFloorGranted */
-    IMS_NOTI_POC_CALL_FLOOR_REJECTED = 0x407,         /**< Poc.PocCallFloorRejected */
-    IMS_NOTI_POC_CALL_FLOOR_IDLE = 0x408,             /**< Poc.PocCallFloorIdle */
-    IMS_NOTI_POC_CALL_FLOOR_QUEUE_POSITION = 0x409,   /**< Poc.PocCallFloorQueuePosition */
-    IMS_NOTI_POC_CALL_FLOOR_CANCELED = 0x40A,         /**< Poc.PocCallFloorCanceled */
-    IMS_NOTI_POC_CALL_FLOOR_TAKEN = 0x40B,            /**< Poc.PocCallFloorTaken */
-    IMS_NOTI_POC_CALL_MODIFY_REQUEST = 0x40C,         /**< Poc.PocCallModifyRequest */
-    IMS_NOTI_POC_CALL_MODIFY_STATUS = 0x40D,          /**< Poc.PocCallModifyStatus */
-    IMS_NOTI_POC_CALL_FLOOR_REQUEST_TIMEOUT = 0x40E,  /**< Poc.PocCallFloorRequestTimeout */
-    IMS_NOTI_POC_CALL_CRISIS_CALL_INITIATED = 0x40F,  /**< Poc.PocCallCrisisCallInitiated */
-    IMS_NOTI_POC_GROUP_ADVERTISEMENT = 0x410,         /**< Poc.PocGroupAdvertisement */
-    IMS_NOTI_POC_GROUP_CONF_PARTICIPANT_INFO = 0x411, /**< Poc.PocGroupConfParticipantInfo */
-    IMS_NOTI_POC_INCOMING_MSG_INFO = 0x412,           /**< Poc.PocIncomingMsgInfo */
-    IMS_NOTI_POC_MSG_NOTIFICATION = 0x413,            /**< Poc.PocMsgNotification */
-    IMS_NOTI_POC_INCOMING_FILE_TRANSFER = 0x414,      /**< Poc.PocIncomingFileTransfer */
-    IMS_NOTI_POC_FILE_TRANSFER_PROGRESS = 0x415,      /**< Poc.PocFileTransferProgress */
-    IMS_NOTI_POC_FILE_TRANSFER_TERMINATED = 0x416,    /**< Poc.PocFileTransferTerminated */
+    IMS_NOTI_POC_CALL_INCOMING_IND = 0x401, /**< Poc.PocCallIncomingInd: #ims_poc_call_incoming_s */
+    IMS_NOTI_POC_CALL_IN_PROGRESS = 0x402,  /**< Poc.PocCallInProgress: #ims_poc_call_event_s */
+    IMS_NOTI_POC_CALL_ALERTING = 0x403,     /**< Poc.PocCallAlerting: #ims_poc_call_event_s */
+    IMS_NOTI_POC_CALL_ESTABLISHED =
+        0x404,                       /**< Poc.PocCallEstablished: #ims_poc_call_established_s */
+    IMS_NOTI_POC_CALL_ENDED = 0x405, /**< Poc.PocCallEnded: #ims_poc_call_ended_s */
+    IMS_NOTI_POC_CALL_FLOOR_GRANTED = 0x406, /**< Poc.PocCallFloorGranted: #ims_poc_floor_event_s */
+    IMS_NOTI_POC_CALL_FLOOR_REJECTED =
+        0x407,                            /**< Poc.PocCallFloorRejected: #ims_poc_floor_event_s */
+    IMS_NOTI_POC_CALL_FLOOR_IDLE = 0x408, /**< Poc.PocCallFloorIdle: #ims_poc_floor_event_s */
+    IMS_NOTI_POC_CALL_FLOOR_QUEUE_POSITION =
+        0x409, /**< Poc.PocCallFloorQueuePosition: #ims_poc_floor_event_s */
+    IMS_NOTI_POC_CALL_FLOOR_CANCELED =
+        0x40A,                             /**< Poc.PocCallFloorCanceled: #ims_poc_floor_event_s */
+    IMS_NOTI_POC_CALL_FLOOR_TAKEN = 0x40B, /**< Poc.PocCallFloorTaken: #ims_poc_floor_event_s */
+    IMS_NOTI_POC_CALL_MODIFY_REQUEST =
+        0x40C, /**< Poc.PocCallModifyRequest: #ims_poc_modify_request_s */
+    IMS_NOTI_POC_CALL_MODIFY_STATUS =
+        0x40D, /**< Poc.PocCallModifyStatus: #ims_poc_modify_status_s */
+    IMS_NOTI_POC_CALL_FLOOR_REQUEST_TIMEOUT =
+        0x40E, /**< Poc.PocCallFloorRequestTimeout: #ims_poc_floor_event_s */
+    IMS_NOTI_POC_CALL_CRISIS_CALL_INITIATED =
+        0x40F, /**< Poc.PocCallCrisisCallInitiated: #ims_poc_call_event_s */
+    IMS_NOTI_POC_GROUP_ADVERTISEMENT =
+        0x410, /**< Poc.PocGroupAdvertisement: #ims_poc_group_advertisement_s */
+    IMS_NOTI_POC_GROUP_CONF_PARTICIPANT_INFO =
+        0x411, /**< Poc.PocGroupConfParticipantInfo: #ims_poc_participant_info_s */
+    IMS_NOTI_POC_INCOMING_MSG_INFO = 0x412, /**< Poc.PocIncomingMsgInfo: #ims_poc_incoming_msg_s */
+    IMS_NOTI_POC_MSG_NOTIFICATION = 0x413,  /**< Poc.PocMsgNotification: #ims_poc_msg_event_s */
+    IMS_NOTI_POC_INCOMING_FILE_TRANSFER =
+        0x414, /**< Poc.PocIncomingFileTransfer: #ims_poc_incoming_file_s */
+    IMS_NOTI_POC_FILE_TRANSFER_PROGRESS =
+        0x415, /**< Poc.PocFileTransferProgress: #ims_poc_file_progress_s */
+    IMS_NOTI_POC_FILE_TRANSFER_TERMINATED =
+        0x416, /**< Poc.PocFileTransferTerminated: #ims_poc_file_terminated_s */
 
     IMS_NOTI_LOGIN_STATE = 0x501 /**< Login.LoginState: #ims_login_state_s */
 } ims_noti_id_e;

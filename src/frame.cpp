@@ -17,10 +17,6 @@ bool is_cancelled(const Error &error) noexcept {
     return error && g_error_matches(error.get(), G_IO_ERROR, G_IO_ERROR_CANCELLED) != FALSE;
 }
 
-// The bus cuts off a process that sends a message larger than it takes: 32 MiB on a system bus that
-// is not configured otherwise.
-constexpr gsize kMaxTupleSize = gsize{16} << 20;
-
 bool can_be_sent(const Variant &tuple) noexcept {
     return tuple && g_variant_get_size(tuple.get()) <= kMaxTupleSize;
 }

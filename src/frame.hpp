@@ -25,6 +25,10 @@ namespace ims {
 inline constexpr const char *kServiceName = "org.kelvo.ims";
 inline constexpr int kRequestTimeoutMs = 60000;
 
+// The bus cuts off a process that sends a message larger than it takes: 32 MiB on a system bus that
+// is not configured otherwise.
+inline constexpr gsize kMaxTupleSize = gsize{16} << 20;
+
 // 0 when the device has the IMS feature and none of the pointers is NULL, in this order.
 int admit(std::initializer_list<const void *> required = {}, Site site = here()) noexcept;
 
@@ -118,7 +122,7 @@ void complete(GObject *source, GAsyncResult *outcome, gpointer context, const De
 }
 
 // The usual deliveries: the result alone whatever follows it, a pointer to the second member, the
-// second member itself in the pointer's place.
+// second member itself in the pointer's place, a record of all members but the first.
 inline constexpr auto kResultOnly = [](const Completion &done, std::int32_t result,
                                        const auto &...) { done(result); };
 inline constexpr auto kSecondByPointer = [](const Completion &done, std::int32_t result,
@@ -128,6 +132,12 @@ inline constexpr auto kSecondInPlace = [](const Completion &done, std::int32_t r
     // NOLINTNEXTLINE(performance-no-int-to-ptr): applications read the value from the pointer.
     done(result, reinterpret_cast<void *>(static_cast<std::intptr_t>(second)));
 };
+template <typename Record>
+inline constexpr auto kRestAsRecord =
+    [](const Completion &done, std::int32_t result, const auto &...rest) {
+        Record record{rest...};
+        done(result, &record);
+    };
 
 // Ends a request whose reply is the result alone.
 inline void complete(GObject *source, GAsyncResult *outcome, gpointer context,

@@ -36,6 +36,7 @@ struct Route {
 
 constexpr Route kRoutes[] = {
     {"org.kelvo.ims.Call", on_call_signal_emit_handler},
+    {"org.kelvo.ims.Poc", on_poc_signal_emit_handler},
     {"org.kelvo.ims.Sms", on_sms_signal_emit_handler},
     {"org.kelvo.ims.Registration", on_reg_signal_emit_handler},
     {"org.kelvo.ims.Login", on_login_signal_emit_handler},

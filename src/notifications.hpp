@@ -27,6 +27,8 @@ void on_reg_signal_emit_handler(ims_h handle, int noti_id, GVariant *parameters,
                                 const ims_noti_cb_info_s *subscription);
 void on_call_signal_emit_handler(ims_h handle, int noti_id, GVariant *parameters,
                                  const ims_noti_cb_info_s *subscription);
+void on_poc_signal_emit_handler(ims_h handle, int noti_id, GVariant *parameters,
+                                const ims_noti_cb_info_s *subscription);
 void on_sms_signal_emit_handler(ims_h handle, int noti_id, GVariant *parameters,
                                 const ims_noti_cb_info_s *subscription);
 void on_login_signal_emit_handler(ims_h handle, int noti_id, GVariant *parameters,

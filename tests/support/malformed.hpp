@@ -71,7 +71,28 @@ inline std::vector<Malformed> malformed_for(const std::string &type) {
         {"(isisssssb)", "(1, '2', 3, '4', '5', '6', '7', '8', true)"},
         {"(isissssb)", "(1, '2', 3, '4', '5', '6', '7', true)"},
         {"(isisssssbi)", "(1, '2', 3, '4', '5', '6', '7', '8', true, 9)"},
-        {"(isissssss)", "(1, '2', 3, '4', '5', '6', '7', '8', '9')"}};
+        {"(isissssss)", "(1, '2', 3, '4', '5', '6', '7', '8', '9')"},
+        {"(iss)", "(1, '2', '3')"},
+        {"(iv)", "(1, <{'subject': <'3'>}>)"},
+        {"(ia{sv})", "(1, {'subject': <'3'>})"},
+        {"(ia{ss})", "(1, {'subject': '3'})"},
+        {"(ivviv)", "(1, <2>, <3>, 4, <5>)"},
+        {"(ia{sv}a{sv}ia{sv})", "(1, {}, {}, 4, {})"},
+        {"(ivsiiv)", "(1, <2>, '3', 4, 5, <6>)"},
+        {"(ivsissvsiiiv)", "(1, <2>, '3', 4, '5', '6', <7>, '8', 9, 10, 11, <12>)"},
+        {"(ivsissvsiiv)", "(1, <2>, '3', 4, '5', '6', <7>, '8', 9, 10, <11>)"},
+        {"(bbiivv)", "(true, true, 3, 4, <[5]>, <[6]>)"},
+        {"(bbiiaiai)", "(true, true, 3, 4, [5], [6])"},
+        {"(bbbiivv)", "(true, true, true, 4, 5, <[6]>, <[7]>)"},
+        {"(ivisisiiis)", "(1, <[2]>, 3, '4', 5, '6', 7, 8, 9, '10')"},
+        {"(iaiisisiiis)", "(1, [2], 3, '4', 5, '6', 7, 8, 9, '10')"},
+        {"(ivisisiisi)", "(1, <[2]>, 3, '4', 5, '6', 7, 8, '9', 10)"},
+        {"(iibsbvbvv)", "(1, 2, true, '4', true, <[6]>, true, <[8]>, <{'uri': <'9'>}>)"},
+        {"(iibsbvbva{sv})", "(1, 2, true, '4', true, <[6]>, true, <[8]>, {'uri': <'9'>})"},
+        {"(bbbbssssssiivv)",
+         "(true, true, true, true, '5', '6', '7', '8', '9', '10', 11, 12, <[13]>, <[14]>)"},
+        {"(bbbbsssssiivv)",
+         "(true, true, true, true, '5', '6', '7', '8', '9', 10, 11, <[12]>, <[13]>)"}};
     std::vector<Malformed> others;
     for (const auto &[shape, value] : shapes)
         if (shape != type)

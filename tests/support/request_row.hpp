@@ -195,4 +195,14 @@ Variation bad_text(const char *field) {
             }};
 }
 
+// The record with a pointer to another record that holds such a text.
+template <auto Function, const auto &Record, auto Field, const auto &Bad>
+Variation bad_part(const char *what) {
+    return {what, [](ims_h handle, ims_response_cb callback, void *user_data) {
+                auto record = Record;
+                record.*Field = &Bad;
+                return Function(handle, &record, callback, user_data);
+            }};
+}
+
 } // namespace test
