@@ -6,12 +6,19 @@
 #include <algorithm>
 #include <csignal>
 #include <cstdlib>
+#include <stdexcept>
 
 namespace sim::test {
 
 namespace {
 
 constexpr guint kPatienceMilliseconds = 20000;
+
+// Ends the test, and it alone: what it holds is let go of.
+template <typename... Args>
+[[noreturn]] void give_up(fmt::format_string<Args...> text, Args &&...args) {
+    throw std::runtime_error(fmt::format(text, std::forward<Args>(args)...));
+}
 
 GObjectPtr<GDataInputStream> lines_of(GInputStream *stream) {
     return GObjectPtr<GDataInputStream>(g_data_input_stream_new(stream));
@@ -42,10 +49,8 @@ Program::Program(const std::vector<std::string> &arguments, const Environment &e
     argv.push_back(nullptr);
     ErrorSlot error;
     process_.reset(g_subprocess_launcher_spawnv(launcher.get(), argv.data(), &error.raw));
-    if (!process_) {
-        ADD_FAILURE() << "cannot start " << IMS_SIM_PATH << ": " << error.message();
-        std::abort();
-    }
+    if (!process_)
+        give_up("cannot start {}: {}", IMS_SIM_PATH, error.message());
     output_ = lines_of(g_subprocess_get_stdout_pipe(process_.get()));
     errors_ = lines_of(g_subprocess_get_stderr_pipe(process_.get()));
 }
@@ -101,10 +106,8 @@ Client::Client(const std::string &address) {
         static_cast<GDBusConnectionFlags>(G_DBUS_CONNECTION_FLAGS_AUTHENTICATION_CLIENT |
                                           G_DBUS_CONNECTION_FLAGS_MESSAGE_BUS_CONNECTION),
         nullptr, nullptr, &error.raw));
-    if (!connection_) {
-        ADD_FAILURE() << "cannot connect to " << address << ": " << error.message();
-        std::abort();
-    }
+    if (!connection_)
+        give_up("cannot connect to {}: {}", address, error.message());
     subscriptions_[0] = g_dbus_connection_signal_subscribe(
         connection_.get(), kServiceName, nullptr, nullptr, nullptr, nullptr,
         G_DBUS_SIGNAL_FLAGS_NONE,
@@ -123,6 +126,9 @@ Client::Client(const std::string &address) {
         [](GDBusConnection *, const gchar *, const gchar *, const gchar *, const gchar *,
            GVariant *, gpointer) {},
         nullptr, nullptr);
+    // The bus has to know of the subscriptions before anybody says what is to be heard: to ask for
+    // them waits for nothing.
+    has_owner(kServiceName);
 }
 
 Client::~Client() {
@@ -189,7 +195,7 @@ int Client::register_application(int slot) {
     return id;
 }
 
-void Client::iterate() {
+void Client::iterate(const std::string &awaited) {
     bool late = false;
     GSource *limit = g_timeout_source_new(kPatienceMilliseconds);
     g_source_set_callback(
@@ -202,15 +208,17 @@ void Client::iterate() {
     g_source_attach(limit, nullptr);
     const GSourceGuard guard(limit);
     g_main_context_iteration(nullptr, TRUE);
-    if (late) {
-        ADD_FAILURE() << "nothing more arrives";
-        std::abort();
-    }
+    if (late)
+        give_up("waited in vain for {}", awaited);
 }
 
 std::string Client::next_signal() {
+    return next_signal("any signal");
+}
+
+std::string Client::next_signal(const std::string &awaited) {
     while (signals_.empty())
-        iterate();
+        iterate(awaited);
     std::string signal = signals_.front();
     signals_.pop_front();
     return signal;
@@ -219,7 +227,7 @@ std::string Client::next_signal() {
 std::string Client::wait_for(int slot, const std::string &member) {
     const auto prefix = fmt::format("sub{} {} ", slot, member);
     for (;;) {
-        std::string signal = next_signal();
+        std::string signal = next_signal(prefix);
         if (signal.starts_with(prefix))
             return signal.substr(prefix.size());
     }
@@ -227,12 +235,12 @@ std::string Client::wait_for(int slot, const std::string &member) {
 
 void Client::wait_until_gone(const std::string &name) {
     while (has_owner(name))
-        iterate();
+        iterate(name + " to leave the bus");
 }
 
 void Client::wait_until_owned(const std::string &name) {
     while (!has_owner(name))
-        iterate();
+        iterate(name + " to come to the bus");
 }
 
 bool Client::has_owner(const std::string &name) {
@@ -247,10 +255,8 @@ bool Client::has_owner(const std::string &name) {
 }
 
 Served::Served(std::vector<std::string> options) {
-    if (const auto error = bus_.start()) {
-        ADD_FAILURE() << *error;
-        std::abort();
-    }
+    if (const auto error = bus_.start())
+        give_up("{}", *error);
     options.insert(options.begin(), {"serve", "--verbose", "--address", bus_.address()});
     client_ = std::make_unique<Client>(bus_.address());
     program_ = std::make_unique<Program>(options);

@@ -60,6 +60,7 @@ struct Reply {
 // One application: a connection of its own that hears every signal of the service.
 class Client {
   public:
+    // Hears everything that is said once this returns.
     explicit Client(const std::string &address);
     ~Client();
 
@@ -83,7 +84,8 @@ class Client {
 
   private:
     bool has_owner(const std::string &name);
-    void iterate();
+    std::string next_signal(const std::string &awaited);
+    void iterate(const std::string &awaited);
 
     GObjectPtr<GDBusConnection> connection_;
     std::deque<std::string> signals_;
