@@ -17,15 +17,17 @@ std::int32_t number_in(std::string_view text) noexcept {
 }
 
 bool read_field(GVariant *value, const FieldRow &row, void *record) noexcept {
-    const bool is_text = g_variant_is_of_type(value, G_VARIANT_TYPE_STRING) != FALSE;
+    // The values that are read have basic types, each a class of its own.
+    const GVariantClass type = g_variant_classify(value);
+    const bool is_text = type == G_VARIANT_CLASS_STRING;
     switch (row.kind) {
     case FieldKind::kInt32:
-        if (!g_variant_is_of_type(value, G_VARIANT_TYPE_INT32))
+        if (type != G_VARIANT_CLASS_INT32)
             return false;
         at<std::int32_t>(record, row.offset) = g_variant_get_int32(value);
         return true;
     case FieldKind::kBoolean:
-        if (!g_variant_is_of_type(value, G_VARIANT_TYPE_BOOLEAN))
+        if (type != G_VARIANT_CLASS_BOOLEAN)
             return false;
         at<bool>(record, row.offset) = g_variant_get_boolean(value) != FALSE;
         return true;
@@ -107,7 +109,7 @@ void read_dictionary(GVariant *dictionary, FieldsView fields, void *record) noex
         if (filled[number])
             continue;
         const Variant boxed_value{g_variant_get_child_value(entry.get(), 1)};
-        const Variant value{g_variant_get_variant(boxed_value.get())};
+        const Variant value{g_variant_get_child_value(boxed_value.get(), 0)};
         filled[number] = read_field(value.get(), *row, record);
     }
 }
