@@ -19,7 +19,9 @@ struct Verb {
     Action (*prepare)(Arguments &);
 };
 
-// One table a file.
+// One table a file, NAME_verbs.cpp. A new family of verbs takes such a file, a line here and one in
+// all_verbs(), and a line in kGroups for each word that other words follow. Its events go into
+// NAME_events.cpp (events.hpp), its section into docs/imsctl.md.
 std::span<const Verb> call_verbs();
 std::span<const Verb> media_verbs();
 std::span<const Verb> conference_verbs();
