@@ -18,6 +18,7 @@
 #include "ims_settings.h"
 #include "ims_sms.h"
 #include "ims_ss.h"
+#include "ims_vt.h"
 #include "ims_xdm.h"
 
 #ifdef __cplusplus

@@ -1,0 +1,537 @@
+/*
+ * SPDX-License-Identifier: Apache-2.0
+ */
+#ifndef KELVO_IMS_VT_H
+#define KELVO_IMS_VT_H
+
+/**
+ * @file ims_vt.h
+ * @brief Video telephony: camera, preview, zoom, recording, casting, drawing surfaces.
+ *
+ * All methods are on the D-Bus interface `org.kelvo.ims.Vt`; there are no signals. None of them
+ * carries the application id. Each expects `(i)`, the result, and its callback's data is NULL, unless
+ * it says otherwise.
+ *
+ * The service does the media work and defines what the values mean: every field with a neutral name
+ * such as `value_1` or `text_1`. The library passes them through unchanged.
+ */
+
+#include "ims_types.h"
+
+#ifdef __cplusplus
+extern "C" {
+#endif
+
+/**
+ * @name Request records
+ * Owned by the caller and read during the call only. A NULL text is sent as an empty one.
+ * @{
+ */
+
+/** A camera to start. */
+typedef struct ims_vt_camera_s {
+    int32_t session_id; /**< the session */
+    int32_t value_1;    /**< defined by the service */
+} ims_vt_camera_s;
+
+/** What is shown in the user's place. */
+typedef struct ims_vt_hide_me_s {
+    int32_t session_id; /**< the session */
+    const char *text_1; /**< defined by the service */
+} ims_vt_hide_me_s;
+
+/** An orientation of the video. */
+typedef struct ims_vt_orientation_s {
+    int32_t session_id; /**< the session */
+    int32_t value_1;    /**< defined by the service */
+} ims_vt_orientation_s;
+
+/** Whose zoom to ask for. */
+typedef struct ims_vt_zoom_query_s {
+    int32_t session_id; /**< the session */
+    int32_t value_1;    /**< defined by the service */
+} ims_vt_zoom_query_s;
+
+/** A zoom to set. */
+typedef struct ims_vt_zoom_s {
+    int32_t session_id; /**< the session */
+    int32_t value_1;    /**< defined by the service */
+    int32_t value_2;    /**< defined by the service */
+} ims_vt_zoom_s;
+
+/** A picture to take. */
+typedef struct ims_vt_capture_s {
+    int32_t session_id; /**< the session */
+    int32_t value_1;    /**< defined by the service */
+    const char *text_1; /**< defined by the service */
+} ims_vt_capture_s;
+
+/** A recording to start. */
+typedef struct ims_vt_record_start_s {
+    int32_t session_id; /**< the session */
+    int32_t value_1;    /**< defined by the service */
+    int32_t value_2;    /**< defined by the service */
+    const char *text_1; /**< defined by the service */
+    int32_t value_3;    /**< defined by the service */
+} ims_vt_record_start_s;
+
+/** A recording to pause, resume, cancel or end. */
+typedef struct ims_vt_record_s {
+    int32_t session_id; /**< the session */
+    int32_t value_1;    /**< defined by the service */
+} ims_vt_record_s;
+
+/** A file to cast. */
+typedef struct ims_vt_file_cast_s {
+    int32_t session_id; /**< the session */
+    const char *text_1; /**< defined by the service */
+} ims_vt_file_cast_s;
+
+/** A movement over the video. */
+typedef struct ims_vt_swipe_s {
+    int32_t session_id; /**< the session */
+    int32_t value_1;    /**< defined by the service */
+    int32_t value_2;    /**< defined by the service */
+    int32_t value_3;    /**< defined by the service */
+    int32_t value_4;    /**< defined by the service */
+    int32_t value_5;    /**< defined by the service */
+} ims_vt_swipe_s;
+
+/** A surface to draw on. */
+typedef struct ims_vt_surface_s {
+    int32_t session_id;     /**< the session */
+    int32_t count;          /**< how many entries; sent as stored, 0 and less send none */
+    const int32_t *entries; /**< count identifiers, defined by the service; NULL sends none */
+} ims_vt_surface_s;
+
+/** A pixmap to be used again. */
+typedef struct ims_vt_pix_map_re_use_s {
+    int32_t session_id; /**< the session */
+    int32_t value_1;    /**< defined by the service */
+    int32_t value_2;    /**< defined by the service */
+} ims_vt_pix_map_re_use_s;
+
+/** A pixmap to release. */
+typedef struct ims_vt_pix_map_s {
+    int32_t session_id; /**< the session */
+    int32_t value_1;    /**< defined by the service */
+} ims_vt_pix_map_s;
+
+/** The windows to draw in. */
+typedef struct ims_vt_window_s {
+    int32_t session_id; /**< the session */
+    int32_t value_1;    /**< defined by the service */
+    int32_t value_2;    /**< defined by the service */
+    int32_t value_3;    /**< defined by the service */
+    int32_t value_4;    /**< defined by the service */
+    int32_t value_5;    /**< defined by the service */
+} ims_vt_window_s;
+
+/** A buffer, by name. */
+typedef struct ims_vt_buffer_s {
+    int32_t session_id; /**< the session */
+    const char *text_1; /**< defined by the service */
+} ims_vt_buffer_s;
+
+/** @} */
+
+/**
+ * @brief Starts a camera.
+ *
+ * D-Bus: `StartCamera`, sends `(ii)`: the record's fields.
+ *
+ * @param handle     the handle
+ * @param info       the session and which camera
+ * @param callback   receives the outcome, or NULL
+ * @param user_data  handed to the callback
+ * @return see @ref requests
+ */
+IMS_API int ims_vt_start_camera(ims_h handle, const ims_vt_camera_s *info, ims_response_cb callback,
+                                void *user_data);
+
+/**
+ * @brief Stops the camera.
+ *
+ * D-Bus: `StopCamera`, sends `(i)`: the session.
+ *
+ * @param handle     the handle
+ * @param session_id the session
+ * @param callback   receives the outcome, or NULL
+ * @param user_data  handed to the callback
+ * @return see @ref requests
+ */
+IMS_API int ims_vt_stop_camera(ims_h handle, int32_t session_id, ims_response_cb callback,
+                               void *user_data);
+
+/**
+ * @brief Hides the user: the other party no longer sees the camera's picture.
+ *
+ * D-Bus: `HideMe`, sends `(is)`: the record's fields.
+ *
+ * @param handle     the handle
+ * @param info       the session and what is shown instead
+ * @param callback   receives the outcome, or NULL
+ * @param user_data  handed to the callback
+ * @return see @ref requests
+ */
+IMS_API int ims_vt_hide_me(ims_h handle, const ims_vt_hide_me_s *info, ims_response_cb callback,
+                           void *user_data);
+
+/**
+ * @brief Shows the user again, after ims_vt_hide_me().
+ *
+ * D-Bus: `ShowMe`, sends `(i)`: the session.
+ *
+ * @param handle     the handle
+ * @param session_id the session
+ * @param callback   receives the outcome, or NULL
+ * @param user_data  handed to the callback
+ * @return see @ref requests
+ */
+IMS_API int ims_vt_show_me(ims_h handle, int32_t session_id, ims_response_cb callback,
+                           void *user_data);
+
+/**
+ * @brief Switches to the other camera.
+ *
+ * D-Bus: `SwitchCamera`, sends `(i)`: the session.
+ *
+ * @param handle     the handle
+ * @param session_id the session
+ * @param callback   receives the outcome, or NULL
+ * @param user_data  handed to the callback
+ * @return see @ref requests
+ */
+IMS_API int ims_vt_switch_camera(ims_h handle, int32_t session_id, ims_response_cb callback,
+                                 void *user_data);
+
+/**
+ * @brief Sets the orientation of the video.
+ *
+ * D-Bus: `SetVideoOrientation`, sends `(ii)`: the record's fields.
+ *
+ * @param handle     the handle
+ * @param info       the session and the orientation
+ * @param callback   receives the outcome, or NULL
+ * @param user_data  handed to the callback
+ * @return see @ref requests
+ */
+IMS_API int ims_vt_set_video_orientation(ims_h handle, const ims_vt_orientation_s *info,
+                                         ims_response_cb callback, void *user_data);
+
+/**
+ * @brief Asks for the zoom.
+ *
+ * D-Bus: `GetZoom`, sends `(ii)`: the record's fields; expects `(ii)`: the callback's data is an
+ * `int32_t *`, the second member, or NULL when the call failed.
+ *
+ * @param handle     the handle
+ * @param info       the session and what to ask for
+ * @param callback   receives the outcome, or NULL
+ * @param user_data  handed to the callback
+ * @return see @ref requests
+ */
+IMS_API int ims_vt_get_zoom(ims_h handle, const ims_vt_zoom_query_s *info, ims_response_cb callback,
+                            void *user_data);
+
+/**
+ * @brief Sets the zoom.
+ *
+ * D-Bus: `SetZoom`, sends `(iii)`: the record's fields.
+ *
+ * @param handle     the handle
+ * @param info       the session and the zoom
+ * @param callback   receives the outcome, or NULL
+ * @param user_data  handed to the callback
+ * @return see @ref requests
+ */
+IMS_API int ims_vt_set_zoom(ims_h handle, const ims_vt_zoom_s *info, ims_response_cb callback,
+                            void *user_data);
+
+/**
+ * @brief Holds the video stream.
+ *
+ * D-Bus: `HoldVideo`, sends `(i)`: the session.
+ *
+ * @param handle     the handle
+ * @param session_id the session
+ * @param callback   receives the outcome, or NULL
+ * @param user_data  handed to the callback
+ * @return see @ref requests
+ */
+IMS_API int ims_vt_hold_video(ims_h handle, int32_t session_id, ims_response_cb callback,
+                              void *user_data);
+
+/**
+ * @brief Resumes the video stream, after ims_vt_hold_video().
+ *
+ * D-Bus: `ResumeVideo`, sends `(i)`: the session.
+ *
+ * @param handle     the handle
+ * @param session_id the session
+ * @param callback   receives the outcome, or NULL
+ * @param user_data  handed to the callback
+ * @return see @ref requests
+ */
+IMS_API int ims_vt_resume_video(ims_h handle, int32_t session_id, ims_response_cb callback,
+                                void *user_data);
+
+/**
+ * @brief Takes a picture of a surface.
+ *
+ * D-Bus: `CaptureSurfaceImage`, sends `(iis)`: the record's fields.
+ *
+ * @param handle     the handle
+ * @param info       the session, the surface and the picture's file
+ * @param callback   receives the outcome, or NULL
+ * @param user_data  handed to the callback
+ * @return see @ref requests
+ */
+IMS_API int ims_vt_capture_surface_image(ims_h handle, const ims_vt_capture_s *info,
+                                         ims_response_cb callback, void *user_data);
+
+/**
+ * @brief Starts recording the video.
+ *
+ * D-Bus: `StartRecordVideo`, sends `(iiisi)`: the record's fields.
+ *
+ * @param handle     the handle
+ * @param info       the session, what to record and the file
+ * @param callback   receives the outcome, or NULL
+ * @param user_data  handed to the callback
+ * @return see @ref requests
+ */
+IMS_API int ims_vt_start_record_video(ims_h handle, const ims_vt_record_start_s *info,
+                                      ims_response_cb callback, void *user_data);
+
+/**
+ * @brief Pauses a recording.
+ *
+ * D-Bus: `PauseRecordVideo`, sends `(ii)`: the record's fields.
+ *
+ * @param handle     the handle
+ * @param info       the session and the recording
+ * @param callback   receives the outcome, or NULL
+ * @param user_data  handed to the callback
+ * @return see @ref requests
+ */
+IMS_API int ims_vt_pause_record_video(ims_h handle, const ims_vt_record_s *info,
+                                      ims_response_cb callback, void *user_data);
+
+/**
+ * @brief Resumes a recording, after ims_vt_pause_record_video().
+ *
+ * D-Bus: `ResumeRecordVideo`, sends `(ii)`: the record's fields.
+ *
+ * @param handle     the handle
+ * @param info       the session and the recording
+ * @param callback   receives the outcome, or NULL
+ * @param user_data  handed to the callback
+ * @return see @ref requests
+ */
+IMS_API int ims_vt_resume_record_video(ims_h handle, const ims_vt_record_s *info,
+                                       ims_response_cb callback, void *user_data);
+
+/**
+ * @brief Cancels a recording.
+ *
+ * D-Bus: `CancelRecordVideo`, sends `(ii)`: the record's fields.
+ *
+ * @param handle     the handle
+ * @param info       the session and the recording
+ * @param callback   receives the outcome, or NULL
+ * @param user_data  handed to the callback
+ * @return see @ref requests
+ */
+IMS_API int ims_vt_cancel_record_video(ims_h handle, const ims_vt_record_s *info,
+                                       ims_response_cb callback, void *user_data);
+
+/**
+ * @brief Ends a recording.
+ *
+ * D-Bus: `StopRecordVideo`, sends `(ii)`: the record's fields.
+ *
+ * @param handle     the handle
+ * @param info       the session and the recording
+ * @param callback   receives the outcome, or NULL
+ * @param user_data  handed to the callback
+ * @return see @ref requests
+ */
+IMS_API int ims_vt_stop_record_video(ims_h handle, const ims_vt_record_s *info,
+                                     ims_response_cb callback, void *user_data);
+
+/**
+ * @brief Casts a file into the call.
+ *
+ * D-Bus: `StartFileCast`, sends `(is)`: the record's fields.
+ *
+ * @param handle     the handle
+ * @param info       the session and the file
+ * @param callback   receives the outcome, or NULL
+ * @param user_data  handed to the callback
+ * @return see @ref requests
+ */
+IMS_API int ims_vt_start_file_cast(ims_h handle, const ims_vt_file_cast_s *info,
+                                   ims_response_cb callback, void *user_data);
+
+/**
+ * @brief Stops casting a file.
+ *
+ * D-Bus: `StopFileCast`, sends `(i)`: the session.
+ *
+ * @param handle     the handle
+ * @param session_id the session
+ * @param callback   receives the outcome, or NULL
+ * @param user_data  handed to the callback
+ * @return see @ref requests
+ */
+IMS_API int ims_vt_stop_file_cast(ims_h handle, int32_t session_id, ims_response_cb callback,
+                                  void *user_data);
+
+/**
+ * @brief Swaps the two video surfaces.
+ *
+ * D-Bus: `SwapVideoSurface`, sends `(i)`: the session.
+ *
+ * @param handle     the handle
+ * @param session_id the session
+ * @param callback   receives the outcome, or NULL
+ * @param user_data  handed to the callback
+ * @return see @ref requests
+ */
+IMS_API int ims_vt_swap_video_surface(ims_h handle, int32_t session_id, ims_response_cb callback,
+                                      void *user_data);
+
+/**
+ * @brief Swipes the video.
+ *
+ * D-Bus: `SwipeVideo`, sends `(iiiiii)`: the record's fields.
+ *
+ * @param handle     the handle
+ * @param info       the session and the movement. Not checked: must not be NULL
+ * @param callback   receives the outcome, or NULL
+ * @param user_data  handed to the callback
+ * @return see @ref requests
+ */
+IMS_API int ims_vt_swipe_video(ims_h handle, const ims_vt_swipe_s *info, ims_response_cb callback,
+                               void *user_data);
+
+/**
+ * @brief Sets the surface that the near end's video is drawn on.
+ *
+ * D-Bus: `SetNearEndSurface`, sends `(iiv)`: the session, the count, and a variant with an `ai` of
+ * the entries.
+ *
+ * @param handle     the handle
+ * @param info       the surface
+ * @param callback   receives the outcome, or NULL
+ * @param user_data  handed to the callback
+ * @return see @ref requests
+ */
+IMS_API int ims_vt_set_near_end_surface(ims_h handle, const ims_vt_surface_s *info,
+                                        ims_response_cb callback, void *user_data);
+
+/**
+ * @brief Sets the surface that the far end's video is drawn on.
+ *
+ * D-Bus: `SetFarEndSurface`, sends `(iiv)`: the session, the count, and a variant with an `ai` of
+ * the entries.
+ *
+ * @param handle     the handle
+ * @param info       the surface
+ * @param callback   receives the outcome, or NULL
+ * @param user_data  handed to the callback
+ * @return see @ref requests
+ */
+IMS_API int ims_vt_set_far_end_surface(ims_h handle, const ims_vt_surface_s *info,
+                                       ims_response_cb callback, void *user_data);
+
+/**
+ * @brief Names the session whose video is active.
+ *
+ * D-Bus: `SetActiveSessionId`, sends `(i)`: the session.
+ *
+ * @param handle     the handle
+ * @param session_id the session
+ * @param callback   receives the outcome, or NULL
+ * @param user_data  handed to the callback
+ * @return see @ref requests
+ */
+IMS_API int ims_vt_set_active_session_id(ims_h handle, int32_t session_id, ims_response_cb callback,
+                                         void *user_data);
+
+/**
+ * @brief Lets the service use a pixmap again.
+ *
+ * D-Bus: `ReUsePixMapId`, sends `(iii)`: the record's fields.
+ *
+ * @param handle     the handle
+ * @param info       the session and the pixmap
+ * @param callback   receives the outcome, or NULL
+ * @param user_data  handed to the callback
+ * @return see @ref requests
+ */
+IMS_API int ims_vt_re_use_pix_map_id(ims_h handle, const ims_vt_pix_map_re_use_s *info,
+                                     ims_response_cb callback, void *user_data);
+
+/**
+ * @brief Releases a pixmap.
+ *
+ * D-Bus: `ReleasePixMapId`, sends `(ii)`: the record's fields.
+ *
+ * @param handle     the handle
+ * @param info       the session and the pixmap
+ * @param callback   receives the outcome, or NULL
+ * @param user_data  handed to the callback
+ * @return see @ref requests
+ */
+IMS_API int ims_vt_release_pix_map_id(ims_h handle, const ims_vt_pix_map_s *info,
+                                      ims_response_cb callback, void *user_data);
+
+/**
+ * @brief Sets the windows that the video is drawn in.
+ *
+ * D-Bus: `SetWindowId`, sends `(iiiiii)`: the record's fields.
+ *
+ * @param handle     the handle
+ * @param info       the session and the windows
+ * @param callback   receives the outcome, or NULL
+ * @param user_data  handed to the callback
+ * @return see @ref requests
+ */
+IMS_API int ims_vt_set_window_id(ims_h handle, const ims_vt_window_s *info,
+                                 ims_response_cb callback, void *user_data);
+
+/**
+ * @brief Sets the buffer of the camera's pictures.
+ *
+ * D-Bus: `SetCameraBuffer`, sends `(is)`: the record's fields.
+ *
+ * @param handle     the handle
+ * @param info       the session and the buffer
+ * @param callback   receives the outcome, or NULL
+ * @param user_data  handed to the callback
+ * @return see @ref requests
+ */
+IMS_API int ims_vt_set_camera_buffer(ims_h handle, const ims_vt_buffer_s *info,
+                                     ims_response_cb callback, void *user_data);
+
+/**
+ * @brief Sets the buffer of the media.
+ *
+ * D-Bus: `SetMediaBuffer`, sends `(is)`: the record's fields.
+ *
+ * @param handle     the handle
+ * @param info       the session and the buffer
+ * @param callback   receives the outcome, or NULL
+ * @param user_data  handed to the callback
+ * @return see @ref requests
+ */
+IMS_API int ims_vt_set_media_buffer(ims_h handle, const ims_vt_buffer_s *info,
+                                    ims_response_cb callback, void *user_data);
+
+#ifdef __cplusplus
+}
+#endif
+
+#endif
