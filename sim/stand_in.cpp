@@ -27,13 +27,17 @@ StandIn::StandIn(const Options &options, const Log &log, MainLoop &loop)
       services_(plan_, registrations_),
       calls_(plan_, timers_, registrations_, services_,
              std::chrono::duration_cast<std::chrono::nanoseconds>(options.ring_time),
-             sink_of<CallInterface>(service_)),
+             [this](int slot, const CallEvent &event) {
+                 sink_of<CallInterface>(service_)(slot, event);
+                 video_.hear(slot, event);
+             }),
+      video_(calls_, plan_.slots()),
       ussd_(plan_, timers_, registrations_, sink_of<CallInterface>(service_)),
       logins_(plan_.slots(), timers_, registrations_, sink_of<LoginInterface>(service_)),
       centre_(plan_, timers_, registrations_, std::time(nullptr), sink_of<SmsInterface>(service_)),
       settings_(plan_.slots()), registration_interface_(applications_, registrations_),
       login_interface_(logins_), call_interface_(calls_, ussd_), sms_interface_(centre_),
-      ss_interface_(services_), settings_interface_(settings_) {
+      ss_interface_(services_), settings_interface_(settings_), vt_interface_(video_) {
     loop.drive(timers_);
     service_.add(registration_interface_.describe());
     service_.add(login_interface_.describe());
@@ -41,6 +45,7 @@ StandIn::StandIn(const Options &options, const Log &log, MainLoop &loop)
     service_.add(sms_interface_.describe());
     service_.add(ss_interface_.describe());
     service_.add(settings_interface_.describe());
+    service_.add(vt_interface_.describe());
 }
 
 std::optional<std::string> StandIn::restore(const std::string &state_directory) {

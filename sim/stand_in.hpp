@@ -17,6 +17,8 @@
 #include "sim/sms_interface.hpp"
 #include "sim/ss_interface.hpp"
 #include "sim/ussd.hpp"
+#include "sim/vt_interface.hpp"
+#include "sim/vt_model.hpp"
 
 #include <functional>
 #include <optional>
@@ -46,6 +48,7 @@ class StandIn {
     Registrations registrations_;
     SupplementaryServices services_;
     CallModel calls_;
+    VideoTelephony video_;
     UssdService ussd_;
     Logins logins_;
     ServiceCentre centre_;
@@ -56,6 +59,7 @@ class StandIn {
     SmsInterface sms_interface_;
     SsInterface ss_interface_;
     SettingsInterface settings_interface_;
+    VtInterface vt_interface_;
 };
 
 } // namespace sim

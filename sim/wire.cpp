@@ -13,6 +13,28 @@ bool is_base64_letter(char letter) {
 
 } // namespace
 
+Texts texts_in(GVariant *variant) {
+    const auto content = Variant::adopt(g_variant_get_variant(variant));
+    if (!g_variant_is_of_type(content.get(), G_VARIANT_TYPE_STRING_ARRAY))
+        return std::nullopt;
+    std::vector<std::string> texts;
+    for (gsize i = 0; i < g_variant_n_children(content.get()); ++i) {
+        const auto text = Variant::adopt(g_variant_get_child_value(content.get(), i));
+        texts.emplace_back(g_variant_get_string(text.get(), nullptr));
+    }
+    return texts;
+}
+
+Numbers numbers_in(GVariant *variant) {
+    const auto content = Variant::adopt(g_variant_get_variant(variant));
+    if (!g_variant_is_of_type(content.get(), G_VARIANT_TYPE("ai")))
+        return std::nullopt;
+    gsize count = 0;
+    const auto *first = static_cast<const std::int32_t *>(
+        g_variant_get_fixed_array(content.get(), &count, sizeof(std::int32_t)));
+    return std::vector<std::int32_t>(first, first + count);
+}
+
 std::optional<std::string> decode_base64(const std::string &text) {
     const auto padding = text.size() - std::min(text.size(), text.find_last_not_of('=') + 1);
     const auto letters = std::string_view(text).substr(0, text.size() - padding);

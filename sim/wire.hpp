@@ -20,6 +20,11 @@ namespace sim::wire {
 
 // A variant that should hold an array of texts; nothing when it holds something else.
 using Texts = std::optional<std::vector<std::string>>;
+// The same with 32-bit numbers.
+using Numbers = std::optional<std::vector<std::int32_t>>;
+
+Texts texts_in(GVariant *variant);
+Numbers numbers_in(GVariant *variant);
 
 template <typename T>
 T read(GVariant *member) {
@@ -31,17 +36,11 @@ T read(GVariant *member) {
         return g_variant_get_boolean(member) != FALSE;
     else if constexpr (std::same_as<T, std::string>)
         return g_variant_get_string(member, nullptr);
+    else if constexpr (std::same_as<T, Numbers>)
+        return numbers_in(member);
     else {
         static_assert(std::same_as<T, Texts>);
-        const auto content = Variant::adopt(g_variant_get_variant(member));
-        if (!g_variant_is_of_type(content.get(), G_VARIANT_TYPE_STRING_ARRAY))
-            return std::nullopt;
-        std::vector<std::string> texts;
-        for (gsize i = 0; i < g_variant_n_children(content.get()); ++i) {
-            const auto text = Variant::adopt(g_variant_get_child_value(content.get(), i));
-            texts.emplace_back(g_variant_get_string(text.get(), nullptr));
-        }
-        return texts;
+        return texts_in(member);
     }
 }
 

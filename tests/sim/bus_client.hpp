@@ -20,6 +20,7 @@ constexpr const char *kLogin = "org.kelvo.ims.Login";
 constexpr const char *kRegistration = "org.kelvo.ims.Registration";
 constexpr const char *kSms = "org.kelvo.ims.Sms";
 constexpr const char *kSs = "org.kelvo.ims.Ss";
+constexpr const char *kVt = "org.kelvo.ims.Vt";
 constexpr const char *kServiceName = "org.kelvo.ims";
 
 std::string slot_path(int slot);

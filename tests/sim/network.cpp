@@ -15,11 +15,13 @@ Network::Network()
       timers_(1, [this] { return now_; }),
       registrations_(4, timers_,
                      [this](int slot, const RegistrationEvent &event) { record(slot, event); }),
-      services_(plan_, registrations_),
-      calls_(plan_, timers_, registrations_, services_, 60s,
-             [this](int slot, const CallEvent &event) { record(slot, event); }),
-      ussd_(plan_, timers_, registrations_,
-            [this](int slot, const CallEvent &event) { record(slot, event); }),
+      services_(plan_, registrations_), calls_(plan_, timers_, registrations_, services_, 60s,
+                                               [this](int slot, const CallEvent &event) {
+                                                   record(slot, event);
+                                                   video_.hear(slot, event);
+                                               }),
+      video_(calls_, 4), ussd_(plan_, timers_, registrations_,
+                               [this](int slot, const CallEvent &event) { record(slot, event); }),
       logins_(4, timers_, registrations_,
               [this](int slot, const LoginState &event) { record(slot, event); }),
       centre_(plan_, timers_, registrations_, kEpoch, [this](int slot, const MessageEvent &event) {

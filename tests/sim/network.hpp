@@ -5,6 +5,7 @@
 #include "sim/logins.hpp"
 #include "sim/service_centre.hpp"
 #include "sim/ussd.hpp"
+#include "sim/vt_model.hpp"
 
 #include <chrono>
 #include <gmock/gmock.h>
@@ -71,6 +72,7 @@ class Network : public testing::Test {
     Registrations registrations_;
     SupplementaryServices services_;
     CallModel calls_;
+    VideoTelephony video_;
     UssdService ussd_;
     Logins logins_;
     ServiceCentre centre_;
