@@ -3,6 +3,7 @@
 #include "output.hpp"
 
 #include <gtest/gtest.h>
+#include <nlohmann/json.hpp>
 
 namespace imsctl {
 namespace {

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-// Settings and profiles as far as no service is needed: keys, values, files and wrong usage.
-#include "command_line.hpp"
+// Settings and profiles as far as no service is needed: keys, values and files.
 #include "failure.hpp"
+#include "in_process.hpp"
 #include "settings_file.hpp"
 #include "settings_record.hpp"
 
@@ -9,6 +9,7 @@
 #include <cstdlib>
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
+#include <nlohmann/json.hpp>
 
 namespace imsctl {
 namespace {
@@ -233,84 +234,6 @@ TEST(SettingsFile, NamesAllLinesThatAreWrong) {
     }
 }
 
-struct Outcome {
-    int status;
-    std::string output;
-    std::string error;
-};
-
-std::string take(char *data, std::size_t size) {
-    std::string text(data, size);
-    std::free(data);
-    return text;
-}
-
-Outcome run_words(const std::vector<const char *> &words) {
-    char *out_data = nullptr;
-    char *err_data = nullptr;
-    std::size_t out_size = 0;
-    std::size_t err_size = 0;
-    std::FILE *out = open_memstream(&out_data, &out_size);
-    std::FILE *err = open_memstream(&err_data, &err_size);
-    const int status = run(words, out, err);
-    std::fclose(out);
-    std::fclose(err);
-    return {status, take(out_data, out_size), take(err_data, err_size)};
-}
-
-struct UsageRow {
-    std::vector<const char *> words;
-    const char *message;
-};
-
-void PrintTo(const UsageRow &row, std::ostream *out) {
-    for (const char *word : row.words)
-        *out << word << ' ';
-}
-
-const UsageRow kMistakes[] = {
-    {{"settings"}, "a verb is missing: list-keys, get, set, add, delete, export, import, diff"},
-    {{"profile"}, "a verb is missing: list, list-keys, show, set, add, delete"},
-    {{"network-environment"}, "a verb is missing: get, set"},
-    {{"settings", "get"}, "NAME is required"},
-    {{"settings", "get", "a", "ringing_timr"},
-     "there is none called \"ringing_timr\"; did you mean \"ringing_timer\""},
-    {{"settings", "set", "a"}, "CHANGE is required"},
-    {{"settings", "set", "a", "ringing_timer"}, "\"ringing_timer\" is not KEY=VALUE"},
-    {{"settings", "set", "a", "ringing_timr=1"},
-     "there is no key \"ringing_timr\"; did you mean \"ringing_timer\""},
-    {{"settings", "set", "a", "ringing_timer=x"},
-     "ringing_timer: \"x\" is not a whole number of 32 bits"},
-    {{"settings", "set", "a", "is_rcs_enabled=1"}, "is_rcs_enabled: \"1\" is neither true nor"},
-    {{"settings", "set", "a", "id=1", "id=1"}, "id is given twice"},
-    {{"settings", "set", "a", "name=b"}, "name cannot be set: it says which set is meant"},
-    {{"settings", "set", "a", "audio_port_end=1"}, "audio_port_end cannot be set: the service"},
-    {{"settings", "set", "a", "is_enable_srtp=1"}, "is_enable_srtp cannot be set: the service"},
-    {{"settings", "add", "a", "is_enable_srtp=1"}, "is_enable_srtp cannot be set: the service"},
-    {{"settings", "diff", "a"}, "SECOND is required"},
-    {{"settings", "export", "a"}, "FILE is required"},
-    {{"settings", "import"}, "FILE is required"},
-    {{"profile", "show"}, "PROFILE is required"},
-    {{"profile", "show", "1", "prot"}, "did you mean \"port\""},
-    {{"profile", "set", "1", "id=2"}, "id cannot be set: it says which profile is meant"},
-    {{"profile", "set", "1", "port=99999999999"}, "is not a whole number of 32 bits"},
-    {{"profile", "add", "a", "name=b"}, "name cannot be set: it is given as NAME"},
-    {{"network-environment", "set", "x"}, "TYPE: \"x\" is not a whole number of 32 bits"},
-};
-
-class SettingsMistakes : public ::testing::TestWithParam<UsageRow> {};
-
-TEST_P(SettingsMistakes, ExitWithTwoAndSayWhatToType) {
-    const Outcome outcome = run_words(GetParam().words);
-    EXPECT_EQ(outcome.status, 2);
-    EXPECT_EQ(outcome.output, "");
-    EXPECT_THAT(outcome.error, HasSubstr(GetParam().message));
-    EXPECT_THAT(outcome.error,
-                testing::AnyOf(HasSubstr("\nhelp: imsctl "), HasSubstr("\ntry: imsctl ")));
-}
-
-INSTANTIATE_TEST_SUITE_P(All, SettingsMistakes, ::testing::ValuesIn(kMistakes));
-
 TEST(SettingsVerbs, NameTheLinesOfAFileThatIsNotThere) {
     const Outcome outcome = run_words({"settings", "import", "/nonexistent/a.json", "--json"});
     EXPECT_EQ(outcome.status, 1);
@@ -330,17 +253,6 @@ TEST(SettingsVerbs, ListKeysWithoutAService) {
     EXPECT_EQ(keys[3], Json({{"key", "is_rcs_enabled"}, {"type", "boolean"}, {"writable", true}}));
     EXPECT_EQ(Json::parse(run_words({"profile", "list-keys", "--json"}).output)["keys"].size(),
               51u);
-}
-
-TEST(SettingsCompletion, OffersKeys) {
-    EXPECT_EQ(run_words({"__complete", "settings", "get", "default", "poc_r"}).output,
-              "poc_ringing_timer\n");
-    EXPECT_EQ(run_words({"__complete", "settings", "set", "default", "poc_r"}).output,
-              "poc_ringing_timer=\n");
-    EXPECT_EQ(run_words({"__complete", "profile", "show", "1", "mtu"}).output, "mtuSize\n");
-    EXPECT_EQ(run_words({"__complete", "settings", "set", "default", "audio_port_e"}).output,
-              "audio_port_end_B2BPTT=\naudio_port_end_MCPTT=\n");
-    EXPECT_EQ(run_words({"__complete", "settings", "get", "i"}).output, "");
 }
 
 } // namespace

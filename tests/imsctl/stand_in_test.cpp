@@ -88,7 +88,8 @@ TEST_F(StandIn, RefusesWhatMakesNoSense) {
     const Outcome outcome = run_imsctl(split("call hold 7 --json"));
     EXPECT_EQ(outcome.status, 1);
     EXPECT_EQ(outcome.json()["error"]["kind"], "service");
-    EXPECT_THAT(outcome.error, HasSubstr("the service answered with result 12"));
+    EXPECT_THAT(outcome.error, HasSubstr("the service answered with result 12\n"
+                                         "what ims-sim means by 12: there is no such session;"));
     EXPECT_EQ(run_imsctl(split("--slot 7 call list")).status, 1);
 }
 

@@ -3,6 +3,7 @@
 
 #include "suggestions.hpp"
 
+#include <CLI/CLI.hpp>
 #include <algorithm>
 #include <charconv>
 #include <fmt/format.h>
@@ -71,6 +72,16 @@ void refuse_argument(const std::string &name, const std::string &problem) {
     throw CLI::ValidationError(name, problem);
 }
 
+CLI::Option &Arguments::option(const std::string &names) {
+    return *verb_.get_option(shown_name(names));
+}
+
+void Arguments::complete_with(const std::string &names,
+                              const std::vector<std::string> &completions) {
+    if (!completions.empty())
+        completions_[&option(names)] = completions;
+}
+
 Argument<std::int32_t> Arguments::number(const std::string &names, const std::string &help,
                                          std::int32_t fallback) {
     auto value = std::make_shared<std::int32_t>(fallback);
@@ -81,7 +92,7 @@ Argument<std::int32_t> Arguments::number(const std::string &names, const std::st
 
 Argument<std::int32_t> Arguments::number(const std::string &names, const std::string &help) {
     auto value = number(names, help, 0);
-    verb_.get_option(shown_name(names))->required();
+    option(names).required();
     return value;
 }
 
@@ -104,13 +115,14 @@ Argument<std::int32_t> Arguments::choice(const std::string &names, const std::st
     auto value = std::make_shared<std::int32_t>(fallback);
     add(verb_, names, "VALUE", fmt::format("{}: {}", help, choices(values)),
         [=](const std::string &text) { *value = choice_or_refusal(names, values, text); });
+    complete_with(names, names_of(values));
     return value;
 }
 
 Argument<std::int32_t> Arguments::choice(const std::string &names, const std::string &help,
                                          NamedValues values) {
     auto value = choice(names, help, values, 0);
-    verb_.get_option(shown_name(names))->required();
+    option(names).required();
     return value;
 }
 
@@ -123,12 +135,13 @@ Argument<std::string> Arguments::text_or(const std::string &names, const std::st
 
 Argument<std::string> Arguments::text(const std::string &names, const std::string &help) {
     auto value = text_or(names, help, "");
-    verb_.get_option(shown_name(names))->required();
+    option(names).required();
     return value;
 }
 
-Argument<std::vector<std::string>> Arguments::some_texts(const std::string &names,
-                                                         const std::string &help) {
+Argument<std::vector<std::string>>
+Arguments::some_texts(const std::string &names, const std::string &help,
+                      const std::vector<std::string> &completions) {
     auto values = std::make_shared<std::vector<std::string>>();
     CLI::Option *option = verb_.add_option_function<std::vector<std::string>>(
         names, [values](const std::vector<std::string> &texts) { *values = texts; }, help);
@@ -136,28 +149,31 @@ Argument<std::vector<std::string>> Arguments::some_texts(const std::string &name
     // An option takes one at a time, so that what follows may be something else.
     if (!option->get_positional())
         option->allow_extra_args(false);
+    complete_with(names, completions);
     return values;
 }
 
 Argument<std::vector<std::string>> Arguments::some_names(const std::string &names,
                                                          const std::string &help,
                                                          const std::vector<std::string> &known) {
-    auto values = some_texts(names, help);
-    verb_.get_option(shown_name(names))->check(one_of(known));
+    auto values = some_texts(names, help, known);
+    option(names).check(one_of(known));
     return values;
 }
 
 Argument<std::string> Arguments::name(const std::string &names, const std::string &help,
                                       const std::vector<std::string> &known) {
     auto value = text(names, help);
-    verb_.get_option(shown_name(names))->check(one_of(known));
+    option(names).check(one_of(known));
+    complete_with(names, known);
     return value;
 }
 
 Argument<std::vector<std::string>> Arguments::texts(const std::string &names,
-                                                    const std::string &help) {
-    auto values = some_texts(names, help);
-    verb_.get_option(shown_name(names))->required();
+                                                    const std::string &help,
+                                                    const std::vector<std::string> &completions) {
+    auto values = some_texts(names, help, completions);
+    option(names).required();
     return values;
 }
 

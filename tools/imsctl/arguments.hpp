@@ -5,20 +5,29 @@
 #include "service_values.hpp"
 #include "session_choice.hpp"
 
-#include <CLI/CLI.hpp>
+#include <map>
 #include <memory>
 #include <string>
 #include <vector>
+
+namespace CLI {
+class App;
+class Option;
+} // namespace CLI
 
 namespace imsctl {
 
 template <class Type>
 using Argument = std::shared_ptr<Type>;
 
+// What may be typed for an argument, as far as that is known beforehand: for the shell's
+// completion.
+using Completions = std::map<const CLI::Option *, std::vector<std::string>>;
+
 // Names are as CLI11 has them: "NUMBER" is a place, "--number" an option, "NUMBER,--number" both.
 class Arguments {
   public:
-    explicit Arguments(CLI::App &verb) : verb_(verb) {}
+    Arguments(CLI::App &verb, Completions &completions) : verb_(verb), completions_(completions) {}
 
     // Required.
     Argument<std::int32_t> number(const std::string &names, const std::string &help);
@@ -27,7 +36,8 @@ class Arguments {
     Argument<std::string> text(const std::string &names, const std::string &help);
     Argument<std::string> name(const std::string &names, const std::string &help,
                                const std::vector<std::string> &known);
-    Argument<std::vector<std::string>> texts(const std::string &names, const std::string &help);
+    Argument<std::vector<std::string>> texts(const std::string &names, const std::string &help,
+                                             const std::vector<std::string> &completions = {});
 
     // May be left out.
     Argument<std::int32_t> number(const std::string &names, const std::string &help,
@@ -39,8 +49,8 @@ class Arguments {
                                   NamedValues values, std::int32_t fallback);
     Argument<std::string> text_or(const std::string &names, const std::string &help,
                                   std::string fallback);
-    Argument<std::vector<std::string>> some_texts(const std::string &names,
-                                                  const std::string &help);
+    Argument<std::vector<std::string>> some_texts(const std::string &names, const std::string &help,
+                                                  const std::vector<std::string> &completions = {});
     Argument<std::vector<std::string>> some_names(const std::string &names, const std::string &help,
                                                   const std::vector<std::string> &known);
     Argument<bool> flag(const std::string &names, const std::string &help);
@@ -52,7 +62,11 @@ class Arguments {
     SessionChoice session_option(const Fitting &fitting);
 
   private:
+    CLI::Option &option(const std::string &names);
+    void complete_with(const std::string &names, const std::vector<std::string> &completions);
+
     CLI::App &verb_;
+    Completions &completions_;
 };
 
 // More than 0 and at most kLongestWait.

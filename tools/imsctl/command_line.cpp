@@ -5,9 +5,11 @@
 #include "suggestions.hpp"
 #include "verbs.hpp"
 
+#include <CLI/CLI.hpp>
 #include <algorithm>
 #include <fmt/format.h>
 #include <fmt/ranges.h>
+#include <limits>
 #include <map>
 
 namespace imsctl {
@@ -19,18 +21,26 @@ std::string_view last_word(std::string_view path) {
     return path.substr(path.rfind(' ') + 1); // npos + 1 is 0
 }
 
+bool is_option(std::string_view word) {
+    return word.size() > 1 && word.front() == '-';
+}
+
 // The verbs and options as CLI11 knows them, and what each verb does.
 class CommandLine {
   public:
     CommandLine();
 
     CLI::App &program() { return program_; }
+    const Completions &completions() const { return completions_; }
 
     // After parsing, in words of our own: CLI11 knows no verbs, only "subcommands".
     Settings settings() const;
     std::string path() const { return path_of(parsed_verb()); }
     const Action &action() const { return actions_.at(&parsed_verb()); }
     bool has_unknown_word() const { return program_.remaining_size(true) > 0; }
+    bool has_unknown_option() const {
+        return has_unknown_word() && is_option(program_.remaining(true).front());
+    }
     Failure explain(const CLI::ParseError &error) const;
 
   private:
@@ -41,9 +51,9 @@ class CommandLine {
     std::string unknown_word_message(const CLI::App &verb) const;
     std::string hint(const CLI::App &verb) const;
     static std::string path_of(const CLI::App &verb);
-    static std::vector<std::string> verbs_of(const CLI::App &group);
 
     CLI::App program_{"Uses the device's IMS service from a shell.", "imsctl"};
+    Completions completions_;
     Argument<std::int32_t> slot_;
     Argument<bool> json_;
     Argument<double> timeout_;
@@ -54,8 +64,9 @@ class CommandLine {
 
 CommandLine::CommandLine() {
     const Settings usual;
-    Arguments globals(program_);
-    slot_ = globals.number("--slot", "the subscription slot (default 0)", usual.slot);
+    Arguments globals(program_, completions_);
+    slot_ = globals.number_from(0, std::numeric_limits<std::int32_t>::max(), "--slot",
+                                "the subscription slot (default 0)", usual.slot);
     json_ = globals.flag(std::string(kJsonFlag), "JSON objects instead of text");
     timeout_ = globals.seconds(
         "--timeout", fmt::format("how long to wait for an answer (default {})", usual.timeout),
@@ -99,7 +110,7 @@ CLI::App &CommandLine::group_of(std::string_view path) {
 
 void CommandLine::add_verb(const Verb &verb) {
     CLI::App &app = add_word(group_of(verb.path), last_word(verb.path), verb.summary);
-    Arguments arguments(app);
+    Arguments arguments(app, completions_);
     actions_[&app] = verb.prepare(arguments);
     examples_[&app] = fmt::format("imsctl {}", verb.example);
     app.footer(fmt::format("Example: {}\nAlso: --slot, --json and --timeout; see imsctl --help",
@@ -126,13 +137,6 @@ std::string CommandLine::path_of(const CLI::App &verb) {
     return group.empty() ? verb.get_name() : group + ' ' + verb.get_name();
 }
 
-std::vector<std::string> CommandLine::verbs_of(const CLI::App &group) {
-    std::vector<std::string> names;
-    for (const CLI::App *verb : group.get_subcommands([](const CLI::App *) { return true; }))
-        names.push_back(verb->get_name());
-    return names;
-}
-
 std::string CommandLine::hint(const CLI::App &verb) const {
     const std::string path = path_of(verb);
     const std::string help = fmt::format("help: imsctl {}{}--help", path, path.empty() ? "" : " ");
@@ -142,7 +146,7 @@ std::string CommandLine::hint(const CLI::App &verb) const {
 
 std::string CommandLine::unknown_word_message(const CLI::App &verb) const {
     const std::string word = program_.remaining(true).front();
-    if (word.size() > 1 && word.front() == '-')
+    if (is_option(word))
         return fmt::format("there is no option {}{}", quote(word),
                            did_you_mean(word.substr(0, word.find('=')), option_names(verb)));
     const std::vector<std::string> verbs = verbs_of(verb);
@@ -159,7 +163,9 @@ Failure CommandLine::explain(const CLI::ParseError &error) const {
     const std::vector<std::string> verbs = verbs_of(verb);
     const std::string text = error.what();
     std::string problem = text;
-    if (has_unknown_word())
+    // "--slot call list": the value that is wrong says more than the word that is left over.
+    const bool is_wrong_value = error.get_name() == "ValidationError" && !has_unknown_option();
+    if (has_unknown_word() && !is_wrong_value)
         problem = unknown_word_message(verb);
     else if (!verbs.empty() && error.get_name() == "RequiredError")
         problem = fmt::format("a verb is missing: {}", fmt::join(verbs, ", "));
@@ -179,18 +185,32 @@ bool asks_for_json(std::span<const char *const> arguments) {
     return false;
 }
 
-int run_verb(CommandLine &line, std::FILE *out, std::FILE *err) {
-    const Settings settings = line.settings();
-    Output output(settings.json, out, err);
-    output.set_verb(line.path());
+// Returns the exit status.
+template <class Work>
+int carry_out(const Output &output, const Work &work) {
     try {
-        Invocation invocation(settings, output);
-        line.action()(invocation);
+        work();
         return 0;
+    } catch (const ReaderGone &) {
+        return 1;
     } catch (const Failure &failure) {
         output.failure(failure);
         return failure.exit_status();
     }
+}
+
+int run_verb(CommandLine &line, std::FILE *out, std::FILE *err) {
+    const Settings settings = line.settings();
+    Output output(settings.json, out, err);
+    output.set_verb(line.path());
+    return carry_out(output, [&] {
+        Invocation invocation(settings, output);
+        line.action()(invocation);
+    });
+}
+
+int show(const Output &output, const std::string &text) {
+    return carry_out(output, [&] { output.text(text); });
 }
 
 int refuse(const CommandLine &line, const CLI::ParseError &error, Output output) {
@@ -200,20 +220,22 @@ int refuse(const CommandLine &line, const CLI::ParseError &error, Output output)
     return failure.exit_status();
 }
 
-int complete_words(const CLI::App &program, std::span<const char *const> words, std::FILE *out) {
+std::string completed(CommandLine &line, std::span<const char *const> words) {
     const std::vector<std::string> given(words.begin(), words.end());
-    for (const std::string &candidate : complete(program, given))
-        fmt::print(out, "{}\n", candidate);
-    return 0;
+    std::string text;
+    for (const std::string &candidate : complete(line.program(), line.completions(), given))
+        text += candidate + '\n';
+    return text;
 }
 
 } // namespace
 
 int run(std::span<const char *const> arguments, std::FILE *out, std::FILE *err) {
     CommandLine line;
-    if (!arguments.empty() && std::string_view(arguments.front()) == "__complete")
-        return complete_words(line.program(), arguments.subspan(1), out);
     const bool json = asks_for_json(arguments);
+    const Output plain(false, out, err);
+    if (!arguments.empty() && std::string_view(arguments.front()) == "__complete")
+        return show(plain, completed(line, arguments.subspan(1)));
     try {
         // CLI11 takes them from the back.
         std::vector<std::string> reversed(arguments.rbegin(), arguments.rend());
@@ -221,11 +243,9 @@ int run(std::span<const char *const> arguments, std::FILE *out, std::FILE *err) 
     } catch (const CLI::CallForHelp &help) {
         if (line.has_unknown_word())
             return refuse(line, help, {json, out, err});
-        fmt::print(out, "{}", line.program().help());
-        return 0;
+        return show(plain, line.program().help());
     } catch (const CLI::CallForVersion &version) {
-        fmt::print(out, "{}\n", version.what());
-        return 0;
+        return show(plain, std::string(version.what()) + '\n');
     } catch (const CLI::ParseError &error) {
         return refuse(line, error, {json, out, err});
     }

@@ -6,6 +6,7 @@
 
 #include <array>
 #include <fmt/format.h>
+#include <nlohmann/json.hpp>
 
 namespace imsctl {
 namespace {

@@ -1,10 +1,40 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "failure.hpp"
 
+#include "service_values.hpp"
+
 #include <fmt/format.h>
 #include <ims.h>
+#include <nlohmann/json.hpp>
 
 namespace imsctl {
+namespace {
+
+// What the stand-in service means by its results.
+constexpr NamedValue kResults[] = {
+    {"an argument has no such value", 10},
+    {"the application is not registered", 11},
+    {"there is no such session", 12},
+    {"this is no state for it", 13},
+    {"the line is in use", 14},
+    {"there are too many", 15},
+    {"it is barred", 16},
+    {"it failed otherwise", 17},
+    {"wrong password", 18},
+    {"there is none of this name or id", 19},
+    {"the name or id is taken", 20},
+};
+
+// Another service may mean something else by a number, so that this is not the message itself.
+std::string result_hint(int result) {
+    for (const NamedValue &known : kResults)
+        if (known.value == result)
+            return fmt::format("what ims-sim means by {}: {}; the service's own log says more",
+                               result, known.name);
+    return "the service's own log says why";
+}
+
+} // namespace
 
 std::string_view to_string(FailureKind kind) {
     switch (kind) {
@@ -87,7 +117,7 @@ Failure response_failure(int result) {
         return {FailureKind::kRefused, "refused: this user may not make this request", "", details};
     default:
         return {FailureKind::kService, fmt::format("the service answered with result {}", result),
-                "the service's own log says why", details};
+                result_hint(result), details};
     }
 }
 

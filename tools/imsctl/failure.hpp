@@ -46,6 +46,9 @@ struct Failure : std::runtime_error {
     Fields details;   // for programs: the service's result, the session
 };
 
+// Nobody reads what is written any more: no reason to say anything.
+struct ReaderGone {};
+
 // What ims_init() said about a slot.
 Failure connect_failure(int code, int slot);
 

@@ -5,6 +5,7 @@
 #include <fmt/ranges.h>
 #include <glib.h>
 #include <memory>
+#include <nlohmann/json.hpp>
 
 namespace imsctl {
 namespace {

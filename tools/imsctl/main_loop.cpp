@@ -58,4 +58,19 @@ void StopSignals::read() {
     }
 }
 
+ReaderGuard::ReaderGuard(int descriptor) {
+    if (descriptor < 0)
+        return;
+    source_.reset(g_unix_fd_source_new(descriptor, G_IO_ERR));
+    g_source_set_callback(source_.get(), G_SOURCE_FUNC(on_error), this, nullptr);
+    g_source_attach(source_.get(), nullptr);
+}
+
+ReaderGuard::~ReaderGuard() = default;
+
+gboolean ReaderGuard::on_error(gint, GIOCondition, gpointer self) {
+    static_cast<ReaderGuard *>(self)->gone_ = true;
+    return G_SOURCE_REMOVE;
+}
+
 } // namespace imsctl

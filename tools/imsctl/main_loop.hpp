@@ -63,6 +63,24 @@ class StopSignals {
     bool own_ = false;
 };
 
+// Tells when nobody reads any more what is written into a pipe.
+class ReaderGuard {
+  public:
+    // A negative descriptor stands for a reader that stays.
+    explicit ReaderGuard(int descriptor);
+    ~ReaderGuard();
+    ReaderGuard(const ReaderGuard &) = delete;
+    ReaderGuard &operator=(const ReaderGuard &) = delete;
+
+    bool gone() const { return gone_; }
+
+  private:
+    static gboolean on_error(gint, GIOCondition, gpointer self);
+
+    Source source_;
+    bool gone_ = false;
+};
+
 // Runs the main context until `done` says so; false when the time was over before.
 template <class Done>
 bool run_until(std::optional<Seconds> limit, const Done &done) {

@@ -7,6 +7,7 @@
 #include <fmt/format.h>
 #include <glib.h>
 #include <memory>
+#include <nlohmann/json.hpp>
 
 namespace imsctl {
 namespace {
@@ -88,15 +89,18 @@ void Output::result(const Json &object, const std::string &text) const {
     line(dump(whole));
 }
 
-void Output::line(const std::string &text) const {
-    const std::string whole = text + '\n';
-    if (std::fwrite(whole.data(), 1, whole.size(), out_) != whole.size() || std::fflush(out_) != 0)
-        throw Failure(FailureKind::kOutput,
-                      fmt::format("cannot write the output: {}", std::strerror(errno)));
+void Output::text(const std::string &text) const {
+    if (std::fwrite(text.data(), 1, text.size(), out_) == text.size() && std::fflush(out_) == 0)
+        return;
+    if (errno == EPIPE)
+        throw ReaderGone();
+    throw Failure(FailureKind::kOutput,
+                  fmt::format("cannot write the output: {}", std::strerror(errno)));
 }
 
 void Output::note(const std::string &text) const {
-    fmt::print(err_, "{}\n", text);
+    // Whether anybody takes it does not matter.
+    std::fputs((text + '\n').c_str(), err_);
     std::fflush(err_);
 }
 

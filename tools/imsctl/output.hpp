@@ -48,8 +48,9 @@ class Output {
     void result(const EventRow &row, const Fields &fields) const;
     void result(const Json &object, const std::string &text) const;
 
-    // One line, at once.
-    void line(const std::string &text) const;
+    // At once; and the same with the end of the line. Throw ReaderGone when nobody reads any more.
+    void text(const std::string &text) const;
+    void line(const std::string &text) const { this->text(text + '\n'); }
 
     // For people, beside the result.
     void note(const std::string &text) const;
@@ -58,6 +59,9 @@ class Output {
 
     // What failure() writes.
     LastWords failure_texts(const Failure &failure) const;
+
+    // Where results go, or -1.
+    int descriptor() const { return fileno(out_); }
 
   private:
     bool json_;

@@ -6,6 +6,7 @@
 #include <fmt/format.h>
 #include <fmt/ranges.h>
 #include <limits>
+#include <nlohmann/json.hpp>
 
 namespace imsctl {
 namespace {
@@ -100,7 +101,8 @@ constexpr const char *kSetHint = "try: imsctl profile set 1 port=5061";
 
 Action prepare_set(Arguments &arguments) {
     const auto choice = profile_place(arguments);
-    const auto texts = arguments.texts("CHANGE", "KEY=VALUE, for example port=5061");
+    const auto texts = arguments.texts("CHANGE", "KEY=VALUE, for example port=5061",
+                                       assignment_starts<ProfileRecord>());
     const auto secrets = secrets_flag(arguments);
     return [=](Invocation &run) {
         constexpr FixedKey kFixedKeys[] = {{"id", "it says which profile is meant"}};
@@ -129,7 +131,8 @@ std::int32_t free_id(std::span<const ProfileRecord> profiles) {
 Action prepare_add(Arguments &arguments) {
     const auto name = arguments.text("NAME", "the new profile's name");
     const auto texts =
-        arguments.some_texts("CHANGE", "KEY=VALUE, for example port=5061; id=N chooses its id");
+        arguments.some_texts("CHANGE", "KEY=VALUE, for example port=5061; id=N chooses its id",
+                             assignment_starts<ProfileRecord>());
     const auto from = arguments.text_or(
         "--from", "the profile to take the other values from; empty, false or 0 when left out", "");
     return [=](Invocation &run) {

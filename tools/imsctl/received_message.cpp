@@ -2,6 +2,7 @@
 #include "received_message.hpp"
 
 #include <fmt/format.h>
+#include <nlohmann/json.hpp>
 
 namespace imsctl {
 namespace {

@@ -13,6 +13,13 @@ std::string name_of(NamedValues names, std::int32_t value) {
     return row == names.end() ? fmt::to_string(value) : std::string(row->name);
 }
 
+std::vector<std::string> names_of(NamedValues values) {
+    std::vector<std::string> names;
+    for (const NamedValue &each : values)
+        names.emplace_back(each.name);
+    return names;
+}
+
 std::string choices(NamedValues names) {
     std::string text;
     for (const NamedValue &each : names)

@@ -7,6 +7,7 @@
 #include <span>
 #include <string>
 #include <string_view>
+#include <vector>
 
 namespace imsctl {
 
@@ -61,6 +62,8 @@ inline constexpr NamedValue kBarringTypes[] = {
 
 // The value's name, or its number.
 std::string name_of(NamedValues names, std::int32_t value);
+
+std::vector<std::string> names_of(NamedValues values);
 
 // "voice, video, emergency or a number"
 std::string choices(NamedValues names);

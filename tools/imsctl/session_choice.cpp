@@ -52,7 +52,7 @@ std::string describe(const ims_call_info_s &call) {
 std::int32_t choose_session(const Fitting &fitting, std::span<const ims_call_info_s> calls) {
     if (calls.empty())
         throw Failure(FailureKind::kSession, "there are no calls",
-                      "try: imsctl call dial +15550101");
+                      "try: imsctl call dial +15550101, or another --slot");
     std::vector<const ims_call_info_s *> candidates;
     for (const auto &call : calls)
         if (fitting.test(call))

@@ -7,6 +7,7 @@
 #include <algorithm>
 #include <fmt/format.h>
 #include <fmt/ranges.h>
+#include <nlohmann/json.hpp>
 
 namespace imsctl {
 namespace {

@@ -12,6 +12,7 @@
 #include <fmt/ranges.h>
 #include <iterator>
 #include <memory>
+#include <nlohmann/json.hpp>
 
 namespace imsctl {
 namespace {

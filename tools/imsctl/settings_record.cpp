@@ -74,6 +74,15 @@ std::vector<std::string> key_names() {
 }
 
 template <class Record>
+std::vector<std::string> assignment_starts() {
+    std::vector<std::string> starts;
+    for (const Key<Record> &key : keys_of<Record>())
+        if (!is_read_only(key))
+            starts.push_back(std::string(key.name) + '=');
+    return starts;
+}
+
+template <class Record>
 const Key<Record> *find_key(std::string_view name) {
     const auto keys = keys_of<Record>();
     const auto found = std::find_if(keys.begin(), keys.end(),
@@ -164,6 +173,8 @@ std::vector<std::string_view> fill_gaps(Record &record) {
 // The two kinds of records that there are.
 template std::vector<std::string> key_names<SettingsRecord>();
 template std::vector<std::string> key_names<ProfileRecord>();
+template std::vector<std::string> assignment_starts<SettingsRecord>();
+template std::vector<std::string> assignment_starts<ProfileRecord>();
 template const Key<SettingsRecord> *find_key<SettingsRecord>(std::string_view);
 template const Key<ProfileRecord> *find_key<ProfileRecord>(std::string_view);
 template std::string unknown_key<SettingsRecord>(std::string_view);

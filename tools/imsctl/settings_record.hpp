@@ -44,6 +44,10 @@ using Assignments = std::vector<Assignment<Record>>;
 template <class Record>
 std::vector<std::string> key_names();
 
+// "KEY=" for each key that can be written.
+template <class Record>
+std::vector<std::string> assignment_starts();
+
 // nullptr for an unknown one.
 template <class Record>
 const Key<Record> *find_key(std::string_view name);

@@ -7,6 +7,7 @@
 #include <fmt/ranges.h>
 #include <glib.h>
 #include <limits>
+#include <nlohmann/json.hpp>
 
 namespace imsctl {
 namespace {

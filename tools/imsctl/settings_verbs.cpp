@@ -4,6 +4,7 @@
 #include "settings_exchange.hpp"
 
 #include <fmt/format.h>
+#include <nlohmann/json.hpp>
 
 namespace imsctl {
 namespace {
@@ -45,7 +46,8 @@ constexpr const char *kSetHint = "try: imsctl settings set default ringing_timer
 
 Action prepare_set(Arguments &arguments) {
     const auto name = arguments.text("NAME", "the set");
-    const auto texts = arguments.texts("CHANGE", "KEY=VALUE, for example ringing_timer=180");
+    const auto texts = arguments.texts("CHANGE", "KEY=VALUE, for example ringing_timer=180",
+                                       assignment_starts<SettingsRecord>());
     const auto secrets = secrets_flag(arguments);
     return [=](Invocation &run) {
         const auto assignments = assignments_or_refusal(*texts, kSetHint);
@@ -68,7 +70,8 @@ std::vector<std::string_view> lost_in_copy(const SettingsRecord &set) {
 
 Action prepare_add(Arguments &arguments) {
     const auto name = arguments.text("NAME", "the new set");
-    const auto texts = arguments.some_texts("CHANGE", "KEY=VALUE, for example rcs_version=2");
+    const auto texts = arguments.some_texts("CHANGE", "KEY=VALUE, for example rcs_version=2",
+                                            assignment_starts<SettingsRecord>());
     const auto from = arguments.text_or(
         "--from", "the set to take the other values from; empty, false or 0 when left out", "");
     return [=](Invocation &run) {

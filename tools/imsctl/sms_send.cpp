@@ -7,6 +7,7 @@
 
 #include <fmt/format.h>
 #include <limits>
+#include <nlohmann/json.hpp>
 
 namespace imsctl {
 namespace {
@@ -26,7 +27,7 @@ struct SendArguments {
     Argument<bool> wait;
 };
 
-constexpr const char *kHint = "try: imsctl sms send +15550101 \"See you at 8\"";
+constexpr const char *kHint = "try: imsctl sms send +15550101 'See you at 8'";
 
 [[noreturn]] void refuse(std::string_view name, std::string_view problem) {
     throw Failure(FailureKind::kUsage, fmt::format("{}: {}", name, problem), kHint);

@@ -61,7 +61,7 @@ Action prepare_report(Arguments &arguments) {
 
 constexpr Verb kVerbs[] = {
     {"sms send", "send a text as one short message or as many as it takes",
-     "sms send +15550101 hello --report", prepare_sms_send},
+     "sms send +15550101 'See you at 8' --report", prepare_sms_send},
     {"sms watch", "show short messages as they arrive, and answer them with delivery reports",
      "sms watch --json", prepare_sms_watch},
     {"sms report", "answer a short message with a delivery report by hand",

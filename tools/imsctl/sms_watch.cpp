@@ -8,6 +8,7 @@
 #include "watching.hpp"
 
 #include <fmt/format.h>
+#include <nlohmann/json.hpp>
 
 namespace imsctl {
 namespace {

@@ -4,6 +4,7 @@
 #include <algorithm>
 #include <fmt/format.h>
 #include <memory>
+#include <nlohmann/json.hpp>
 
 namespace imsctl {
 namespace {

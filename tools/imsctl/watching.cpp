@@ -3,6 +3,7 @@
 
 #include <fmt/format.h>
 #include <limits>
+#include <nlohmann/json.hpp>
 
 namespace imsctl {
 namespace {
@@ -23,7 +24,7 @@ WatchLimits watch_limits(Arguments &arguments) {
 
 Watch::Watch(Invocation &run, const WatchLimits &limits, const std::vector<const EventRow *> &rows,
              std::string_view what)
-    : run_(run), limits_(limits) {
+    : run_(run), limits_(limits), reader_(run.output().descriptor()) {
     for (const EventRow *row : rows)
         run.client().watch(*row);
     run.client().settle(kSettleTime);
@@ -38,10 +39,12 @@ void Watch::until_end(const std::function<bool(const Event &)> &show) {
             if (counts && *limits_.count > 0 && --left == 0)
                 return true;
         }
-        return signals_.arrived();
+        return signals_.arrived() || reader_.gone();
     };
     const Seconds limit = *limits_.seconds;
     run_until(limit > 0 ? std::optional(limit) : std::nullopt, finished);
+    if (reader_.gone())
+        throw ReaderGone();
     check_bus();
 }
 

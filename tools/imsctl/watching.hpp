@@ -26,7 +26,8 @@ class Watch {
     Watch(Invocation &run, const WatchLimits &limits, const std::vector<const EventRow *> &rows,
           std::string_view what);
 
-    // Until SIGINT, SIGTERM or a limit. `show` tells whether it showed something that counts.
+    // Until SIGINT, SIGTERM or a limit, or until nobody reads any more. `show` tells whether it
+    // showed something that counts.
     void until_end(const std::function<bool(const Event &)> &show);
 
     // Waits for what is still under way: not for long when somebody wants the end.
@@ -38,6 +39,7 @@ class Watch {
     Invocation &run_;
     WatchLimits limits_;
     StopSignals signals_;
+    ReaderGuard reader_;
 };
 
 // The event itself, in the form that was asked for.
