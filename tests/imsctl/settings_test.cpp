@@ -199,7 +199,7 @@ const FileRow kWrongFiles[] = {
     {"{\n\n\"ringing_timr\": 1}",
      "f: line 3: there is no key \"ringing_timr\"; did you mean \"ringing_timer\"?"},
     {"{\n\"id\": 1,\n\"ringing_timer\": \"1\"\n}",
-     "f: line 3: ringing_timer: \\\"1\\\" is not a whole number of 32 bits"},
+     "f: line 3: ringing_timer: \"1\" is not a whole number of 32 bits"},
     {"{\"id\": 4294967296}", "f: line 1: id: 4294967296 is not a whole number of 32 bits"},
     {"{\n\"is_rcs_enabled\": 1}", "f: line 2: is_rcs_enabled: 1 is neither true nor false"},
     {"{\n\"http_password\": 1234}",

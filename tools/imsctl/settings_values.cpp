@@ -43,7 +43,9 @@ WrongValue no_flag(const std::string &shown) {
 
 // A list or an object is named, not repeated.
 std::string shown_json(const Json &json) {
-    return json.is_structured() ? fmt::format("an {}", json.type_name()) : escape(dump(json));
+    if (json.is_structured())
+        return fmt::format("an {}", json.type_name());
+    return json.is_string() ? quote(json.get<std::string>()) : dump(json);
 }
 
 } // namespace
