@@ -3,12 +3,17 @@
 
 #include <chrono>
 #include <fmt/format.h>
+#include <string>
 #include <string_view>
 #include <utility>
 
 namespace sim {
 
 enum class LogLevel { kQuiet, kNormal, kVerbose };
+
+// What applications send may hold line ends, commands to a terminal and megabytes. This is one line
+// of a bearable length, whatever it was.
+std::string printable(std::string_view text);
 
 // Lines on standard error, each with the seconds since the start.
 class Log {

@@ -69,7 +69,8 @@ std::string read_line(int fd) {
 std::string content(int fd) {
     std::array<char, 2048> buffer{};
     const auto length = pread(fd, buffer.data(), buffer.size(), 0);
-    return {buffer.data(), length > 0 ? static_cast<std::size_t>(length) : 0};
+    const std::string_view text(buffer.data(), length > 0 ? static_cast<std::size_t>(length) : 0);
+    return std::string(text.substr(0, text.find_last_not_of('\n') + 1));
 }
 
 } // namespace
