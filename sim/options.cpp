@@ -6,12 +6,14 @@
 #include <CLI/CLI.hpp>
 #include <algorithm>
 #include <charconv>
+#include <limits>
 
 namespace sim {
 
 namespace {
 
 constexpr int kMaxSlots = 64;
+constexpr double kFastest = 1e9; // a nanosecond a second, which is at once
 
 struct Raw {
     int slots = 2;
@@ -19,6 +21,18 @@ struct Raw {
     bool verbose = false;
     bool quiet = false;
 };
+
+// CLI::Range takes "nan", which is neither too small nor too large.
+CLI::Validator number_between(double least, double most) {
+    return {[=](const std::string &text) {
+                double number = std::numeric_limits<double>::quiet_NaN();
+                const bool fits =
+                    CLI::detail::lexical_cast(text, number) && number >= least && number <= most;
+                return fits ? std::string()
+                            : fmt::format("\"{}\" is no number from {} to {}", text, least, most);
+            },
+            {}};
+}
 
 std::string parties_help() {
     std::string text = "Numbers with a meaning (any other number answers):\n";
@@ -40,14 +54,14 @@ void add_common(CLI::App &command, Options &options, Raw &raw) {
     command
         .add_option("--speed", options.speed,
                     "How fast the network is: 2 is twice as fast, 0 does everything at once")
-        ->check(CLI::NonNegativeNumber)
+        ->check(number_between(0, kFastest))
         ->type_name("FACTOR")
         ->capture_default_str();
     auto *ring_time = command.add_option_function<double>(
         "--ring-time",
         [&options](double seconds) { options.ring_time = std::chrono::duration<double>(seconds); },
         "Seconds that a slot rings before the network gives up (not scaled) [60]");
-    ring_time->check(CLI::Range(0.001, 86400.0))->type_name("SECONDS");
+    ring_time->check(number_between(0.001, 86400))->type_name("SECONDS");
     command
         .add_option("--state", options.state,
                     "Directory where settings and profiles survive the end of the stand-in")
