@@ -77,7 +77,8 @@ std::span<const Party> parties() {
 }
 
 bool is_emergency(std::string_view number) {
-    return std::ranges::find(kEmergencyNumbers, number) != kEmergencyNumbers.end();
+    return std::ranges::any_of(kEmergencyNumbers,
+                               [&](std::string_view one) { return same_number(one, number); });
 }
 
 Answer<std::string> parse_number(std::string_view text) {

@@ -89,7 +89,8 @@ Status UssdService::reply(int slot, int coding_scheme, const std::string &text) 
     if (text.empty())
         return refuse(Result::kInvalidArgument, "the reply is empty");
     here.coding_scheme = coding_scheme;
-    here.path += "/" + text;
+    // One choice a reply: what holds the separator is none.
+    here.path = text.find('/') == std::string::npos ? here.path + "/" + text : std::string();
     await_network(slot);
     return Done{};
 }

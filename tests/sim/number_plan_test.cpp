@@ -48,6 +48,13 @@ TEST(Numbers, AreTheSameWithAndWithoutThePlus) {
     EXPECT_FALSE(same_number("+15550101", "+15550102"));
 }
 
+TEST(Numbers, OfTheEmergencyServiceAreNoOthers) {
+    for (const auto *number : {"112", "911", "+112"})
+        EXPECT_TRUE(is_emergency(number)) << number;
+    for (const auto *number : {"1120", "11", "+1112", ""})
+        EXPECT_FALSE(is_emergency(number)) << number;
+}
+
 TEST(NumberPlanTest, FindsTheSlotOfANumber) {
     const NumberPlan plan({"+15550100", "+447700900123"});
     EXPECT_EQ(plan.slot_of("447700900123"), 1);

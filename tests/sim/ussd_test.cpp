@@ -55,6 +55,15 @@ TEST_F(Ussd, UnknownCodesAndChoicesEndTheDialogue) {
     expect_accepted(request("*100#"));
 }
 
+TEST_F(Ussd, AReplyIsOneChoiceHoweverItIsWritten) {
+    expect_accepted(request("*101#"));
+    advance(1s);
+    forget_events();
+    expect_accepted(reply("3/1"));
+    advance(1s);
+    EXPECT_THAT(take(0), ElementsAre(indication(4, 1, "Unknown code or choice")));
+}
+
 TEST_F(Ussd, TheNetworkReleasesADialogueThatNobodyContinues) {
     expect_accepted(request("*101#"));
     advance(1s);
