@@ -5,6 +5,7 @@
 
 #include "sim/result.hpp"
 
+#include <limits>
 #include <ostream>
 
 namespace sim::test {
@@ -113,22 +114,33 @@ constexpr Row kRows[] = {
     {kVt, "SetMediaBuffer", "(is)", "(i)", kNotNamed},
 };
 
-// Zeros, empty texts and empty variants, with this application in its place.
-Variant empty_arguments(const Row &row, int application) {
+struct Values {
+    gint32 number;
+    std::string text;
+    const char *variant; // as text
+};
+
+// The same value for every member of a type, with this application in its place.
+Variant arguments_of(const Row &row, int application, const Values &values) {
     std::vector<GVariant *> members;
     for (const char *letter = row.in + 1; *letter != ')'; ++letter) {
         const bool names = (row.application == kFirst && members.empty()) ||
                            (row.application == kLast && letter[1] == ')');
         if (*letter == 'i')
-            members.push_back(g_variant_new_int32(names ? application : 0));
+            members.push_back(g_variant_new_int32(names ? application : values.number));
         else if (*letter == 's')
-            members.push_back(g_variant_new_string(""));
+            members.push_back(g_variant_new_string(values.text.c_str()));
         else if (*letter == 'y')
-            members.push_back(g_variant_new_byte(0));
+            members.push_back(g_variant_new_byte(static_cast<guint8>(values.number)));
         else
-            members.push_back(g_variant_new_variant(g_variant_new_strv(nullptr, 0)));
+            members.push_back(g_variant_new_variant(
+                g_variant_parse(nullptr, values.variant, nullptr, nullptr, nullptr)));
     }
     return Variant(g_variant_new_tuple(members.data(), members.size()));
+}
+
+Variant empty_arguments(const Row &row, int application) {
+    return arguments_of(row, application, {0, "", "@as []"});
 }
 
 gint32 result_of(const Reply &reply, const Row &row) {
@@ -173,6 +185,24 @@ TEST_P(BusMethods, TakesNoOtherSignature) {
     const auto reply = ask(Variant(g_variant_new_tuple(members.data(), members.size())));
     EXPECT_EQ(reply.error, "org.freedesktop.DBus.Error.InvalidArgs");
     EXPECT_THAT(reply.text, HasSubstr(fmt::format("{} takes \"{}\"", row.method, row.in)));
+}
+
+TEST_P(BusMethods, AnswersInItsTypeWhateverTheValues) {
+    const std::string many(100000, '1');
+    const Values values[] = {
+        {std::numeric_limits<gint32>::min(), many, "['+15550101', '', '112']"},
+        {std::numeric_limits<gint32>::max(), "\n\x1b[2J{}%s%n", "<<<1>>>"},
+        {-1, "AAAAAAAA", "@a{sv} {}"},
+        {1, "+15550101", "['1']"},
+        {1, "sip:1@\xe2\x82\xac", "@ai []"},
+        {2, "====", "''"},
+    };
+    const int application = client_->register_application(0);
+    for (const auto &value : values) {
+        const auto reply = ask(arguments_of(GetParam(), application, value));
+        EXPECT_EQ(reply.type, GetParam().out) << reply.error << ": " << reply.text;
+    }
+    EXPECT_EQ(client_->call(0, "org.freedesktop.DBus.Peer", "Ping").body, "()");
 }
 
 INSTANTIATE_TEST_SUITE_P(All, BusMethods, testing::ValuesIn(kRows),
