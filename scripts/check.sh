@@ -26,3 +26,6 @@ git ls-files 'src/*.cpp' 'platform/*.cpp' |
 
 step "Installation"
 scripts/check-install.sh
+
+step "The library of a device"
+scripts/check-device.sh
