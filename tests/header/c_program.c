@@ -48,6 +48,9 @@ int main(void) {
               IMS_ERROR_INVALID_PARAMETER);
     wrong |= check("ims_call_make_call", ims_call_make_call(NULL, &call, on_response, NULL),
                    IMS_ERROR_INVALID_PARAMETER);
+    wrong |= check("ims_xdm_modify_group_subject",
+                   ims_xdm_modify_group_subject(NULL, "sip:g", "", on_response, NULL),
+                   IMS_ERROR_INVALID_PARAMETER);
     wrong |= check("ims_call_get_call_list_info", ims_call_get_call_list_info(NULL, &calls),
                    IMS_ERROR_INVALID_PARAMETER);
     ims_call_list_info_clear(&calls);

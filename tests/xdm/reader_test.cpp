@@ -63,8 +63,7 @@ TEST_F(Reader, TakesAValueOfATypeThatNoKeyHasForAMissingOne) {
     const Change none = [](auto...) {};
     for_each_entry([&](std::size_t number) {
         const Image without = image_with(number, none);
-        for (const char *other : {"<uint16 7>", "<7>", "<(1, 2)>", "<@av []>", "<@a{ss} {}>",
-                                  "<<<byte 1>>>", "<['x']>", "<@aa{ss} []>", "<[<{'a': <1>}>]>"}) {
+        for (const char *other : {"<uint16 7>", "<(1, 2)>", "<@av []>", "<<<byte 1>>>"}) {
             SCOPED_TRACE(other);
             EXPECT_EQ(image_with(number, value(other)), without);
         }
@@ -75,10 +74,8 @@ TEST_F(Reader, TakesAValueOfATypeThatNoKeyHasForAMissingOne) {
 // sanitizers' business.
 TEST_F(Reader, SurvivesEveryValueUnderEveryKey) {
     for_each_entry([&](std::size_t number) {
-        for (const char *other :
-             {"<'text'>", "<true>", "<int64 0>", "<int64 -1>", "<int64 1>", "<int64 4>",
-              "<int64 9223372036854775807>", "<@a{sv} {}>", "<@aa{sv} []>", "<[@a{sv} {}, {}, {}]>",
-              "<<<<<<<<<<<<<<<<<'deep'>>>>>>>>>>>>>>>>>"}) {
+        for (const char *other : {"<'text'>", "<true>", "<int64 -1>", "<int64 9223372036854775807>",
+                                  "<@a{sv} {}>", "<@aa{sv} []>", "<[@a{sv} {}, {}, {}]>"}) {
             SCOPED_TRACE(other);
             EXPECT_FALSE(image_with(number, value(other)).bytes.empty());
         }
@@ -100,8 +97,7 @@ TEST_F(Reader, KeepsTheLaterOfTwoValuesAndTheFittingOne) {
                                       value(last)(dictionary, key, content);
                               });
         };
-        for (const char *other :
-             {"<'text'>", "<true>", "<int64 9>", "<@a{sv} {}>", "<[@a{sv} {}]>", "<uint16 1>"}) {
+        for (const char *other : {"<'text'>", "<true>", "<int64 9>", "<@a{sv} {}>"}) {
             SCOPED_TRACE(other);
             EXPECT_EQ(twice(other, nullptr), whole);
         }
@@ -112,7 +108,7 @@ TEST_F(Reader, KeepsTheLaterOfTwoValuesAndTheFittingOne) {
 TEST_F(Reader, PeelsAnyNumberOfVariants) {
     const Image whole = image_of(document_.get());
     for_each_entry([&](std::size_t number) {
-        for (int layers = 1; layers <= 8; ++layers) {
+        for (const int layers : {1, 2, 8}) {
             EXPECT_EQ(image_with(number,
                                  [layers](GVariantBuilder *dictionary, const char *key,
                                           GVariant *content) {
