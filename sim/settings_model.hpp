@@ -1,17 +1,13 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
+#include "sim/foreign_value.hpp"
 #include "sim/result.hpp"
 #include "sim/settings_fields.hpp"
 
 #include <functional>
 
 namespace sim {
-
-// A value of a type that no key has.
-struct ForeignValue {
-    std::string type;
-};
 
 // An entry of a dictionary as it came.
 struct OfferedEntry {

@@ -2,11 +2,12 @@
 #pragma once
 
 #include "sim/settings_model.hpp"
+#include "sim/store.hpp"
 
 namespace sim {
 
-// Gives the model what this directory holds and keeps its changes there, one file a slot. What
-// went wrong, or nothing. A file that cannot be used is left as it is.
-std::optional<std::string> keep_settings(const std::string &directory, SettingsModel &model);
+// Gives the model what is kept there and keeps its changes there, one file a slot. What went wrong,
+// or nothing. A file that cannot be used is left as it is.
+std::optional<std::string> keep_settings(const std::shared_ptr<Store> &store, SettingsModel &model);
 
 } // namespace sim

@@ -49,7 +49,10 @@ StandIn::StandIn(const Options &options, const Log &log, MainLoop &loop)
 }
 
 std::optional<std::string> StandIn::restore(const std::string &state_directory) {
-    return state_directory.empty() ? std::nullopt : keep_settings(state_directory, settings_);
+    if (state_directory.empty())
+        return std::nullopt;
+    const auto store = Store::open(state_directory);
+    return store ? keep_settings(*store, settings_) : std::optional(store.refusal().reason);
 }
 
 std::optional<std::string> StandIn::start(const std::string &address,

@@ -96,7 +96,7 @@ TEST_F(SettingsStore, EachSlotFindsItsOwnAgain) {
     SlotSettings expected[2];
     {
         SettingsModel model(2);
-        ASSERT_EQ(keep_settings(directory_.path(), model), std::nullopt);
+        ASSERT_EQ(keep_settings(open(), model), std::nullopt);
         EXPECT_TRUE(fs::is_empty(directory_.path()));
         EXPECT_TRUE(model.set_network_environment(0, 2));
         EXPECT_TRUE(model.delete_profile(0, 2));
@@ -105,7 +105,7 @@ TEST_F(SettingsStore, EachSlotFindsItsOwnAgain) {
         expected[1] = model.of(1);
     }
     SettingsModel model(3);
-    ASSERT_EQ(keep_settings(directory_.path(), model), std::nullopt);
+    ASSERT_EQ(keep_settings(open(), model), std::nullopt);
     EXPECT_EQ(model.of(0), expected[0]);
     EXPECT_EQ(model.of(1), expected[1]);
     EXPECT_EQ(model.of(2), SlotSettings::shipped());
@@ -116,7 +116,7 @@ TEST_F(SettingsStore, ADamagedFileIsNamedAndKept) {
     const auto half = to_json(SlotSettings::shipped()).substr(0, 1000);
     put_content(path, half);
     SettingsModel model(2);
-    const auto error = keep_settings(directory_.path(), model);
+    const auto error = keep_settings(open(), model);
     ASSERT_TRUE(error);
     EXPECT_THAT(*error, HasSubstr(path));
     EXPECT_EQ(content_of(path), half);
