@@ -35,6 +35,12 @@ Numbers numbers_in(GVariant *variant) {
     return std::vector<std::int32_t>(first, first + count);
 }
 
+Variant peeled(Variant value) {
+    while (g_variant_is_of_type(value.get(), G_VARIANT_TYPE_VARIANT))
+        value = Variant::adopt(g_variant_get_variant(value.get()));
+    return value;
+}
+
 std::optional<std::string> decode_base64(const std::string &text) {
     const auto padding = text.size() - std::min(text.size(), text.find_last_not_of('=') + 1);
     const auto letters = std::string_view(text).substr(0, text.size() - padding);

@@ -26,6 +26,9 @@ using Numbers = std::optional<std::vector<std::int32_t>>;
 Texts texts_in(GVariant *variant);
 Numbers numbers_in(GVariant *variant);
 
+// What a variant holds, in however many further variants.
+Variant peeled(Variant value);
+
 template <typename T>
 T read(GVariant *member) {
     if constexpr (std::same_as<T, std::int32_t>)
@@ -38,6 +41,8 @@ T read(GVariant *member) {
         return g_variant_get_string(member, nullptr);
     else if constexpr (std::same_as<T, Numbers>)
         return numbers_in(member);
+    else if constexpr (std::same_as<T, Variant>)
+        return Variant(member);
     else {
         static_assert(std::same_as<T, Texts>);
         return texts_in(member);

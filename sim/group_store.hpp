@@ -1,0 +1,13 @@
+// SPDX-License-Identifier: Apache-2.0
+#pragma once
+
+#include "sim/group_model.hpp"
+#include "sim/store.hpp"
+
+namespace sim {
+
+// Gives the model the groups that are kept there and keeps its changes there, all in one file. What
+// went wrong, or nothing. A file that cannot be used is left as it is.
+std::optional<std::string> keep_groups(const std::shared_ptr<Store> &store, GroupModel &model);
+
+} // namespace sim
