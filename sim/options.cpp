@@ -64,7 +64,7 @@ void add_common(CLI::App &command, Options &options, Raw &raw) {
     ring_time->check(number_between(0.001, 86400))->type_name("SECONDS");
     command
         .add_option("--state", options.state,
-                    "Directory where settings and profiles survive the end of the stand-in")
+                    "Directory where settings, profiles and groups survive the end of the stand-in")
         ->check(CLI::Validator(
             [](const std::string &path) {
                 return std::string(path.empty() ? "the directory has no name" : "");

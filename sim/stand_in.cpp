@@ -2,6 +2,7 @@
 #include "sim/stand_in.hpp"
 
 #include "sim/call_signals.hpp"
+#include "sim/group_store.hpp"
 #include "sim/settings_store.hpp"
 
 #include <ctime>
@@ -37,7 +38,10 @@ StandIn::StandIn(const Options &options, const Log &log, MainLoop &loop)
       centre_(plan_, timers_, registrations_, std::time(nullptr), sink_of<SmsInterface>(service_)),
       settings_(plan_.slots()), registration_interface_(applications_, registrations_),
       login_interface_(logins_), call_interface_(calls_, ussd_), sms_interface_(centre_),
-      ss_interface_(services_), settings_interface_(settings_), vt_interface_(video_) {
+      ss_interface_(services_), settings_interface_(settings_), vt_interface_(video_),
+      // No push-to-talk session runs yet.
+      xdm_interface_(groups_, plan_, registrations_,
+                     [](int) { return std::vector<ParticipantInfo>(); }) {
     loop.drive(timers_);
     service_.add(registration_interface_.describe());
     service_.add(login_interface_.describe());
@@ -46,13 +50,18 @@ StandIn::StandIn(const Options &options, const Log &log, MainLoop &loop)
     service_.add(ss_interface_.describe());
     service_.add(settings_interface_.describe());
     service_.add(vt_interface_.describe());
+    service_.add(xdm_interface_.describe());
 }
 
 std::optional<std::string> StandIn::restore(const std::string &state_directory) {
     if (state_directory.empty())
         return std::nullopt;
     const auto store = Store::open(state_directory);
-    return store ? keep_settings(*store, settings_) : std::optional(store.refusal().reason);
+    if (!store)
+        return store.refusal().reason;
+    if (auto error = keep_settings(*store, settings_))
+        return error;
+    return keep_groups(*store, groups_);
 }
 
 std::optional<std::string> StandIn::start(const std::string &address,

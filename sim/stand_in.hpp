@@ -19,6 +19,7 @@
 #include "sim/ussd.hpp"
 #include "sim/vt_interface.hpp"
 #include "sim/vt_model.hpp"
+#include "sim/xdm_interface.hpp"
 
 #include <functional>
 #include <optional>
@@ -53,6 +54,7 @@ class StandIn {
     Logins logins_;
     ServiceCentre centre_;
     SettingsModel settings_;
+    GroupModel groups_;
     RegistrationInterface registration_interface_;
     LoginInterface login_interface_;
     CallInterface call_interface_;
@@ -60,6 +62,7 @@ class StandIn {
     SsInterface ss_interface_;
     SettingsInterface settings_interface_;
     VtInterface vt_interface_;
+    XdmInterface xdm_interface_;
 };
 
 } // namespace sim

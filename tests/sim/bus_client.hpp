@@ -21,6 +21,7 @@ constexpr const char *kRegistration = "org.kelvo.ims.Registration";
 constexpr const char *kSms = "org.kelvo.ims.Sms";
 constexpr const char *kSs = "org.kelvo.ims.Ss";
 constexpr const char *kVt = "org.kelvo.ims.Vt";
+constexpr const char *kXdm = "org.kelvo.ims.Xdm";
 constexpr const char *kServiceName = "org.kelvo.ims";
 
 std::string slot_path(int slot);

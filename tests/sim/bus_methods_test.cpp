@@ -112,6 +112,30 @@ constexpr Row kRows[] = {
     {kVt, "SetWindowId", "(iiiiii)", "(i)", kNotNamed},
     {kVt, "SetCameraBuffer", "(is)", "(i)", kNotNamed},
     {kVt, "SetMediaBuffer", "(is)", "(i)", kNotNamed},
+    {kXdm, "XdmCreateGroup", "(a{sv})", "(i)", kNotNamed},
+    {kXdm, "XdmDeleteGroup", "(s)", "(i)", kNotNamed},
+    {kXdm, "XdmFetchSharedGroup", "(ss)", "(ia{sv})", kNotNamed},
+    {kXdm, "XdmFetchAllSharedGroups", "(s)", "(ia{sv})", kNotNamed},
+    {kXdm, "XdmFetchAllParticipantGroups", "(s)", "(ia{sv})", kNotNamed},
+    {kXdm, "XdmFetchSharedUserProfile", "(s)", "(ia{sv})", kNotNamed},
+    {kXdm, "XdmAddUserToSharedGroup", "(sa{sv})", "(i)", kNotNamed},
+    {kXdm, "XdmRemoveUserFromSharedGroup", "(sa{sv})", "(i)", kNotNamed},
+    {kXdm, "XdmAddGroupRule", "(saa{sv})", "(i)", kNotNamed},
+    {kXdm, "XdmModifyGroupRule", "(saa{sv})", "(i)", kNotNamed},
+    {kXdm, "XdmDeleteGroupRule", "(ss)", "(i)", kNotNamed},
+    {kXdm, "XdmModifyGroupDisplayName", "(ss)", "(i)", kNotNamed},
+    {kXdm, "XdmModifyGroupSubject", "(ss)", "(i)", kNotNamed},
+    {kXdm, "XdmModifyGroupSearchable", "(sb)", "(i)", kNotNamed},
+    {kXdm, "XdmModifyGroupInviteMembers", "(sb)", "(i)", kNotNamed},
+    {kXdm, "XdmModifyGroupMaxParticipants", "(si)", "(i)", kNotNamed},
+    {kXdm, "XdmModifyGroupAutoAdvertisements", "(sb)", "(i)", kNotNamed},
+    {kXdm, "XdmModifyGroupQoe", "(si)", "(i)", kNotNamed},
+    {kXdm, "XdmModifyGroupSessionActivePolicy", "(sa{sv})", "(i)", kNotNamed},
+    {kXdm, "XdmModifyGroupSessionServiceList", "(sa{sv})", "(i)", kNotNamed},
+    {kXdm, "XdmModifyGroupAgeRestriction", "(saa{sv})", "(i)", kNotNamed},
+    {kXdm, "XdmModifyGroupAttributes", "(sssbbiba{sv})", "(i)", kNotNamed},
+    {kXdm, "XdmModifyDefaultGroup", "(ssb)", "(i)", kNotNamed},
+    {kXdm, "XdmGetParticipantInfo", "(s)", "(ia{sv})", kNotNamed},
 };
 
 struct Values {
@@ -120,21 +144,30 @@ struct Values {
     const char *variant; // as text
 };
 
+GVariant *value_of(const GVariantType *type, const Values &values) {
+    if (g_variant_type_equal(type, G_VARIANT_TYPE_INT32))
+        return g_variant_new_int32(values.number);
+    if (g_variant_type_equal(type, G_VARIANT_TYPE_BYTE))
+        return g_variant_new_byte(static_cast<guint8>(values.number));
+    if (g_variant_type_equal(type, G_VARIANT_TYPE_STRING))
+        return g_variant_new_string(values.text.c_str());
+    if (g_variant_type_equal(type, G_VARIANT_TYPE_VARIANT))
+        return g_variant_new_variant(
+            g_variant_parse(nullptr, values.variant, nullptr, nullptr, nullptr));
+    // No data at all stands for the default of any other type.
+    return g_variant_new_from_data(type, nullptr, 0, FALSE, nullptr, nullptr);
+}
+
 // The same value for every member of a type, with this application in its place.
 Variant arguments_of(const Row &row, int application, const Values &values) {
     std::vector<GVariant *> members;
-    for (const char *letter = row.in + 1; *letter != ')'; ++letter) {
-        const bool names = (row.application == kFirst && members.empty()) ||
-                           (row.application == kLast && letter[1] == ')');
-        if (*letter == 'i')
-            members.push_back(g_variant_new_int32(names ? application : values.number));
-        else if (*letter == 's')
-            members.push_back(g_variant_new_string(values.text.c_str()));
-        else if (*letter == 'y')
-            members.push_back(g_variant_new_byte(static_cast<guint8>(values.number)));
-        else
-            members.push_back(g_variant_new_variant(
-                g_variant_parse(nullptr, values.variant, nullptr, nullptr, nullptr)));
+    const auto *type = g_variant_type_first(G_VARIANT_TYPE(row.in));
+    while (type) {
+        const auto *next = g_variant_type_next(type);
+        const bool names =
+            (row.application == kFirst && members.empty()) || (row.application == kLast && !next);
+        members.push_back(names ? g_variant_new_int32(application) : value_of(type, values));
+        type = next;
     }
     return Variant(g_variant_new_tuple(members.data(), members.size()));
 }

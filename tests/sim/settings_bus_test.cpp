@@ -1,7 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // org.kelvo.ims.Settings of the real program.
-#include "bus_client.hpp"
-#include "settings_directory.hpp"
+#include "served_with_state.hpp"
 #include "settings_samples.hpp"
 
 #include <csignal>
@@ -38,31 +37,13 @@ std::string expected_text(const SettingsFields &fields, const SettingsRecord &re
     return Variant::adopt(g_variant_get_child_value(tuple.get(), 0)).print();
 }
 
-struct InDirectory {
-    TemporaryDirectory directory_;
-};
-
-class SettingsBus : InDirectory, public Served {
+class SettingsBus : public ServedWithState {
   protected:
-    SettingsBus() : Served({"--speed", "0", "--state", directory_.path()}) {}
-
-    using InDirectory::directory_;
-
     Reply call(const char *method, const std::string &arguments = "()", int slot = 0) {
         return client_->call(slot, kSettings, method, arguments);
     }
     Reply send(const char *method, const OfferedEntries &entries, int slot = 0) {
         return client_->call(slot_path(slot), kSettings, method, Variant(written(entries)));
-    }
-    std::vector<std::string> arguments() const {
-        return {"serve", "--address", bus_.address(), "--state", directory_.path()};
-    }
-    void restart(int signal) {
-        program_->signal(signal);
-        program_->wait();
-        client_->wait_until_gone(kServiceName);
-        program_ = std::make_unique<Program>(arguments());
-        client_->wait_until_owned(kServiceName);
     }
 };
 

@@ -1,8 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-// Killed at any moment, the program loses no change that it has acknowledged.
-#include "bus_client.hpp"
-#include "settings_directory.hpp"
-#include "sim/settings_json.hpp"
+#include "kill_rounds.hpp"
 
 #include <csignal>
 #include <poll.h>
@@ -12,8 +9,6 @@
 namespace sim::test {
 namespace {
 
-constexpr const char *kSettings = "org.kelvo.ims.Settings";
-constexpr int kRounds = 50;
 constexpr int kUpdatesARound = 12;
 constexpr int kPatienceMilliseconds = 20000;
 
@@ -50,28 +45,25 @@ class DirectoryWatch {
     int descriptor_;
 };
 
-// Updates under way: each brings a number twice, in two types.
+// Requests under way.
 struct Stream {
+    const KeptNumber &kept;
     int last_sent = 0;
     int last_acknowledged = 0;
     int open = 0;
 
-    void send(Client &client, int number) {
+    void send(Client &client) {
         struct Context {
             Stream *stream;
             int number;
         };
-        const auto arguments =
-            fmt::format("({{'name': <'default'>, 'session_expire': <{}>, 'self_port': <'{}'>}},)",
-                        number, number);
-        last_sent = number;
+        const int number = ++last_sent;
+        const auto arguments = kept.arguments(number);
         ++open;
         g_dbus_connection_call(
-            client.connection(), kServiceName, slot_path(0).c_str(), kSettings,
-            "UpdateGlobalSettings",
-            g_variant_parse(G_VARIANT_TYPE("(a{sv})"), arguments.c_str(), nullptr, nullptr,
-                            nullptr),
-            nullptr, G_DBUS_CALL_FLAGS_NO_AUTO_START, kPatienceMilliseconds, nullptr,
+            client.connection(), kServiceName, slot_path(0).c_str(), kept.interface, kept.method,
+            g_variant_parse(nullptr, arguments.c_str(), nullptr, nullptr, nullptr), nullptr,
+            G_DBUS_CALL_FLAGS_NO_AUTO_START, kPatienceMilliseconds, nullptr,
             [](GObject *connection, GAsyncResult *result, gpointer data) {
                 const std::unique_ptr<Context> context(static_cast<Context *>(data));
                 const auto reply = Variant::adopt(
@@ -92,44 +84,32 @@ struct Stream {
     }
 };
 
-class SettingsKill : public testing::Test {
-  protected:
-    void SetUp() override {
-        ASSERT_EQ(bus_.start(), std::nullopt);
-        client_ = std::make_unique<Client>(bus_.address());
-    }
+} // namespace
 
-    std::unique_ptr<Program> start() {
-        auto program = std::make_unique<Program>(std::vector<std::string>{
-            "serve", "--quiet", "--address", bus_.address(), "--state", directory_.path()});
-        client_->wait_until_owned(kServiceName);
-        return program;
-    }
+void KillTest::SetUp() {
+    ASSERT_EQ(bus_.start(), std::nullopt);
+    client_ = std::make_unique<Client>(bus_.address());
+}
 
-    // The number that the set holds; both its forms must be of one update.
-    int stored() {
-        const auto reply = client_->call(0, kSettings, "GetGlobalSettings", "('default',)");
-        const auto set = Variant::adopt(g_variant_get_child_value(reply.value.get(), 1));
-        gint32 number = -1;
-        const char *text = "";
-        EXPECT_TRUE(g_variant_lookup(set.get(), "session_expire", "i", &number));
-        EXPECT_TRUE(g_variant_lookup(set.get(), "self_port", "&s", &text));
-        EXPECT_EQ(std::to_string(number), text);
-        return number;
-    }
+std::unique_ptr<Program> KillTest::start() {
+    auto program = std::make_unique<Program>(std::vector<std::string>{
+        "serve", "--quiet", "--address", bus_.address(), "--state", directory_.path()});
+    client_->wait_until_owned(kServiceName);
+    client_->register_application(0);
+    return program;
+}
 
-    TemporaryDirectory directory_;
-    PrivateBus bus_;
-    std::unique_ptr<Client> client_;
-};
+int KillTest::stored(const KeptNumber &kept) {
+    const auto reply = client_->call(0, kept.interface, kept.query, kept.query_arguments);
+    return kept.read(Variant::adopt(g_variant_get_child_value(reply.value.get(), 1)).get());
+}
 
-TEST_F(SettingsKill, NoAcknowledgedChangeIsLost) {
+void KillTest::kill_while_keeping(const KeptNumber &kept, int rounds) {
     constexpr std::uint32_t kMoments[] = {IN_CREATE, IN_MODIFY, IN_CLOSE_WRITE, IN_MOVED_TO};
-    const auto path = directory_.file("sub0.json");
-    Stream stream;
+    Stream stream{kept};
     {
         const auto program = start();
-        stream.send(*client_, 1);
+        stream.send(*client_);
         stream.settle();
         ASSERT_EQ(stream.last_acknowledged, 1);
         program->signal(SIGKILL);
@@ -137,30 +117,28 @@ TEST_F(SettingsKill, NoAcknowledgedChangeIsLost) {
         client_->wait_until_gone(kServiceName);
     }
     int acknowledged_rounds = 0;
-    for (int round = 0; round < kRounds && !HasFailure(); ++round) {
+    for (int round = 0; round < rounds && !HasFailure(); ++round) {
         const auto program = start();
-        const int number = stored();
+        const int number = stored(kept);
         EXPECT_GE(number, stream.last_acknowledged) << "in round " << round;
         EXPECT_LE(number, stream.last_sent) << "in round " << round;
         const int acknowledged_before = stream.last_acknowledged;
         DirectoryWatch watch(directory_.path());
         for (int i = 0; i < kUpdatesARound; ++i)
-            stream.send(*client_, stream.last_sent + 1);
+            stream.send(*client_);
         watch.wait_for(kMoments[round % std::size(kMoments)], 1 + round % 5);
         program->signal(SIGKILL);
         EXPECT_EQ(program->wait(), 128 + SIGKILL);
         stream.settle();
         client_->wait_until_gone(kServiceName);
         acknowledged_rounds += stream.last_acknowledged > acknowledged_before ? 1 : 0;
-        const auto kept = from_json(content_of(path));
-        EXPECT_TRUE(kept) << kept.refusal().reason;
+        EXPECT_EQ(kept.problem(content_of(directory_.file(kept.file))), "");
     }
     // Otherwise the rounds have shown nothing.
-    EXPECT_GT(acknowledged_rounds, kRounds / 4);
+    EXPECT_GT(acknowledged_rounds, rounds / 4);
     const auto program = start();
-    EXPECT_GE(stored(), stream.last_acknowledged);
-    EXPECT_LE(stored(), stream.last_sent);
+    EXPECT_GE(stored(kept), stream.last_acknowledged);
+    EXPECT_LE(stored(kept), stream.last_sent);
 }
 
-} // namespace
 } // namespace sim::test
