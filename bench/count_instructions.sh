@@ -1,24 +1,26 @@
 #!/usr/bin/env bash
 # SPDX-License-Identifier: Apache-2.0
-# Usage: count_instructions.sh [BUILD-DIRECTORY]
-# Instructions per round trip, through the library and with GDBus alone: in the caller's thread, and
-# in the whole process. Each is a slope between a short and a long run, so that what a program does
-# once does not count, and the median of several such slopes. REPETITIONS: how many (default 5).
+# Usage: count_instructions.sh [BUILD-DIRECTORY [KIND...]]
+# Instructions through the library and with GDBus alone: of a request, a query and a signal, and of
+# a full settings record that is read and written in process, and got and updated over the bus. In
+# the caller's thread, and in the whole process. Each is a slope between a short and a long run, so
+# that what a program does once does not count, and the median of several such slopes. REPETITIONS:
+# how many (default 5). Kinds, for those only: request, query, signal, read, write, get, update.
 set -euo pipefail
 
 build=${1:-$(dirname "$0")/../build/release}
-trips=$build/bin/frame_trips
+kinds=" ${*:2} "
 repetitions=${REPETITIONS:-5}
 scratch=$(mktemp -d)
 trap 'rm -rf "$scratch"' EXIT
 
-# Prints the instructions of the first thread, and of all threads, for a number of trips. Threads
-# take turns fairly, as they would on two processors.
+# count PROGRAM KIND SIDE TRIPS prints the instructions of the first thread, and of all threads.
+# Threads take turns fairly, as they would on two processors.
 count() {
     local profile=$scratch/profile
     rm -f "$profile"*
     if ! valgrind --quiet --tool=callgrind --separate-threads=yes --fair-sched=yes \
-        --callgrind-out-file="$profile" "$trips" "$@" >"$scratch/log" 2>&1; then
+        --callgrind-out-file="$profile" "$build/bin/$1" "${@:2}" >"$scratch/log" 2>&1; then
         cat "$scratch/log" >&2
         return 1
     fi
@@ -26,12 +28,12 @@ count() {
         "$profile"-*
 }
 
-# slope KIND SIDE SHORT LONG OPERATIONS-PER-TRIP
+# slope PROGRAM KIND SIDE SHORT LONG OPERATIONS-PER-TRIP
 slope() {
     local short long
-    short=$(count "$1" "$2" "$3")
-    long=$(count "$1" "$2" "$4")
-    awk -v short="$short" -v long="$long" -v operations=$((($4 - $3) * $5)) 'BEGIN {
+    short=$(count "$1" "$2" "$3" "$4")
+    long=$(count "$1" "$2" "$3" "$5")
+    awk -v short="$short" -v long="$long" -v operations=$((($5 - $4) * $6)) 'BEGIN {
         split(short, a); split(long, b)
         printf "%d %d\n", (b[1] - a[1]) / operations, (b[2] - a[2]) / operations
     }'
@@ -41,25 +43,50 @@ median() {
     sort -n | awk '{ value[NR] = $1 } END { print value[int((NR + 1) / 2)] }'
 }
 
-# compare KIND SHORT LONG OPERATIONS-PER-TRIP
+# compare PROGRAM KIND SHORT LONG OPERATIONS-PER-TRIP prints the figures of all sides, the ratio
+# being the library's to the next.
 compare() {
     local side
+    [[ $kinds == *[a-z]* && $kinds != *" $2 "* ]] && return
     for ((repetition = 0; repetition < repetitions; ++repetition)); do
-        for side in library bare; do
-            slope "$1" "$side" "$2" "$3" "$4" >>"$scratch/$1.$side"
+        for side in "${sides[@]}"; do
+            slope "$1" "$2" "$side" "$3" "$4" "$5" >>"$scratch/$2.$side"
         done
     done
-    for side in library bare; do
-        cut -d' ' -f1 "$scratch/$1.$side" | median
-        cut -d' ' -f2 "$scratch/$1.$side" | median
-    done | paste -sd' ' | awk -v kind="$1" '{
-        printf "%-9s%9d%9d%8.3f %9d%9d%8.3f\n", kind, $1, $3, $1 / $3, $2, $4, $2 / $4
-    }'
+    printf '%-9s' "$2"
+    for thread in 1 2; do
+        for side in "${sides[@]}"; do
+            cut -d' ' -f$thread "$scratch/$2.$side" | median
+        done | paste -sd' ' | awk '{
+            for (i = 1; i <= NF; ++i) printf "%9d", $i
+            printf "%8.3f  ", $1 / $2
+        }'
+    done
+    printf '\n'
 }
 
-printf '%-9s%26s %26s\n' '' "caller's thread" 'whole process'
-printf '%-9s%9s%9s%8s %9s%9s%8s\n' '' library bare ratio library bare ratio
-compare request 200 1200 1
-compare query 200 1200 1
+heading() {
+    local width=$((9 * ${#sides[@]} + 8))
+    printf "%-9s%${width}s  %${width}s\n" '' "caller's thread" 'whole process'
+    printf '%-9s' ''
+    for _ in 1 2; do
+        printf '%9s' "${sides[@]}"
+        printf '%8s  ' ratio
+    done
+    printf '\n'
+}
+
+sides=(library bare)
+heading
+compare frame_trips request 200 1200 1
+compare frame_trips query 200 1200 1
 # A trip is a burst of 500 signals.
-compare signal 2 6 500
+compare frame_trips signal 2 6 500
+
+sides=(library naive floor)
+printf '\n'
+heading
+compare settings_trips read 20 120 1
+compare settings_trips write 20 120 1
+compare settings_trips get 20 120 1
+compare settings_trips update 20 120 1

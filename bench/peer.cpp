@@ -52,6 +52,12 @@ class Peer {
             reply(call, call_list());
         else if (method == "RegisterApplication")
             reply(call, g_variant_new("(ii)", 0, 1));
+        else if (method == bench::kGetSettingsMethod)
+            reply(call, g_variant_new("(i@a{sv})", 0, settings_.get()));
+        else if (method == bench::kUpdateSettingsMethod)
+            take_settings(call, body);
+        else if (method == bench::kServeMethod)
+            settings_.reset(g_variant_get_child_value(body, 0));
         else if (method == bench::kEmitMethod)
             emit(body);
         else if (method == bench::kHoldMethod)
@@ -84,6 +90,13 @@ class Peer {
         reply(call, g_variant_new("(ii)", 0, session));
     }
 
+    void take_settings(GDBusMessage *call, GVariant *body) {
+        const Variant settings{g_variant_get_child_value(body, 0)};
+        const bool is_full =
+            g_variant_n_children(settings.get()) == g_variant_n_children(settings_.get());
+        reply(call, g_variant_new("(i)", is_full ? 0 : 1));
+    }
+
     void emit(GVariant *body) {
         guint32 count = 0;
         std::int32_t first = 0;
@@ -110,6 +123,7 @@ class Peer {
 
     GDBusConnection *connection_;
     std::vector<Message> held_;
+    Variant settings_;
     bool is_holding_ = false;
 };
 

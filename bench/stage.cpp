@@ -58,7 +58,7 @@ std::string write_configuration(const std::string &directory) {
 
 std::string start_of_bus(const Child &bus) {
     setenv("DBUS_SYSTEM_BUS_ADDRESS", bus.first_line().c_str(), 1);
-    return std::filesystem::read_symlink("/proc/self/exe").parent_path() / "frame_bench_peer";
+    return std::filesystem::read_symlink("/proc/self/exe").parent_path() / "bench_peer";
 }
 
 } // namespace
@@ -94,7 +94,7 @@ Child::~Child() {
 }
 
 TemporaryDirectory::TemporaryDirectory()
-    : path_{std::filesystem::temp_directory_path() / "frame-bench-XXXXXX"} {
+    : path_{std::filesystem::temp_directory_path() / "kelvo-bench-XXXXXX"} {
     if (!mkdtemp(path_.data()))
         fail("mkdtemp");
 }

@@ -1,19 +1,22 @@
 #!/usr/bin/env bash
 # SPDX-License-Identifier: Apache-2.0
-# Usage: dependencies.sh build|check
-# Sees to it that the Debian packages are there that building and testing ("build") or the stricter
-# checks ("check") need: installs them with the rights to, says what is missing without.
+# Usage: dependencies.sh build|bench|check
+# Sees to it that the Debian packages are there that building and testing ("build"), the benchmarks
+# ("bench") or the stricter checks ("check") need: installs them with the rights to, says what is
+# missing without.
 set -euo pipefail
 
 build=(cmake dbus-daemon g++ libcli11-dev libfmt-dev libglib2.0-dev libgtest-dev libgmock-dev
     ninja-build nlohmann-json3-dev pkg-config)
-check=(clang clang-format clang-tidy libbenchmark-dev libclang-rt-14-dev shellcheck)
+bench=(libbenchmark-dev valgrind)
+check=(clang clang-format clang-tidy libclang-rt-14-dev shellcheck)
 
 case "${1:-}" in
 build) wanted=("${build[@]}") ;;
-check) wanted=("${build[@]}" "${check[@]}") ;;
+bench) wanted=("${build[@]}" "${bench[@]}") ;;
+check) wanted=("${build[@]}" "${bench[@]}" "${check[@]}") ;;
 *)
-    echo "usage: $0 build|check" >&2
+    echo "usage: $0 build|bench|check" >&2
     exit 2
     ;;
 esac
