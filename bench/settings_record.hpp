@@ -3,6 +3,7 @@
 // as the sides without the library make them.
 #pragma once
 
+#include "field_at.hpp"
 #include "settings_fields.hpp"
 
 namespace bench {
@@ -13,12 +14,12 @@ using ims::FieldRow;
 
 template <typename T>
 T &at(Settings &settings, const FieldRow &row) {
-    return *reinterpret_cast<T *>(reinterpret_cast<char *>(&settings) + row.offset);
+    return ims::at<T>(&settings, row.offset);
 }
 
 template <typename T>
 const T &at(const Settings &settings, const FieldRow &row) {
-    return *reinterpret_cast<const T *>(reinterpret_cast<const char *>(&settings) + row.offset);
+    return ims::at<T>(&settings, row.offset);
 }
 
 // The timers go to the service as numbers.

@@ -49,29 +49,53 @@ bool read_field(GVariant *value, const FieldRow &row, void *record) noexcept {
     return false;
 }
 
-// A floating value, or NULL for a text that cannot cross the bus.
-GVariant *text_value(const char *text) noexcept {
-    return text != nullptr && g_utf8_validate(text, -1, nullptr) ? g_variant_new_string(text)
-                                                                 : nullptr;
-}
+// The values of a record as they are written, and what they take up together.
+class FieldWriter {
+  public:
+    explicit FieldWriter(const void *record) noexcept : record_{record} {}
 
-GVariant *number_value(std::int32_t number, WriteAs as) noexcept {
+    // A floating value, or NULL for a text that cannot cross the bus.
+    GVariant *write(const FieldRow &row, WriteAs as) noexcept;
+    gsize size() const noexcept { return size_; }
+
+  private:
+    // What an entry takes up beside its key and its text: the number in a text's place, types,
+    // padding, ends.
+    static constexpr gsize kEntryOverhead = 48;
+
+    GVariant *write_number(std::int32_t number, WriteAs as) const noexcept;
+    GVariant *write_text(const char *text) noexcept;
+
+    const void *record_;
+    gsize size_ = 0;
+};
+
+GVariant *FieldWriter::write_number(std::int32_t number, WriteAs as) const noexcept {
     if (as == WriteAs::kDecimalText)
         return g_variant_new_take_string(g_strdup_printf("%d", number));
     return g_variant_new_int32(number);
 }
 
-GVariant *field_value(const FieldRow &row, WriteAs as, const void *record) noexcept {
+GVariant *FieldWriter::write_text(const char *text) noexcept {
+    if (text == nullptr)
+        return nullptr;
+    const gsize length = std::strlen(text);
+    size_ += length;
+    return g_utf8_validate_len(text, length, nullptr) ? g_variant_new_string(text) : nullptr;
+}
+
+GVariant *FieldWriter::write(const FieldRow &row, WriteAs as) noexcept {
+    size_ += row.key_length + kEntryOverhead;
     switch (row.kind) {
     case FieldKind::kInt32:
-        return number_value(at<std::int32_t>(record, row.offset), as);
+        return write_number(at<std::int32_t>(record_, row.offset), as);
     case FieldKind::kBoolean:
-        return g_variant_new_boolean(at<bool>(record, row.offset));
+        return g_variant_new_boolean(at<bool>(record_, row.offset));
     case FieldKind::kOwnText:
     case FieldKind::kLentText:
-        return text_value(at<const char *>(record, row.offset));
+        return write_text(at<const char *>(record_, row.offset));
     case FieldKind::kTextAndNumber:
-        return number_value(at<std::int32_t>(record, row.offset + kNumberOffset), as);
+        return write_number(at<std::int32_t>(record_, row.offset + kNumberOffset), as);
     }
     return nullptr;
 }
@@ -128,20 +152,22 @@ DictionaryKeys::DictionaryKeys(FieldsView fields) noexcept {
         keys_.push_back(owned(g_variant_new_string(row.key.data())));
 }
 
-Variant write_dictionary(FieldsView fields, const DictionaryKeys &keys,
-                         std::span<const WriteStep> plan, const void *record) noexcept {
+Sized write_dictionary(FieldsView fields, const DictionaryKeys &keys,
+                       std::span<const WriteStep> plan, const void *record) noexcept {
+    FieldWriter writer{record};
     std::vector<GVariant *> entries;
     entries.reserve(plan.size());
     for (const WriteStep &step : plan) {
-        GVariant *value = field_value(fields.rows[step.row], step.as, record);
+        GVariant *value = writer.write(fields.rows[step.row], step.as);
         if (value == nullptr) {
             for (GVariant *entry : entries)
                 g_variant_unref(entry);
-            return nullptr;
+            return {};
         }
         entries.push_back(g_variant_new_dict_entry(keys[step.row], g_variant_new_variant(value)));
     }
-    return owned(g_variant_new_array(G_VARIANT_TYPE("{sv}"), entries.data(), entries.size()));
+    return {owned(g_variant_new_array(G_VARIANT_TYPE("{sv}"), entries.data(), entries.size())),
+            writer.size()};
 }
 
 std::uint32_t checked_count(const char *subject, std::uint32_t count, GVariant *list,

@@ -9,8 +9,8 @@
 // loaded.
 #pragma once
 
-#include "glib.hpp"
 #include "log.hpp"
+#include "wire.hpp"
 
 #include <algorithm>
 #include <array>
@@ -210,8 +210,8 @@ class DictionaryKeys {
 };
 
 // Writes a record as "a{sv}"; nothing when one of its texts is NULL or not valid UTF-8.
-Variant write_dictionary(FieldsView fields, const DictionaryKeys &keys,
-                         std::span<const WriteStep> plan, const void *record) noexcept;
+Sized write_dictionary(FieldsView fields, const DictionaryKeys &keys,
+                       std::span<const WriteStep> plan, const void *record) noexcept;
 
 // The number of entries that a list of dictionaries really has, when the service's count says the
 // same: at most the capacity. Otherwise none; both are worth a line.

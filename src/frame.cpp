@@ -17,10 +17,6 @@ bool is_cancelled(const Error &error) noexcept {
     return error && g_error_matches(error.get(), G_IO_ERROR, G_IO_ERROR_CANCELLED) != FALSE;
 }
 
-bool can_be_sent(const Variant &tuple) noexcept {
-    return tuple && g_variant_get_size(tuple.get()) <= kMaxTupleSize;
-}
-
 // A method without parameters has no body at all, where an empty tuple would still be one.
 GVariant *body(const Variant &tuple) noexcept {
     return g_variant_n_children(tuple.get()) == 0 ? nullptr : tuple.get();
@@ -56,7 +52,7 @@ int invalid_parameter(Site site) noexcept {
 
 int request(ims_h handle, const char *interface, const char *method, const Variant &tuple,
             Response response, Site site) noexcept {
-    if (!can_be_sent(tuple))
+    if (!tuple)
         return invalid_parameter(site);
     auto context = std::make_unique<ims_request_ctx_s>(
         ims_request_ctx_s{handle, response.callback, response.user_data});
@@ -68,7 +64,7 @@ int request(ims_h handle, const char *interface, const char *method, const Varia
 
 int query(ims_h handle, const char *interface, const char *method, const Variant &tuple,
           Variant &reply, int timeout_ms, Site site) noexcept {
-    if (!can_be_sent(tuple))
+    if (!tuple)
         return invalid_parameter(site);
     GError *failure = nullptr;
     Variant answer{g_dbus_connection_call_sync(

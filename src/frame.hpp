@@ -25,10 +25,6 @@ namespace ims {
 inline constexpr const char *kServiceName = "org.kelvo.ims";
 inline constexpr int kRequestTimeoutMs = 60000;
 
-// The bus cuts off a process that sends a message larger than it takes: 32 MiB on a system bus that
-// is not configured otherwise.
-inline constexpr gsize kMaxTupleSize = gsize{16} << 20;
-
 // 0 when the device has the IMS feature and none of the pointers is NULL, in this order.
 int admit(std::initializer_list<const void *> required = {}, Site site = here()) noexcept;
 
@@ -42,8 +38,7 @@ struct Response {
     void *user_data;
 };
 
-// Queues one method call. A tuple that could not be packed, or is too
-// large for the bus, is an invalid parameter; an empty one is
+// Queues one method call. A tuple that could not be packed is an invalid parameter; an empty one is
 // sent as no parameters.
 int request(ims_h handle, const char *interface, const char *method, const Variant &tuple,
             Response response, Site site = here()) noexcept;

@@ -12,13 +12,13 @@ namespace {
 constexpr const char *kInterface = "org.kelvo.ims.Settings";
 
 // Made at the first use and kept: no work when the library is loaded.
-Variant settings_dictionary(std::span<const WriteStep> plan,
-                            const ims_global_settings_s *settings) noexcept {
+Sized settings_dictionary(std::span<const WriteStep> plan,
+                          const ims_global_settings_s *settings) noexcept {
     static const DictionaryKeys keys{kSettingsFields};
     return write_dictionary(kSettingsFields, keys, plan, settings);
 }
 
-Variant profile_dictionary(const ims_profile_s *profile) noexcept {
+Sized profile_dictionary(const ims_profile_s *profile) noexcept {
     static const DictionaryKeys keys{kProfileFields};
     return write_dictionary(kProfileFields, keys, kProfileWrite, profile);
 }

@@ -2,6 +2,7 @@
 #include "wire.hpp"
 
 #include <algorithm>
+#include <cstring>
 
 namespace ims {
 
@@ -22,6 +23,14 @@ Variant to_variant(const char *text, const char *) noexcept {
 
 Variant to_variant(const Variant &value, const char *type) noexcept {
     return Variant{has_type(value.get(), type) ? g_variant_ref(value.get()) : nullptr};
+}
+
+gsize size_of(const char *text) noexcept {
+    return text != nullptr ? std::strlen(text) + 1 : 1;
+}
+
+gsize size_of(const Variant &value) noexcept {
+    return value ? g_variant_get_size(value.get()) : 0;
 }
 
 void from_variant(GVariant *child, std::int32_t &value) noexcept {

@@ -6,6 +6,7 @@
 #include "glib.hpp"
 #include "signature.hpp"
 
+#include <concepts>
 #include <cstdint>
 #include <span>
 #include <string_view>
@@ -16,6 +17,16 @@ namespace ims {
 
 // A member that unpack() reads past.
 struct Skipped {};
+
+// The bus cuts off a process that sends a message larger than it takes: 32 MiB on a system bus that
+// is not configured otherwise.
+inline constexpr gsize kMaxTupleSize = gsize{16} << 20;
+
+// A container whose maker knows how large it is at most. GLib would add it up entry by entry.
+struct Sized {
+    Variant value;
+    gsize size = 0;
+};
 
 // What is inside a value, however many variants are around it.
 Variant peeled(GVariant *value) noexcept;
@@ -39,14 +50,14 @@ consteval bool carries(std::string_view type) {
         return is_one_of<T, std::int64_t>;
     if (type == "s")
         return is_one_of<T, const char *, char *>;
-    return is_one_of<T, Variant>;
+    return is_one_of<T, Variant, Sized>;
 }
 
 // What unpack() can store a member of this type in. A "b" may go to a 32-bit boolean, a "v" with an
 // "ai" in it to an array of fixed size.
 template <typename T>
 consteval bool receives(std::string_view type) {
-    return carries<T>(type) || is_one_of<T, Skipped> ||
+    return (carries<T>(type) && !is_one_of<T, Sized>) || is_one_of<T, Skipped> ||
            (type == "b" && is_one_of<T, std::int32_t>) ||
            (type == "v" && is_one_of<std::remove_extent_t<T>, std::int32_t> && std::is_array_v<T>);
 }
@@ -69,6 +80,20 @@ inline Variant to_variant(std::int64_t value, const char *) noexcept {
 }
 Variant to_variant(const char *text, const char *type) noexcept;
 Variant to_variant(const Variant &value, const char *type) noexcept;
+inline Variant to_variant(const Sized &container, const char *type) noexcept {
+    return to_variant(container.value, type);
+}
+
+// What a value takes up in a message.
+template <std::integral T>
+gsize size_of(T) noexcept {
+    return sizeof(T);
+}
+gsize size_of(const char *text) noexcept;
+gsize size_of(const Variant &value) noexcept;
+inline gsize size_of(const Sized &container) noexcept {
+    return container.size;
+}
 
 inline void from_variant(GVariant *child, bool &value) noexcept {
     value = g_variant_get_boolean(child) != FALSE;
@@ -120,6 +145,8 @@ template <Literal Format, typename... Arguments, std::size_t... Index>
 Variant pack(std::index_sequence<Index...>, const Arguments &...arguments) noexcept {
     static_assert((carries<Arguments>(Signature<Format>::member(Index)) && ...),
                   "an argument's type is not the signature's");
+    if ((size_of(arguments) + ... + gsize{0}) > kMaxTupleSize)
+        return nullptr;
     const std::array<Variant, sizeof...(Arguments)> children{
         to_variant(arguments, member_type<Format, Index>.data())...};
     return tuple_of(children);
@@ -177,8 +204,8 @@ auto members(Record &record) noexcept {
 
 } // namespace wire
 
-// A tuple, or nothing when one of the texts is not valid UTF-8. A NULL text is sent as an empty
-// one.
+// A tuple, or nothing when it cannot cross the bus: one of the texts is not valid UTF-8, or all
+// together is too large. A NULL text is sent as an empty one.
 template <Literal Format, typename... Arguments>
 Variant pack(const Arguments &...arguments) noexcept {
     static_assert(Signature<Format>::size() == sizeof...(Arguments),

@@ -5,6 +5,7 @@
 #include "sample.hpp"
 
 #include <set>
+#include <string>
 
 namespace test {
 namespace {
@@ -44,6 +45,17 @@ Variation wrong_text(const char *field) {
             }};
 }
 
+// Three texts that the bus would take one by one, but not together.
+template <auto Function, const auto &Record, auto... Fields>
+Variation large_texts() {
+    return {"too large together", [](ims_h handle, ims_response_cb callback, void *user_data) {
+                auto record = Record;
+                std::string text(std::size_t{6} << 20, 'x');
+                ((record.*Fields = text.data()), ...);
+                return Function(handle, &record, callback, user_data);
+            }};
+}
+
 template <auto Function>
 RequestRow settings_row(const char *function, const char *method, Direction direction) {
     const std::string sent = written_settings(direction);
@@ -55,6 +67,7 @@ RequestRow settings_row(const char *function, const char *method, Direction dire
         no_text<Function, kSet, &S::conference_factory_uri>("conference_factory_uri"),
         wrong_text<Function, kSet, &S::network>("network"),
         wrong_text<Function, kSet, &S::audio_codec_val_MCPTT>("audio_codec_val_MCPTT"),
+        large_texts<Function, kSet, &S::name, &S::network, &S::conference_factory_uri>(),
     };
     return row;
 }
@@ -68,6 +81,8 @@ RequestRow profile_row(const char *function, const char *method) {
         no_text<Function, kProfile, &ims_profile_s::name>("name"),
         no_text<Function, kProfile, &ims_profile_s::opmode>("opmode"),
         wrong_text<Function, kProfile, &ims_profile_s::password>("password"),
+        large_texts<Function, kProfile, &ims_profile_s::name, &ims_profile_s::impi,
+                    &ims_profile_s::opmode>(),
     };
     return row;
 }
