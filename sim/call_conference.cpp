@@ -28,7 +28,7 @@ std::optional<Refusal> not_a_media_type(CallType type) {
 } // namespace
 
 Answer<Session *> CallModel::conference_of(int slot, int id) {
-    const auto session = existing(slot, id);
+    auto session = existing(slot, id);
     if (session && !(*session)->is_conference)
         return refuse(Result::kWrongState, "call {} is not a conference", id);
     return session;
