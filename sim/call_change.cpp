@@ -12,7 +12,7 @@ constexpr std::chrono::seconds kSlotDecides{15};
 } // namespace
 
 Answer<Session *> CallModel::changeable(int slot, int id) {
-    const auto session = talking(slot, id);
+    auto session = talking(slot, id);
     if (!session)
         return session.refusal();
     if ((*session)->is_conference || (*session)->conference != 0)
@@ -117,7 +117,7 @@ Answer<ChangeOutcome> CallModel::change(int slot, int id, CallType wanted) {
 }
 
 Answer<Session *> CallModel::asked_to_change(int slot, int id) {
-    const auto session = established(slot, id);
+    auto session = established(slot, id);
     if (session && (!(*session)->change || (*session)->change->asked_here))
         return refuse(Result::kWrongState, "the other side of call {} has asked for no change", id);
     return session;

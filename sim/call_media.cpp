@@ -87,7 +87,7 @@ Status CallModel::record(int slot, int id, RecordAction action, const std::strin
 }
 
 Answer<Session *> CallModel::silent(int slot, int id) {
-    const auto session = talking(slot, id);
+    auto session = talking(slot, id);
     if (session && (*session)->tone)
         return refuse(Result::kWrongState, "call {} sends a tone: stop that first", id);
     return session;

@@ -44,6 +44,7 @@ void set_up_child(gpointer data) {
 
 std::vector<char *> pointers(std::vector<std::string> &texts) {
     std::vector<char *> result;
+    result.reserve(texts.size() + 1);
     for (auto &text : texts)
         result.push_back(text.data());
     result.push_back(nullptr);

@@ -6,7 +6,7 @@
 namespace sim {
 
 Timer::Timer(Timer &&other) noexcept
-    : timers_(std::exchange(other.timers_, nullptr)), key_(other.key_) {}
+    : timers_(std::exchange(other.timers_, nullptr)), key_(std::move(other.key_)) {}
 
 Timer &Timer::operator=(Timer &&other) noexcept {
     if (this != &other) {

@@ -236,6 +236,7 @@ std::string Service::introspect(std::string_view path) const {
         return introspection::of_node({std::string(rest.substr(0, rest.find('/')))});
     }
     std::vector<std::string> children;
+    children.reserve(static_cast<std::size_t>(slots_));
     for (int slot = 0; slot < slots_; ++slot)
         children.push_back(fmt::format("sub{}", slot));
     return introspection::of_node(children);

@@ -15,7 +15,7 @@ std::optional<Refusal> no_such_camera(Camera camera) {
 } // namespace
 
 Answer<Video *> VideoTelephony::filmed(int slot, int id) {
-    const auto found = video(slot, id);
+    auto found = video(slot, id);
     if (found && !(*found)->camera)
         return refuse(Result::kWrongState, "no camera is on for call {}: start one first", id);
     return found;
@@ -83,7 +83,7 @@ Status VideoTelephony::set_orientation(int slot, int id, std::int32_t degrees) {
 }
 
 Answer<Video *> VideoTelephony::zoomable(int slot, int id, Camera camera) {
-    const auto found = filmed(slot, id);
+    auto found = filmed(slot, id);
     if (!found)
         return found;
     if (auto refused = no_such_camera(camera))

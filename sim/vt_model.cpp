@@ -55,7 +55,7 @@ Answer<Video *> VideoTelephony::video(int slot, int id) {
 }
 
 Answer<Video *> VideoTelephony::streaming(int slot, int id) {
-    const auto found = video(slot, id);
+    auto found = video(slot, id);
     if (found && !is_established(call_of(calls_, slot, id)->state))
         return refuse(Result::kWrongState, "call {} is not established yet", id);
     return found;
