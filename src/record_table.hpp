@@ -98,7 +98,7 @@ template <typename Record, std::size_t Count>
 class RecordTree {
     static_assert(Count <= kMaxRows);
 
-    static consteval std::size_t next_offset() {
+    static constexpr std::size_t next_offset() {
         if constexpr (requires { Record::next; })
             return offsetof(Record, next);
         else
