@@ -1,8 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
+#include "sim/enum_format.hpp"
+
 #include <cstdint>
-#include <type_traits>
 
 // The values that stand in the integers of org.kelvo.ims.Call as the stand-in defines them.
 namespace sim {
@@ -75,13 +76,6 @@ enum class UssdAnswer : std::int32_t {
 enum class RecordAction : std::int32_t { kStop = 0, kStart = 1 };
 
 enum class AudioPath : std::int32_t { kCellular = 0, kEpdg = 1 };
-
-// Texts show the number, which is what an application sees.
-template <typename T>
-requires std::is_enum_v<T>
-constexpr auto format_as(T value) {
-    return static_cast<std::underlying_type_t<T>>(value);
-}
 
 constexpr std::int32_t kMaxVolume = 10;
 constexpr std::int32_t kInitialVolume = 5;
