@@ -1,0 +1,85 @@
+// SPDX-License-Identifier: Apache-2.0
+#pragma once
+
+#include "sim/clock.hpp"
+#include "sim/ptt_calls.hpp"
+#include "sim/ptt_events.hpp"
+#include "sim/result.hpp"
+
+#include <cstdint>
+#include <map>
+#include <string>
+#include <string_view>
+#include <utility>
+
+namespace sim {
+
+struct PttRecordRequest {
+    std::int32_t session = 0;
+    PttRecordSource source = PttRecordSource::kAll;
+    std::int32_t longest = 0; // seconds; 0 without limit
+    std::string path;         // empty: one of the stand-in's own
+};
+
+struct PttRecordingInfo {
+    std::int32_t session = 0;
+    PttRecordState state = PttRecordState::kRecording;
+    std::int32_t error = 0;
+    std::string path;
+};
+
+// Recordings of calls. There is no sound, so what a file holds is who spoke when, a line each.
+class PttRecorder {
+  public:
+    PttRecorder(PttCalls &calls, Timers &timers) : calls_(calls), timers_(timers) {}
+
+    Answer<PttRecordingInfo> start(int slot, const PttRecordRequest &request);
+    Status pause(int slot, std::int32_t session);
+    Status resume(int slot, std::int32_t session);
+    // The file stays, or goes.
+    Status stop(int slot, std::int32_t session);
+    Status cancel(int slot, std::int32_t session);
+
+    // What the slot is told of its calls.
+    void hear(int slot, const PttEvent &event);
+
+  private:
+    // A file that did not exist before.
+    class File {
+      public:
+        File() = default;
+        File(File &&other) noexcept : descriptor_(std::exchange(other.descriptor_, -1)) {}
+        File &operator=(File &&other) noexcept {
+            std::swap(descriptor_, other.descriptor_);
+            return *this;
+        }
+        ~File();
+        // 0, or what errno says.
+        int create(const std::string &path);
+        void write(std::string_view text) const;
+
+      private:
+        int descriptor_ = -1;
+    };
+    struct Recording {
+        std::string path;
+        File file;
+        PttRecordSource source = PttRecordSource::kAll;
+        bool paused = false;
+        Timer limit;
+    };
+    using Key = std::pair<int, std::int32_t>; // slot and session
+
+    Answer<Recording *> running(Key key);
+    Status set_paused(Key key, bool paused);
+    Answer<std::string> create(Key key, const std::string &path, File &file);
+    void note(const Recording &recording, std::string_view text) const;
+    void note_speaker(const Recording &recording, const std::string &uri, bool own) const;
+    void finish(Key key, std::string_view why);
+
+    PttCalls &calls_;
+    Timers &timers_;
+    std::map<Key, Recording> recordings_;
+};
+
+} // namespace sim

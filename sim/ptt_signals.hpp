@@ -1,0 +1,14 @@
+// SPDX-License-Identifier: Apache-2.0
+#pragma once
+
+#include "sim/ptt_events.hpp"
+#include "sim/service.hpp"
+
+#include <span>
+
+namespace sim {
+
+Signal to_signal(const PttEvent &event);
+std::span<const SignalInfo> ptt_signals();
+
+} // namespace sim
