@@ -14,17 +14,30 @@ using std::int32_t;
 using std::string;
 using enum Caller;
 
-// (bbiivv): of an answer, an offer and an answer to that.
-Answer<PttModifyRequest> media_request(const Request &request) {
-    const auto [changes_media, changes_terms, session, reference, media_set, terms_set] =
-        request.unpack<bool, bool, int32_t, int32_t, Variant, Variant>();
+struct Sets {
+    FourIntegers media;
+    FourIntegers terms;
+};
+
+Answer<Sets> both_sets(const Variant &media_set, const Variant &terms_set) {
     const auto media = ptt_wire::four_integers(media_set);
     if (!media)
         return media.refusal();
     const auto terms = ptt_wire::four_integers(terms_set);
     if (!terms)
         return terms.refusal();
-    return PttModifyRequest{changes_media, changes_terms, session, reference, *media, *terms};
+    return Sets{*media, *terms};
+}
+
+// (bbiivv): of an answer, an offer and an answer to that.
+Answer<PttModifyRequest> media_request(const Request &request) {
+    const auto [changes_media, changes_terms, session, reference, media_set, terms_set] =
+        request.unpack<bool, bool, int32_t, int32_t, Variant, Variant>();
+    const auto sets = both_sets(media_set, terms_set);
+    if (!sets)
+        return sets.refusal();
+    return PttModifyRequest{changes_media, changes_terms, session,
+                            reference,     sets->media,   sets->terms};
 }
 
 std::vector<PttPeer> peers_of(const std::vector<PttUser> &users) {
@@ -76,16 +89,13 @@ Answer<Variant> PttInterface::make_call(const Request &request) {
     const auto [crisis, automatic, takes_floor, called, type, name, media_set, terms_set,
                 answer_time] =
         request.unpack<bool, bool, bool, string, int32_t, string, Variant, Variant, int32_t>();
-    const auto media = ptt_wire::four_integers(media_set);
-    if (!media)
-        return media.refusal();
-    const auto terms = ptt_wire::four_integers(terms_set);
-    if (!terms)
-        return terms.refusal();
-    return result_with(calls_.make_call(
-        request.slot, {{crisis, automatic, takes_floor, *media, *terms, name, answer_time},
-                       called,
-                       PttCallType{type}}));
+    const auto sets = both_sets(media_set, terms_set);
+    if (!sets)
+        return sets.refusal();
+    return result_with(calls_.make_call(request.slot, {{crisis, automatic, takes_floor, sets->media,
+                                                        sets->terms, name, answer_time},
+                                                       called,
+                                                       PttCallType{type}}));
 }
 
 Answer<Variant> PttInterface::make_ad_hoc_call(const Request &request) {
@@ -93,18 +103,17 @@ Answer<Variant> PttInterface::make_ad_hoc_call(const Request &request) {
                 answer_time, user_list, no_effect] =
         request.unpack<Variant, bool, Variant, string, string, bool, int32_t, bool, int32_t,
                        Variant, int32_t>();
-    const auto media = ptt_wire::four_integers(media_set);
-    if (!media)
-        return media.refusal();
-    const auto terms = ptt_wire::four_integers(terms_set);
-    if (!terms)
-        return terms.refusal();
+    const auto sets = both_sets(media_set, terms_set);
+    if (!sets)
+        return sets.refusal();
     const auto users = ptt_wire::users(user_list, count);
     if (!users)
         return users.refusal();
     return result_with(calls_.make_ad_hoc_call(
         request.slot,
-        {{crisis, automatic, takes_floor, *media, *terms, name, answer_time}, subject, *users}));
+        {{crisis, automatic, takes_floor, sets->media, sets->terms, name, answer_time},
+         subject,
+         *users}));
 }
 
 Answer<Variant> PttInterface::add_users(const Request &request) {

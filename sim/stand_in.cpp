@@ -3,6 +3,7 @@
 
 #include "sim/call_signals.hpp"
 #include "sim/group_store.hpp"
+#include "sim/ptt_signals.hpp"
 #include "sim/settings_store.hpp"
 
 #include <ctime>
@@ -36,9 +37,20 @@ StandIn::StandIn(const Options &options, const Log &log, MainLoop &loop)
       ussd_(plan_, timers_, registrations_, sink_of<CallInterface>(service_)),
       logins_(plan_.slots(), timers_, registrations_, sink_of<LoginInterface>(service_)),
       centre_(plan_, timers_, registrations_, std::time(nullptr), sink_of<SmsInterface>(service_)),
+      ptt_directory_(plan_), ptt_calls_(ptt_directory_, timers_, registrations_,
+                                        [this](int slot, const PttEvent &event) {
+                                            ptt_recorder_.hear(slot, event);
+                                            sink_of<PttInterface>(service_)(slot, event);
+                                        }),
+      ptt_recorder_(ptt_calls_, timers_),
+      ptt_messages_(ptt_directory_, ptt_calls_, timers_, registrations_,
+                    sink_of<PttInterface>(service_)),
+      ptt_files_(ptt_directory_, ptt_calls_, timers_, registrations_,
+                 sink_of<PttInterface>(service_)),
       settings_(plan_.slots()), registration_interface_(applications_, registrations_),
       login_interface_(logins_), call_interface_(calls_, ussd_), sms_interface_(centre_),
       ss_interface_(services_), settings_interface_(settings_), vt_interface_(video_),
+      ptt_interface_(ptt_calls_, ptt_recorder_, ptt_messages_, ptt_files_),
       // No push-to-talk session runs yet.
       xdm_interface_(groups_, plan_, registrations_,
                      [](int) { return std::vector<ParticipantInfo>(); }) {
@@ -50,6 +62,7 @@ StandIn::StandIn(const Options &options, const Log &log, MainLoop &loop)
     service_.add(ss_interface_.describe());
     service_.add(settings_interface_.describe());
     service_.add(vt_interface_.describe());
+    service_.add(ptt_interface_.describe());
     service_.add(xdm_interface_.describe());
 }
 

@@ -11,6 +11,7 @@
 #include "sim/main_loop.hpp"
 #include "sim/number_plan.hpp"
 #include "sim/options.hpp"
+#include "sim/ptt_interface.hpp"
 #include "sim/registration_interface.hpp"
 #include "sim/service.hpp"
 #include "sim/settings_interface.hpp"
@@ -53,6 +54,11 @@ class StandIn {
     UssdService ussd_;
     Logins logins_;
     ServiceCentre centre_;
+    PttDirectory ptt_directory_;
+    PttCalls ptt_calls_;
+    PttRecorder ptt_recorder_;
+    PttMessages ptt_messages_;
+    PttFiles ptt_files_;
     SettingsModel settings_;
     GroupModel groups_;
     RegistrationInterface registration_interface_;
@@ -62,6 +68,7 @@ class StandIn {
     SsInterface ss_interface_;
     SettingsInterface settings_interface_;
     VtInterface vt_interface_;
+    PttInterface ptt_interface_;
     XdmInterface xdm_interface_;
 };
 

@@ -17,6 +17,7 @@ namespace sim::test {
 
 constexpr const char *kCall = "org.kelvo.ims.Call";
 constexpr const char *kLogin = "org.kelvo.ims.Login";
+constexpr const char *kPoc = "org.kelvo.ims.Poc";
 constexpr const char *kRegistration = "org.kelvo.ims.Registration";
 constexpr const char *kSms = "org.kelvo.ims.Sms";
 constexpr const char *kSs = "org.kelvo.ims.Ss";
