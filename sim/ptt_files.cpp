@@ -16,6 +16,16 @@ constexpr auto kPatience = 60s;
 constexpr std::int32_t kSmallestStep = 128 * 1024;
 constexpr std::int32_t kMostSteps = 16;
 
+// What crosses, as RFC 5547 counts: from 1, both ends included.
+struct Part {
+    std::int32_t first;
+    std::int32_t last;
+};
+
+Part part_of(const PttFileAttributes &attributes) {
+    return {std::max(attributes.start, 1), attributes.end == 0 ? attributes.size : attributes.end};
+}
+
 } // namespace
 
 PttFiles::PttFiles(const PttDirectory &directory, PttCalls &calls, Timers &timers,
@@ -26,15 +36,18 @@ PttFiles::PttFiles(const PttDirectory &directory, PttCalls &calls, Timers &timer
 }
 
 std::int32_t PttFiles::Transfer::bytes() const {
-    const auto end = attributes.end == 0 ? attributes.size : attributes.end;
-    return end - attributes.start;
+    const Part part = part_of(attributes);
+    return part.last - part.first + 1;
 }
 
 std::optional<Refusal> PttFiles::bad_attributes(const PttFileAttributes &attributes) const {
     if (attributes.name.empty())
         return refuse(Result::kInvalidArgument, "the attributes name no file");
-    const auto end = attributes.end == 0 ? attributes.size : attributes.end;
-    if (attributes.start < 0 || attributes.start > end || end > attributes.size)
+    const Part part = part_of(attributes);
+    // Of an empty file the first byte is past the last.
+    const bool possible = attributes.start >= 0 && attributes.size >= 0 && part.last >= 0 &&
+                          part.last <= attributes.size && part.first <= std::max(part.last, 1);
+    if (!possible)
         return refuse(Result::kInvalidArgument, "{} to {} is no part of a file of {} bytes",
                       attributes.start, attributes.end, attributes.size);
     const auto same = [&](const auto &entry) {

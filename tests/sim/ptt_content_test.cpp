@@ -172,7 +172,7 @@ TEST_F(PttContentTest, AFileOfAMebibyteCrossesWithProgress) {
 
 TEST_F(PttContentTest, PartOfAFileAndTheLargestOneCross) {
     auto part = file({to("+15550221")});
-    part.attributes.start = 100;
+    part.attributes.start = 101;
     part.attributes.end = 300;
     offer(part);
     advance(5s);
@@ -254,7 +254,8 @@ TEST_F(PttContentTest, FilesThatMakeNoSenseAreRefused) {
     auto wrong = file({to("+15550101")});
     wrong.attributes.name.clear();
     expect_refused(files_.offer(0, wrong), Result::kInvalidArgument, "name no file");
-    for (const auto &[start, end] : {std::pair{-1, 0}, {5, 4}, {0, (1 << 20) + 1}}) {
+    for (const auto &[start, end] :
+         {std::pair{-1, 0}, {5, 4}, {0, (1 << 20) + 1}, {(1 << 20) + 1, 0}, {0, -1}}) {
         wrong = file({to("+15550101")});
         wrong.attributes.start = start;
         wrong.attributes.end = end;
