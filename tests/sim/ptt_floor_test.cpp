@@ -146,6 +146,39 @@ TEST_F(PttFloorTest, AQueueHasAnEnd) {
     EXPECT_EQ(floor.next()->who, 2);
 }
 
+TEST(PttFloorQueue, OneMoreThanMayWaitIsRejected) {
+    constexpr int kSlots = 10;
+    std::vector<std::string> numbers;
+    for (int slot = 0; slot < kSlots; ++slot)
+        numbers.push_back(NumberPlan::default_slot_number(slot));
+    const NumberPlan plan(numbers);
+    std::chrono::nanoseconds now{0};
+    Timers timers(0, [&] { return now; });
+    Registrations registrations(kSlots, timers, [](int, const RegistrationEvent &) {});
+    const PttDirectory directory(plan);
+    std::vector<PttFloorEvent> told;
+    PttCalls calls(directory, timers, registrations, [&](int slot, const PttEvent &event) {
+        if (const auto *floor = std::get_if<PttFloorEvent>(&event); floor && slot == kSlots - 1)
+            told.push_back(*floor);
+    });
+    const auto settle = [&] {
+        now += 1ms;
+        timers.run_due();
+    };
+    registrations.start();
+    settle();
+    for (int slot = 0; slot < kSlots; ++slot)
+        expect_accepted(calls.set_channel(slot, 1, PttChannelMode::kTalkAndListen));
+    expect_accepted(calls.make_call(0, {{}, "", PttCallType::kChannel}));
+    settle();
+    for (int slot = 0; slot < kSlots; ++slot)
+        expect_accepted(calls.request_floor(slot, {1, {}, 0, 0, {}}));
+    ASSERT_FALSE(told.empty());
+    EXPECT_EQ(told.back().kind, PttFloorKind::kRejected);
+    EXPECT_EQ(told.back().cause, PttFloorCause::kQueueFull);
+    EXPECT_EQ(told.back().text, "too many wait");
+}
+
 TEST_F(PttFloorTest, TheStateIsToldOfTheSessionsThatAreNamedOrOfAll) {
     connect_team();
     expect_accepted(ask_floor(0));
