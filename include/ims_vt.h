@@ -9,8 +9,8 @@
  * @brief Video telephony: camera, preview, zoom, recording, casting, drawing surfaces.
  *
  * All methods are on the D-Bus interface `org.kelvo.ims.Vt`; there are no signals. None of them
- * carries the application id. Each expects `(i)`, the result, and its callback's data is NULL, unless
- * it says otherwise.
+ * carries the application id. Each expects `(i)`, the result, and its callback's data is NULL,
+ * unless it says otherwise.
  *
  * The service does the media work and defines what the values mean: every field with a neutral name
  * such as `value_1` or `text_1`. The library passes them through unchanged.
