@@ -154,12 +154,12 @@ void describe(auto &form, Like<RuleContactLists> auto &identity) {
     form.count("num_of_contact_list_url", identity.urls);
 }
 
-void describe(auto &form, Like<RuleDomains::Domains> auto &domains) {
+void describe(auto &form, Like<DomainNames> auto &domains) {
     form.count("num_of_domain_id", domains.names);
     form.texts({"contacts_v", "domain_id_v"}, {"contacts", "domain_id"}, domains.names);
 }
 
-void describe(auto &form, Like<RuleDomains::Contacts> auto &contacts) {
+void describe(auto &form, Like<DomainContacts> auto &contacts) {
     form.count("num_of_contact_id", contacts.members);
     form.list({"contacts", "contacts_v"}, contacts.members);
 }

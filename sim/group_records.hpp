@@ -116,19 +116,21 @@ struct RuleContactLists {
     bool operator==(const RuleContactLists &) const = default;
 };
 
+struct DomainNames {
+    std::vector<std::string> names{};
+    bool operator==(const DomainNames &) const = default;
+};
+
+struct DomainContacts {
+    std::vector<GroupMember> members{};
+    bool operator==(const DomainContacts &) const = default;
+};
+
 struct RuleDomains {
-    struct Domains {
-        std::vector<std::string> names{};
-        bool operator==(const Domains &) const = default;
-    };
-    struct Contacts {
-        std::vector<GroupMember> members{};
-        bool operator==(const Contacts &) const = default;
-    };
-    std::optional<Domains> allowed_domains{};
-    std::optional<Contacts> allowed_contacts{};
-    std::optional<Domains> except_domains{};
-    std::optional<Contacts> except_contacts{};
+    std::optional<DomainNames> allowed_domains{};
+    std::optional<DomainContacts> allowed_contacts{};
+    std::optional<DomainNames> except_domains{};
+    std::optional<DomainContacts> except_contacts{};
     bool operator==(const RuleDomains &) const = default;
 };
 

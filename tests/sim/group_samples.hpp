@@ -28,12 +28,12 @@ inline std::vector<GroupRule> sample_rules() {
                           .identity = RuleContactLists{{"http://xcap.example.org/lists/b"}},
                           .identity_type = 2,
                           .is_list_member = true};
-    const GroupRule domains{
-        .id = "domains",
-        .identity = RuleDomains{RuleDomains::Domains{{"example.org", "example.net"}}, std::nullopt,
-                                RuleDomains::Domains{},
-                                RuleDomains::Contacts{{sample_member("sip:dan@example.org")}}},
-        .identity_type = 4};
+    const GroupRule domains{.id = "domains",
+                            .identity =
+                                RuleDomains{DomainNames{{"example.org", "example.net"}},
+                                            std::nullopt, DomainNames{},
+                                            DomainContacts{{sample_member("sip:dan@example.org")}}},
+                            .identity_type = 4};
     return {entries, lists, domains, {.id = "nobody", .identity_type = 3}};
 }
 

@@ -15,7 +15,7 @@ namespace {
 using testing::HasSubstr;
 
 Answer<GroupDictionary> read_text(const std::string &text) {
-    const Variant value(
+    const auto value = Variant::adopt(
         g_variant_parse(G_VARIANT_TYPE_VARDICT, text.c_str(), nullptr, nullptr, nullptr));
     return wire::read_dictionary(value.get());
 }
@@ -69,7 +69,8 @@ TEST(GroupWire, ValuesOfOtherTypesKeepTheirType) {
         ASSERT_TRUE(read);
         const auto *foreign = std::get_if<ForeignValue>(&(*read)[0].value.content);
         ASSERT_TRUE(foreign) << value;
-        const Variant parsed(g_variant_parse(nullptr, value, nullptr, nullptr, nullptr));
+        const auto parsed =
+            Variant::adopt(g_variant_parse(nullptr, value, nullptr, nullptr, nullptr));
         EXPECT_EQ(foreign->type, g_variant_get_type_string(parsed.get()));
     }
 }

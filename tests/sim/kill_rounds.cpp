@@ -58,12 +58,13 @@ struct Stream {
             int number;
         };
         const int number = ++last_sent;
-        const auto arguments = kept.arguments(number);
+        const auto arguments = Variant::adopt(
+            g_variant_parse(nullptr, kept.arguments(number).c_str(), nullptr, nullptr, nullptr));
         ++open;
         g_dbus_connection_call(
             client.connection(), kServiceName, slot_path(0).c_str(), kept.interface, kept.method,
-            g_variant_parse(nullptr, arguments.c_str(), nullptr, nullptr, nullptr), nullptr,
-            G_DBUS_CALL_FLAGS_NO_AUTO_START, kPatienceMilliseconds, nullptr,
+            arguments.get(), nullptr, G_DBUS_CALL_FLAGS_NO_AUTO_START, kPatienceMilliseconds,
+            nullptr,
             [](GObject *connection, GAsyncResult *result, gpointer data) {
                 const std::unique_ptr<Context> context(static_cast<Context *>(data));
                 const auto reply = Variant::adopt(
