@@ -51,9 +51,14 @@ StandIn::StandIn(const Options &options, const Log &log, MainLoop &loop)
       login_interface_(logins_), call_interface_(calls_, ussd_), sms_interface_(centre_),
       ss_interface_(services_), settings_interface_(settings_), vt_interface_(video_),
       ptt_interface_(ptt_calls_, ptt_recorder_, ptt_messages_, ptt_files_),
-      // No push-to-talk session runs yet.
-      xdm_interface_(groups_, plan_, registrations_,
-                     [](int) { return std::vector<ParticipantInfo>(); }) {
+      xdm_interface_(groups_, plan_, registrations_, [this](int slot) {
+          std::vector<ParticipantInfo> sessions;
+          for (const PttRunningCall &call : ptt_calls_.running(slot))
+              sessions.push_back(participant_info(call));
+          return sessions;
+      }) {
+    ptt_directory_.add_groups(
+        [this](std::string_view uri) { return groups_.participants_of(uri); });
     loop.drive(timers_);
     service_.add(registration_interface_.describe());
     service_.add(login_interface_.describe());

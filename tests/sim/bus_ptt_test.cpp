@@ -106,6 +106,39 @@ TEST_F(BusPtt, ThreeSlotsInAGroupCallAndTwoAskForTheFloorAtOnce) {
     EXPECT_EQ(hear(2, "PocCallEnded"), "(1, 1)");
 }
 
+TEST_F(BusPtt, AGroupDocumentIsAGroupToCallAndToAskAbout) {
+    EXPECT_EQ(at(0)
+                  .call(0, kXdm, "XdmCreateGroup",
+                        "({'group_uri': <'sip:crew@example.org'>, 'group_member_list': "
+                        "<{'contacts': <{'contacts_v': <[{'uri': <'tel:+15550100'>}, "
+                        "{'uri': <'tel:+15550101'>}, {'uri': <'tel:+15550102'>}]>, "
+                        "'num_of_contacts': <int64 3>}>}>},)")
+                  .body,
+              "(0,)");
+    const auto participants = [this](int slot, const char *of) {
+        return at(slot).call(slot, kXdm, "XdmGetParticipantInfo", of).body;
+    };
+    EXPECT_EQ(participants(0, "('sip:crew@example.org',)"), "(12, {})");
+    EXPECT_EQ(ask(0, "PocMakeCall", call_to("sip:crew@example.org", 1)), "(0, 1)");
+    hear(1, "PocCallIncomingInd");
+    EXPECT_EQ(ask(1, "PocAnswerCall", answer(1)), "(0,)");
+    hear(0, "PocCallEstablished");
+    for (const char *name : {"('sip:crew@example.org',)", "('sip:1@sessions.invalid',)"}) {
+        const std::string told = participants(0, name);
+        EXPECT_THAT(told, HasSubstr("'list_service_uri': <'sip:crew@example.org'>"));
+        EXPECT_THAT(told, HasSubstr("'session_type': <int64 1>"));
+        EXPECT_THAT(told, HasSubstr("'inviting_user': <'tel:+15550100'>"));
+        const auto state_of = [&told](const std::string &uri) {
+            const auto at = told.find("'user_state': <int64 ", told.find("{'uri': <'" + uri));
+            return told.substr(at, sizeof "'user_state': <int64 0");
+        };
+        EXPECT_EQ(state_of("tel:+15550101"), "'user_state': <int64 1>") << told;
+        EXPECT_EQ(state_of("tel:+15550102"), "'user_state': <int64 0>") << told;
+    }
+    // Who is only being asked does not take part yet.
+    EXPECT_EQ(participants(2, "('sip:crew@example.org',)"), "(12, {})");
+}
+
 TEST_F(BusPtt, OneToOne) {
     EXPECT_EQ(ask(0, "PocMakeCall", call_to("tel:+15550101", 0)), "(0, 1)");
     EXPECT_EQ(at(0).next_signal(), "sub0 PocCallInProgress (1,)");
