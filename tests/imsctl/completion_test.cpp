@@ -27,8 +27,8 @@ std::vector<std::string> completed(const std::vector<std::string> &words) {
 TEST(Completion, OffersVerbs) {
     EXPECT_THAT(completed({""}),
                 ElementsAre("call", "registration", "flight-mode", "login", "logout", "login-state",
-                            "sms", "ss", "settings", "network-environment", "profile", "monitor",
-                            "completion"));
+                            "sms", "ss", "settings", "network-environment", "profile", "ptt",
+                            "monitor", "completion"));
     EXPECT_THAT(completed({"c"}), ElementsAre("call", "completion"));
     EXPECT_THAT(completed({"call", "re"}),
                 ElementsAre("reject", "resume", "reject-change", "record"));
@@ -52,7 +52,8 @@ TEST(Completion, OffersTheValuesOfOptions) {
     // bash takes "--type=vi" apart.
     EXPECT_THAT(completed({"call", "dial", "--type", "="}), SizeIs(3));
     EXPECT_THAT(completed({"call", "dial", "--type", "=", "vi"}), ElementsAre("video"));
-    EXPECT_THAT(completed({"monitor", "--module", ""}), ElementsAre("reg", "call", "sms", "login"));
+    EXPECT_THAT(completed({"monitor", "--module", ""}),
+                ElementsAre("reg", "call", "sms", "poc", "login"));
     EXPECT_THAT(completed({"--slot", ""}), IsEmpty());
     EXPECT_THAT(completed({"call", "dial", "--text-1", ""}), IsEmpty());
 }

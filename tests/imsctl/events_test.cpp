@@ -41,6 +41,14 @@ TEST(EventTable, HasTheEventsOfRegistrationMessagesAndLogin) {
         EXPECT_NE(find_event(id), nullptr) << id;
 }
 
+TEST(EventTable, HasAllEventsOfPushToTalkEachInWords) {
+    for (int id = IMS_NOTI_POC_CALL_INCOMING_IND; id <= IMS_NOTI_POC_FILE_TRANSFER_TERMINATED;
+         ++id) {
+        ASSERT_NE(find_event(id), nullptr) << id;
+        EXPECT_NE(find_event(id)->summary, nullptr) << id;
+    }
+}
+
 // The JSON object has keys of its own beside the fields.
 TEST(EventTable, HasNoFieldNamedLikeTheEnvelope) {
     for (const EventRow &row : all_events()) {

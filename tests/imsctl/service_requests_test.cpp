@@ -1,17 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
 // Registration, login, delivery reports and supplementary services against a scripted service: what
 // each verb sends, and what it shows of the reply.
-#include "private_bus.hpp"
-#include "program.hpp"
-#include "scripted_peer.hpp"
+#include "verb_checks.hpp"
 
 #include <gmock/gmock.h>
-#include <gtest/gtest.h>
 
 namespace test {
 namespace {
-
-using testing::HasSubstr;
 
 constexpr const char *kWaitingList = "(0, 2, [{'ss_class': <1>, 'ss_status': <1>}, "
                                      "{'ss_class': <2>, 'ss_status': <0>}])";
@@ -20,23 +15,6 @@ constexpr const char *kForwardingList =
     "'cf_uri_length': <13>, 'cf_uri_type': <0>, 'cf_uri': <'tel:+1\\u001b[1m'>}])";
 constexpr const char *kBarringList =
     "(0, 1, [{'ss_class': <9>, 'ss_status': <0>, 'cb_type': <3>}])";
-
-struct VerbRow {
-    const char *line;
-    std::size_t verb_words; // how many of the words are the verb
-    const char *method;
-    const char *sent_type; // "" for no parameters
-    const char *sent;
-    const char *reply_type;
-    const char *reply;
-    const char *refusal; // the same with the result 77
-    const char *json;    // without the verb
-    const char *text;
-};
-
-void PrintTo(const VerbRow &row, std::ostream *out) {
-    *out << row.line;
-}
 
 // The application id is 42.
 const VerbRow kRows[] = {
@@ -97,75 +75,7 @@ const VerbRow kRows[] = {
      "CLASS  STATUS  CALLS\n9      off     incoming"},
 };
 
-std::string verb_of(const VerbRow &row) {
-    const auto words = split(row.line);
-    std::string verb = words[0];
-    for (std::size_t i = 1; i < row.verb_words; ++i)
-        verb += ' ' + words[i];
-    return verb;
-}
-
-class WithService : public ::testing::Test {
-  protected:
-    void answer(const std::string &method, const char *type, const char *text) {
-        peer_.on("org.kelvo.ims." + method, reply(type, text));
-    }
-
-    std::vector<Call> calls_to(const std::string &method) const {
-        return peer_.calls_to("org.kelvo.ims." + method);
-    }
-
-    PrivateBus bus_;
-    ScriptedPeer peer_{bus_.address()};
-};
-
-class ServiceVerbs : public WithService, public ::testing::WithParamInterface<VerbRow> {};
-
-TEST_P(ServiceVerbs, SendsItsRequestOnceAndShowsTheReply) {
-    const VerbRow &row = GetParam();
-    answer(row.method, row.reply_type, row.reply);
-    const Outcome outcome = run_imsctl(split(row.line));
-    EXPECT_EQ(outcome.status, 0) << outcome.error;
-    EXPECT_EQ(outcome.output, row.text + std::string("\n"));
-
-    const auto calls = calls_to(row.method);
-    ASSERT_EQ(calls.size(), 1u);
-    EXPECT_EQ(calls[0].path, "/org/kelvo/ims/sub0");
-    if (row.sent_type[0] == '\0')
-        EXPECT_EQ(calls[0].signature, "");
-    else
-        EXPECT_EQ(to_text(calls[0].body.get()), to_text(parse(row.sent_type, row.sent).get()));
-    // Registering, and nothing besides.
-    EXPECT_EQ(peer_.calls().size(), 2u);
-}
-
-TEST_P(ServiceVerbs, ShowsTheReplyAsOneJsonObject) {
-    const VerbRow &row = GetParam();
-    answer(row.method, row.reply_type, row.reply);
-    const Outcome outcome = run_imsctl(split(row.line + std::string(" --json")));
-    EXPECT_EQ(outcome.status, 0) << outcome.error;
-    Json expected = {{"verb", verb_of(row)}};
-    expected.update(Json::parse(row.json));
-    EXPECT_EQ(outcome.json().dump(), expected.dump());
-}
-
-TEST_P(ServiceVerbs, FailsWithTheServicesOwnResult) {
-    const VerbRow &row = GetParam();
-    answer(row.method, row.reply_type, row.refusal);
-    const Outcome outcome = run_imsctl(split(row.line + std::string(" --json")));
-    EXPECT_EQ(outcome.status, 1);
-    EXPECT_EQ(outcome.json()["verb"], verb_of(row));
-    EXPECT_EQ(outcome.json()["error"]["kind"], "service");
-    EXPECT_EQ(outcome.json()["error"]["result"], 77);
-    EXPECT_THAT(outcome.error, HasSubstr("the service answered with result 77"));
-}
-
-INSTANTIATE_TEST_SUITE_P(All, ServiceVerbs, ::testing::ValuesIn(kRows),
-                         [](const ::testing::TestParamInfo<VerbRow> &row) {
-                             std::string name = row.param.method + std::to_string(row.index);
-                             std::erase(name, '.');
-                             return name;
-                         });
+INSTANTIATE_TEST_SUITE_P(All, ServiceVerbs, ::testing::ValuesIn(kRows), verb_name);
 
 constexpr const char *kGetRegistrationInfo = "Registration.GetRegistrationInfo";
 constexpr const char *kGetLoginState = "Login.GetLoginState";

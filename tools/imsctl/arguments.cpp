@@ -7,6 +7,7 @@
 #include <algorithm>
 #include <charconv>
 #include <fmt/format.h>
+#include <fmt/ranges.h>
 #include <utility>
 
 namespace imsctl {
@@ -40,6 +41,41 @@ std::function<std::string(const std::string &)> one_of(const std::vector<std::st
                    : fmt::format("there is none called {}{}", quote(name),
                                  did_you_mean(name, known));
     };
+}
+
+std::vector<std::string> split_at_commas(const std::string &text) {
+    std::vector<std::string> parts;
+    std::size_t begin = 0;
+    for (auto end = text.find(','); end != std::string::npos; end = text.find(',', begin)) {
+        parts.push_back(text.substr(begin, end - begin));
+        begin = end + 1;
+    }
+    parts.push_back(text.substr(begin));
+    return parts;
+}
+
+std::optional<IntSet> parse_set(const std::string &text,
+                                std::span<const std::string_view> members) {
+    const std::vector<std::string> parts = split_at_commas(text);
+    IntSet set{};
+    if (parse_number(parts.front())) {
+        if (parts.size() != set.size())
+            return std::nullopt;
+        for (std::size_t at = 0; at < set.size(); ++at) {
+            const auto number = parse_number(parts[at]);
+            if (!number)
+                return std::nullopt;
+            set[at] = *number;
+        }
+        return set;
+    }
+    for (const std::string &part : parts) {
+        const auto member = std::find(members.begin(), members.end(), part);
+        if (member == members.end())
+            return std::nullopt;
+        set[static_cast<std::size_t>(member - members.begin())] = 1;
+    }
+    return set;
 }
 
 // A place is its own description.
@@ -181,6 +217,37 @@ Argument<bool> Arguments::flag(const std::string &names, const std::string &help
     auto value = std::make_shared<bool>(false);
     verb_.add_flag_callback(
         names, [value] { *value = true; }, help);
+    return value;
+}
+
+Argument<std::vector<std::int32_t>> Arguments::some_numbers(const std::string &names,
+                                                            const std::string &help) {
+    auto values = std::make_shared<std::vector<std::int32_t>>();
+    verb_
+        .add_option_function<std::vector<std::string>>(
+            names,
+            [=](const std::vector<std::string> &texts) {
+                for (const std::string &text : texts)
+                    values->push_back(number_or_refusal(names, text));
+            },
+            help)
+        ->type_name(type_name(names, "N"));
+    return values;
+}
+
+Argument<std::optional<IntSet>> Arguments::set(const std::string &names, const std::string &help,
+                                               std::span<const std::string_view> members) {
+    auto value = std::make_shared<std::optional<IntSet>>();
+    add(verb_, names, "SET",
+        fmt::format("{}: {} with commas between, or four numbers", help, fmt::join(members, ", ")),
+        [=](const std::string &text) {
+            *value = parse_set(text, members);
+            if (!*value)
+                refuse_argument(shown_name(names),
+                                fmt::format("{} is neither some of {} nor four numbers",
+                                            quote(text), fmt::join(members, ", ")));
+        });
+    complete_with(names, {members.begin(), members.end()});
     return value;
 }
 

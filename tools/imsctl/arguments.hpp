@@ -5,8 +5,12 @@
 #include "service_values.hpp"
 #include "session_choice.hpp"
 
+#include <array>
+#include <ims.h>
 #include <map>
 #include <memory>
+#include <optional>
+#include <span>
 #include <string>
 #include <vector>
 
@@ -16,6 +20,8 @@ class Option;
 } // namespace CLI
 
 namespace imsctl {
+
+using IntSet = std::array<std::int32_t, IMS_POC_INT_SET_SIZE>;
 
 template <class Type>
 using Argument = std::shared_ptr<Type>;
@@ -54,6 +60,12 @@ class Arguments {
     Argument<std::vector<std::string>> some_names(const std::string &names, const std::string &help,
                                                   const std::vector<std::string> &known);
     Argument<bool> flag(const std::string &names, const std::string &help);
+
+    Argument<std::vector<std::int32_t>> some_numbers(const std::string &names,
+                                                     const std::string &help);
+    // Four integers, or the members that are 1 by name; nothing when it is left out.
+    Argument<std::optional<IntSet>> set(const std::string &names, const std::string &help,
+                                        std::span<const std::string_view> members);
 
     Argument<double> seconds(const std::string &names, const std::string &help, double fallback);
 

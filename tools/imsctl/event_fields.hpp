@@ -6,6 +6,7 @@
 
 #include <cstdlib>
 #include <ims.h>
+#include <iterator>
 #include <optional>
 #include <string>
 #include <type_traits>
@@ -31,6 +32,11 @@ inline std::optional<std::string> take_text(char *text) {
     return copy;
 }
 
+// A text that stays the library's.
+inline Value lent_text(const char *text) {
+    return text == nullptr ? Value() : Value(std::string(text));
+}
+
 template <auto Member>
 Value take_member(void *record) {
     auto &member = member_of<Member>(record);
@@ -38,6 +44,10 @@ Value take_member(void *record) {
     if constexpr (std::is_same_v<Type, char *>) {
         auto text = take_text(member);
         return text ? Value(*std::move(text)) : Value();
+    } else if constexpr (std::is_same_v<Type, const char *>) {
+        return lent_text(member);
+    } else if constexpr (std::is_array_v<Type>) {
+        return Numbers(std::begin(member), std::end(member));
     } else if constexpr (std::is_same_v<Type, bool> || std::is_same_v<Type, std::uint8_t>) {
         return member;
     } else {

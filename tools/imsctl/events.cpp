@@ -9,7 +9,8 @@ namespace {
 // In the order of their ids.
 std::vector<EventRow> join_tables() {
     std::vector<EventRow> events;
-    for (const auto table : {registration_events(), call_events(), sms_events(), login_events()})
+    for (const auto table :
+         {registration_events(), call_events(), sms_events(), poc_events(), login_events()})
         events.insert(events.end(), table.begin(), table.end());
     return events;
 }

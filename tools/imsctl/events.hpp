@@ -29,6 +29,7 @@ struct EventRow {
 std::span<const EventRow> registration_events();
 std::span<const EventRow> call_events();
 std::span<const EventRow> sms_events();
+std::span<const EventRow> poc_events();
 std::span<const EventRow> login_events();
 
 std::span<const EventRow> all_events();

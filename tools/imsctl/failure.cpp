@@ -62,6 +62,8 @@ std::string_view to_string(FailureKind kind) {
         return "output";
     case FailureKind::kInput:
         return "input";
+    case FailureKind::kFloor:
+        return "floor";
     case FailureKind::kProfile:
         return "profile";
     }

@@ -24,6 +24,7 @@ enum class FailureKind {
     kNotSent,      // the service centre did not take a message
     kOutput,       // nobody takes the output
     kInput,        // a file cannot be read, or what it says is wrong
+    kFloor,        // the floor was not to be had, or taken away
     kProfile,      // no profile, or more than one, goes by what was given
 };
 

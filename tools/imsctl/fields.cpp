@@ -58,7 +58,30 @@ std::string quote_all(const Texts &texts) {
     return fmt::format("[{}]", fmt::join(parts, ","));
 }
 
+std::string list_all(const std::vector<Fields> &entries) {
+    std::vector<std::string> parts;
+    for (const Fields &fields : entries)
+        parts.push_back(fmt::format("{{{}}}", to_text(fields)));
+    return fmt::format("[{}]", fmt::join(parts, ","));
+}
+
+Json object_of(const Fields &fields) {
+    Json object = Json::object();
+    add_json(object, fields);
+    return object;
+}
+
 } // namespace
+
+bool Nested::operator==(const Nested &other) const {
+    return fields == other.fields;
+}
+bool NestedList::operator==(const NestedList &other) const {
+    return entries == other.entries;
+}
+bool Field::operator==(const Field &other) const {
+    return name == other.name && value == other.value;
+}
 
 std::string escape(std::string_view text) {
     std::string result;
@@ -98,6 +121,8 @@ std::string to_text(const Value &value) {
             [](const Binary &binary) { return fmt::format("{:02x}", fmt::join(binary.bytes, "")); },
             [](const Numbers &numbers) { return fmt::format("[{}]", fmt::join(numbers, ",")); },
             [](const Texts &texts) { return quote_all(texts); },
+            [](const Nested &record) { return fmt::format("{{{}}}", to_text(record.fields)); },
+            [](const NestedList &list) { return list_all(list.entries); },
         },
         value);
 }
@@ -118,6 +143,13 @@ Json to_json(const Value &value) {
                               Json array = Json::array();
                               for (const auto &text : texts)
                                   array.push_back(text ? Json(*text) : Json(nullptr));
+                              return array;
+                          },
+                          [](const Nested &record) -> Json { return object_of(record.fields); },
+                          [](const NestedList &list) -> Json {
+                              Json array = Json::array();
+                              for (const Fields &fields : list.entries)
+                                  array.push_back(object_of(fields));
                               return array;
                           },
                           [](const auto &plain) -> Json { return plain; },

@@ -6,6 +6,7 @@
 #include <cstdint>
 #include <nlohmann/json_fwd.hpp>
 #include <optional>
+#include <stdexcept>
 #include <string>
 #include <string_view>
 #include <variant>
@@ -23,16 +24,38 @@ struct Binary {
     bool operator==(const Binary &) const = default;
 };
 
-// monostate stands for a text that the service left out.
+struct Field;
+using Fields = std::vector<Field>;
+
+// A record inside a record, and a list of records.
+struct Nested {
+    Fields fields;
+    bool operator==(const Nested &other) const;
+};
+struct NestedList {
+    std::vector<Fields> entries;
+    bool operator==(const NestedList &other) const;
+};
+
+// monostate stands for a text, or a record, that the service left out.
 using Value = std::variant<std::monostate, bool, std::int64_t, std::uint8_t, std::string, Bytes,
-                           Binary, Numbers, Texts>;
+                           Binary, Numbers, Texts, Nested, NestedList>;
 
 struct Field {
     std::string_view name; // from a table: lives as long as the program
     Value value;
+
+    bool operator==(const Field &other) const;
 };
 
-using Fields = std::vector<Field>;
+// The value of a field that is there. Throws when it is not, or has another type.
+template <class Type>
+const Type &get(const Fields &fields, std::string_view name) {
+    for (const Field &field : fields)
+        if (field.name == name)
+            return std::get<Type>(field.value);
+    throw std::logic_error("no such field");
+}
 
 // Keys stay in the order in which they were added.
 using Json = nlohmann::ordered_json;
@@ -43,7 +66,7 @@ std::string escape(std::string_view text);
 // Escaped and in double quotes.
 std::string quote(std::string_view text);
 
-// "a=1 b=true c=\"text\""
+// "a=1 b=true c=\"text\" d={e=2}"
 std::string to_text(const Value &value);
 std::string to_text(const Fields &fields);
 

@@ -16,14 +16,6 @@ constexpr NamedValue kFeatures[] = {{"voice", 1}, {"video", 2}, {"short messages
 constexpr NamedValue kLoginStates[] = {{"logged out", 0}, {"logging in", 1}, {"logged in", 2}};
 constexpr std::int64_t kLoggedOut = 0;
 
-template <class Type>
-const Type &field(const Fields &fields, std::string_view name) {
-    for (const Field &each : fields)
-        if (each.name == name)
-            return std::get<Type>(each.value);
-    throw std::logic_error("no such field");
-}
-
 // The stand-in's names reach as far as 32 bits do; unsigned values above are shown as they are.
 std::string named(NamedValues names, std::int64_t value) {
     for (const NamedValue &each : names)
@@ -33,7 +25,7 @@ std::string named(NamedValues names, std::int64_t value) {
 }
 
 std::string named(NamedValues names, const Fields &fields, std::string_view name) {
-    return named(names, field<std::int64_t>(fields, name));
+    return named(names, get<std::int64_t>(fields, name));
 }
 
 std::string features(std::int64_t bits) {
@@ -52,14 +44,14 @@ std::string features(std::int64_t bits) {
 } // namespace
 
 std::string summarise_registration(const Fields &fields) {
-    if (!field<bool>(fields, "registered"))
+    if (!get<bool>(fields, "registered"))
         return fmt::format("not registered: {}", named(kUnregisteredReasons, fields, "value_3"));
     return fmt::format("registered over {} for {}", named(kNetworks, fields, "value_1"),
-                       features(field<std::int64_t>(fields, "value_2")));
+                       features(get<std::int64_t>(fields, "value_2")));
 }
 
 std::string summarise_emergency_registration(const Fields &fields) {
-    if (!field<bool>(fields, "registered"))
+    if (!get<bool>(fields, "registered"))
         return fmt::format("not registered for emergency calls: {}",
                            named(kUnregisteredReasons, fields, "value_2"));
     return fmt::format("registered for emergency calls over {}",
@@ -68,13 +60,13 @@ std::string summarise_emergency_registration(const Fields &fields) {
 
 std::string summarise_login(const Fields &fields) {
     const std::string state = named(kLoginStates, fields, "value_1");
-    if (field<std::int64_t>(fields, "value_1") == kLoggedOut)
+    if (get<std::int64_t>(fields, "value_1") == kLoggedOut)
         return fmt::format("{}: {}", state, named(kUnregisteredReasons, fields, "value_3"));
     return state;
 }
 
 std::string summarise_tpdu(const Fields &fields) {
-    return describe(field<Binary>(fields, "tpdu").bytes);
+    return describe(get<Binary>(fields, "tpdu").bytes);
 }
 
 } // namespace imsctl

@@ -32,15 +32,21 @@ constexpr VerbGroup kGroups[] = {
     {"settings", "sets of global settings"},
     {"network-environment", "the type of network environment"},
     {"profile", "registration profiles"},
+    {"ptt", "push-to-talk"},
+    {"ptt floor", "the right to talk"},
+    {"ptt message", "messages"},
+    {"ptt file", "file transfer"},
+    {"ptt record", "recording of calls"},
 };
 
 } // namespace
 
 std::vector<Verb> all_verbs() {
     std::vector<Verb> verbs;
-    for (const auto table : {call_verbs(), media_verbs(), conference_verbs(), access_verbs(),
-                             registration_verbs(), login_verbs(), sms_verbs(), ss_verbs(),
-                             settings_verbs(), profile_verbs(), general_verbs()})
+    for (const auto table :
+         {call_verbs(), media_verbs(), conference_verbs(), access_verbs(), registration_verbs(),
+          login_verbs(), sms_verbs(), ss_verbs(), settings_verbs(), profile_verbs(),
+          ptt_call_verbs(), ptt_floor_verbs(), ptt_content_verbs(), general_verbs()})
         verbs.insert(verbs.end(), table.begin(), table.end());
     return verbs;
 }

@@ -32,6 +32,9 @@ std::span<const Verb> sms_verbs();
 std::span<const Verb> ss_verbs();
 std::span<const Verb> settings_verbs();
 std::span<const Verb> profile_verbs();
+std::span<const Verb> ptt_call_verbs();
+std::span<const Verb> ptt_floor_verbs();
+std::span<const Verb> ptt_content_verbs();
 std::span<const Verb> general_verbs();
 
 std::vector<Verb> all_verbs();

@@ -32,6 +32,11 @@ Watch::Watch(Invocation &run, const WatchLimits &limits, const std::vector<const
 }
 
 void Watch::until_end(const std::function<bool(const Event &)> &show) {
+    until_end(show, [] { return false; });
+}
+
+void Watch::until_end(const std::function<bool(const Event &)> &show,
+                      const std::function<bool()> &enough) {
     std::int32_t left = *limits_.count;
     const auto finished = [&] {
         while (run_.client().has_event()) {
@@ -39,7 +44,7 @@ void Watch::until_end(const std::function<bool(const Event &)> &show) {
             if (counts && *limits_.count > 0 && --left == 0)
                 return true;
         }
-        return signals_.arrived() || reader_.gone();
+        return enough() || signals_.arrived() || reader_.gone();
     };
     const Seconds limit = *limits_.seconds;
     run_until(limit > 0 ? std::optional(limit) : std::nullopt, finished);

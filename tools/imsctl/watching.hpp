@@ -29,6 +29,9 @@ class Watch {
     // Until SIGINT, SIGTERM or a limit, or until nobody reads any more. `show` tells whether it
     // showed something that counts.
     void until_end(const std::function<bool(const Event &)> &show);
+    // The same, or until `enough` says so.
+    void until_end(const std::function<bool(const Event &)> &show,
+                   const std::function<bool()> &enough);
 
     // Waits for what is still under way: not for long when somebody wants the end.
     void finish(const std::function<bool()> &done);
