@@ -3,6 +3,7 @@
 
 #include "sim/call_signals.hpp"
 #include "sim/group_store.hpp"
+#include "sim/ptt_participants.hpp"
 #include "sim/ptt_signals.hpp"
 #include "sim/settings_store.hpp"
 

@@ -6,6 +6,7 @@
 
 #include <algorithm>
 #include <fmt/format.h>
+#include <nlohmann/json.hpp>
 
 namespace imsctl {
 namespace {
