@@ -28,4 +28,5 @@ install(FILES ${PROJECT_BINARY_DIR}/kelvo-ims.pc DESTINATION ${CMAKE_INSTALL_LIB
 
 if(IMS_BUILD_TOOLS)
   install(TARGETS imsctl ims-sim RUNTIME DESTINATION ${CMAKE_INSTALL_BINDIR})
+  install(FILES docs/group-document.schema.json DESTINATION ${CMAKE_INSTALL_DATADIR}/kelvo-ims)
 endif()

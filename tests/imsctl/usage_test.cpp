@@ -23,7 +23,8 @@ void PrintTo(const UsageRow &row, std::ostream *out) {
 
 const UsageRow kMistakes[] = {
     {"", "imsctl: a verb is missing: call, registration, flight-mode, login, logout, login-state, "
-         "sms, ss, settings, network-environment, profile, ptt, monitor, completion\nhelp: imsctl "
+         "sms, ss, settings, network-environment, profile, ptt, group, monitor, completion\nhelp: "
+         "imsctl "
          "--help\n"},
     {"call", "imsctl: call: a verb is missing: dial, answer, end, "},
     {"cal list", "imsctl: there is no verb \"cal\"; did you mean \"call\"?\nhelp: imsctl --help\n"},

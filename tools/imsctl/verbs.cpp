@@ -37,6 +37,9 @@ constexpr VerbGroup kGroups[] = {
     {"ptt message", "messages"},
     {"ptt file", "file transfer"},
     {"ptt record", "recording of calls"},
+    {"group", "group documents of push-to-talk"},
+    {"group rule", "the rules of a group"},
+    {"group set", "the properties of a group"},
 };
 
 } // namespace
@@ -46,7 +49,8 @@ std::vector<Verb> all_verbs() {
     for (const auto table :
          {call_verbs(), media_verbs(), conference_verbs(), access_verbs(), registration_verbs(),
           login_verbs(), sms_verbs(), ss_verbs(), settings_verbs(), profile_verbs(),
-          ptt_call_verbs(), ptt_floor_verbs(), ptt_content_verbs(), general_verbs()})
+          ptt_call_verbs(), ptt_floor_verbs(), ptt_content_verbs(), group_verbs(),
+          group_set_verbs(), general_verbs()})
         verbs.insert(verbs.end(), table.begin(), table.end());
     return verbs;
 }
