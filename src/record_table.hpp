@@ -124,6 +124,7 @@ class RecordTree {
     }
 
     constexpr Tree view() const noexcept {
+        // NOLINTNEXTLINE(bugprone-sizeof-expression): an element may be a bare pointer.
         return {rows_.data(), Count, sizeof(Record), next_offset()};
     }
 };

@@ -10,6 +10,7 @@
 #include <fmt/format.h>
 #include <fmt/ranges.h>
 #include <limits>
+#include <nlohmann/json.hpp>
 #include <set>
 
 namespace imsctl {

@@ -4,6 +4,7 @@
 #include "group_reply_records.hpp"
 
 #include <fmt/format.h>
+#include <nlohmann/json.hpp>
 
 namespace imsctl {
 namespace {
@@ -87,7 +88,8 @@ std::string plain_text(const Json &value) {
     return fmt::format("[{}]", texts);
 }
 
-void add_outline(std::string &lines, const Json &object, std::string lead, std::size_t indent);
+void add_outline(std::string &lines, const Json &object, const std::string &lead,
+                 std::size_t indent);
 
 // Nothing for a part in which nothing stands.
 void add_part(std::string &lines, const std::string &name, const Json &part, std::size_t indent) {
@@ -104,7 +106,8 @@ void add_part(std::string &lines, const std::string &name, const Json &part, std
 }
 
 // The lead stands before the first line, the indent before those that follow.
-void add_outline(std::string &lines, const Json &object, std::string lead, std::size_t indent) {
+void add_outline(std::string &lines, const Json &object, const std::string &lead,
+                 std::size_t indent) {
     std::string plain;
     for (const auto &[name, value] : object.items()) {
         if (!value.is_null() && !is_part(value) && !(value.is_array() && value.empty()))

@@ -7,6 +7,7 @@
 #include "requests.hpp"
 
 #include <fmt/format.h>
+#include <nlohmann/json.hpp>
 
 namespace imsctl {
 

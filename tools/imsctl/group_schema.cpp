@@ -4,6 +4,7 @@
 #include "group_records.hpp"
 
 #include <limits>
+#include <nlohmann/json.hpp>
 
 namespace imsctl {
 namespace {

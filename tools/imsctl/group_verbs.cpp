@@ -8,6 +8,7 @@
 #include <algorithm>
 #include <fmt/format.h>
 #include <fmt/ranges.h>
+#include <nlohmann/json.hpp>
 
 namespace imsctl {
 namespace {
@@ -85,7 +86,7 @@ Action prepare_list(Arguments &arguments) {
 }
 
 template <class Record>
-Action shown(Argument<std::string> text, TextRequest request) {
+Action shown(const Argument<std::string> &text, TextRequest request) {
     return [=](Invocation &run) {
         const Json record = fetch_about<Record>(run, request, *text);
         run.output().result(record, outline(record));
