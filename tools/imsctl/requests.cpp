@@ -69,6 +69,10 @@ Fields decode_max_volume(void *data) {
     return number_field("max_volume", data);
 }
 
+Fields decode_zoom(void *data) {
+    return number_field("zoom", data);
+}
+
 Fields decode_muted(void *data) {
     return flag_field("muted", data);
 }

@@ -38,6 +38,7 @@ Fields session_id_field(std::int32_t session_id);
 // What a callback's data points to; nothing when it is NULL.
 Fields decode_session_id(void *data);
 Fields decode_max_volume(void *data);
+Fields decode_zoom(void *data);
 Fields decode_muted(void *data);
 Fields decode_in_epdg_call(void *data);
 

@@ -33,7 +33,8 @@ inline constexpr NamedValue kCallStates[] = {
     {"active", call_state::kActive},           {"held", call_state::kHeld},
     {"held-by-peer", call_state::kHeldByPeer},
 };
-inline constexpr NamedValue kCallTypes[] = {{"voice", 0}, {"video", 1}, {"emergency", 2}};
+inline constexpr std::int32_t kVideo = 1;
+inline constexpr NamedValue kCallTypes[] = {{"voice", 0}, {"video", kVideo}, {"emergency", 2}};
 inline constexpr NamedValue kEndReasons[] = {
     {"hung up", 0},        {"hung up by the peer", 1}, {"busy", 2},
     {"declined", 3},       {"no answer", 4},           {"missed", 5},
@@ -59,6 +60,12 @@ inline constexpr std::int32_t kAllBarring = 5;
 inline constexpr NamedValue kBarringTypes[] = {
     {"outgoing", 0}, {"outgoing-international", 1}, {"outgoing-international-not-home", 2},
     {"incoming", 3}, {"incoming-roaming", 4},       {"all", kAllBarring}};
+inline constexpr std::int32_t kFrontCamera = 0;
+inline constexpr NamedValue kCameras[] = {{"front", kFrontCamera}, {"back", 1}};
+inline constexpr std::int32_t kFarEnd = 1;
+inline constexpr NamedValue kVideoEnds[] = {{"near", 0}, {"far", kFarEnd}};
+inline constexpr std::int32_t kMp4 = 1;
+inline constexpr NamedValue kVideoFormats[] = {{"3gp", 0}, {"mp4", kMp4}};
 
 // The value's name, or its number.
 std::string name_of(NamedValues names, std::int32_t value);

@@ -42,6 +42,8 @@ const Fitting kEstablished{"established calls", [](const ims_call_info_s &call) 
                            }};
 const Fitting kConference{"conferences",
                           [](const ims_call_info_s &call) { return call.bconfcall; }};
+const Fitting kVideoCall{"video calls",
+                         [](const ims_call_info_s &call) { return call.call_type == kVideo; }};
 
 std::string describe(const ims_call_info_s &call) {
     return fmt::format("{} ({}, {}{})", call.session_id,

@@ -24,6 +24,7 @@ extern const Fitting kInConversation;
 extern const Fitting kOnHold;
 extern const Fitting kEstablished;
 extern const Fitting kConference;
+extern const Fitting kVideoCall;
 
 // The only call that fits; a Failure that names the calls when there is none or more than one.
 std::int32_t choose_session(const Fitting &fitting, std::span<const ims_call_info_s> calls);

@@ -40,6 +40,14 @@ constexpr VerbGroup kGroups[] = {
     {"group", "group documents of push-to-talk"},
     {"group rule", "the rules of a group"},
     {"group set", "the properties of a group"},
+    {"vt", "video telephony: the picture of a video call"},
+    {"vt camera", "the camera"},
+    {"vt zoom", "a camera's zoom"},
+    {"vt record", "recording the video"},
+    {"vt cast", "showing a file to the other party"},
+    {"vt surface", "the pixmaps that the video is drawn on"},
+    {"vt pixmap", "single pixmaps of a surface"},
+    {"vt buffer", "the buffers that pictures go through"},
 };
 
 } // namespace
@@ -50,7 +58,7 @@ std::vector<Verb> all_verbs() {
          {call_verbs(), media_verbs(), conference_verbs(), access_verbs(), registration_verbs(),
           login_verbs(), sms_verbs(), ss_verbs(), settings_verbs(), profile_verbs(),
           ptt_call_verbs(), ptt_floor_verbs(), ptt_content_verbs(), group_verbs(),
-          group_set_verbs(), general_verbs()})
+          group_set_verbs(), vt_verbs(), general_verbs()})
         verbs.insert(verbs.end(), table.begin(), table.end());
     return verbs;
 }

@@ -37,6 +37,7 @@ std::span<const Verb> ptt_floor_verbs();
 std::span<const Verb> ptt_content_verbs();
 std::span<const Verb> group_verbs();
 std::span<const Verb> group_set_verbs();
+std::span<const Verb> vt_verbs();
 std::span<const Verb> general_verbs();
 
 std::vector<Verb> all_verbs();
