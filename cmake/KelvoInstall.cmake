@@ -10,6 +10,11 @@ endif()
 install(DIRECTORY include/ DESTINATION ${CMAKE_INSTALL_INCLUDEDIR}/kelvo-ims
   FILES_MATCHING PATTERN "*.h")
 
+# The contract with the service, and who may have a part in it.
+install(DIRECTORY dbus/interfaces/ DESTINATION ${CMAKE_INSTALL_DATADIR}/dbus-1/interfaces
+  FILES_MATCHING PATTERN "*.xml")
+install(FILES dbus/org.kelvo.ims.conf DESTINATION ${CMAKE_INSTALL_DATADIR}/dbus-1/system.d)
+
 install(EXPORT kelvo-ims-targets NAMESPACE kelvo-ims::
   DESTINATION ${CMAKE_INSTALL_LIBDIR}/cmake/kelvo-ims)
 configure_package_config_file(cmake/kelvo-ims-config.cmake.in kelvo-ims-config.cmake

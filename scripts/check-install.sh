@@ -14,6 +14,11 @@ cmake --preset debug -B "$work/build" -DIMS_BUILD_TOOLS=OFF -DBUILD_TESTING=OFF 
 cmake --build "$work/build"
 cmake --install "$work/build" --prefix "$prefix" >/dev/null
 
+for file in dbus-1/interfaces/org.kelvo.ims.Call.xml dbus-1/system.d/org.kelvo.ims.conf; do
+    [[ -f $prefix/share/$file ]] || { echo "not installed: $file" >&2; exit 1; }
+done
+echo "contract: ok"
+
 libraries=$(dirname "$(find "$prefix" -name 'libkelvo-ims.so')")
 export PKG_CONFIG_PATH=$libraries/pkgconfig
 

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "sim/introspection.hpp"
 
+#include <algorithm>
+
 namespace sim::introspection {
 
 namespace {
@@ -28,34 +30,15 @@ std::string node(const std::string &content) {
                        kStandard, content);
 }
 
-// One element for each complete type of the body.
-std::string arguments(std::string_view signature, std::string_view direction) {
-    std::string xml;
-    const std::string text(signature);
-    const GVariantType *type = g_variant_type_first(G_VARIANT_TYPE(text.c_str()));
-    for (; type; type = g_variant_type_next(type)) {
-        const std::string_view letters(g_variant_type_peek_string(type),
-                                       g_variant_type_get_string_length(type));
-        xml += direction.empty()
-                   ? fmt::format("<arg type=\"{}\"/>", letters)
-                   : fmt::format("<arg type=\"{}\" direction=\"{}\"/>", letters, direction);
-    }
-    return xml;
-}
-
 } // namespace
 
 std::string of_object(std::span<const Interface> interfaces) {
     std::string xml;
     for (const auto &interface : interfaces) {
-        xml += fmt::format("  <interface name=\"{}\">\n", interface.name);
-        for (const auto &method : interface.methods)
-            xml += fmt::format("    <method name=\"{}\">{}{}</method>\n", method.member,
-                               arguments(method.in, "in"), arguments(method.out, "out"));
-        for (const auto &signal : interface.signals)
-            xml += fmt::format("    <signal name=\"{}\">{}</signal>\n", signal.member,
-                               arguments(signal.signature, ""));
-        xml += "  </interface>\n";
+        const auto found =
+            std::ranges::find(descriptions(), interface.name, &Description::interface);
+        if (found != descriptions().end())
+            xml += found->xml;
     }
     return node(xml);
 }

@@ -79,6 +79,7 @@ class Service {
 
     // On every slot.
     void add(Interface interface) { interfaces_.push_back(std::move(interface)); }
+    std::span<const Interface> interfaces() const { return interfaces_; }
     void handle(GDBusMessage *call);
     // What a request causes while it is handled goes out after its answer.
     void emit(int slot, std::string_view interface, std::string_view member, const Variant &body);

@@ -39,6 +39,9 @@ class StandIn {
     std::optional<std::string> start(const std::string &address,
                                      std::function<void(const std::string &why)> lost);
 
+    // What it serves, for comparing with the contract.
+    std::span<const Interface> interfaces() const { return service_.interfaces(); }
+
   private:
     const Log &log_;
     NumberPlan plan_;

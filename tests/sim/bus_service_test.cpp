@@ -99,8 +99,9 @@ TEST_F(BusService, EveryNodeDescribesItself) {
         int methods;
         int signals;
     };
-    for (const Size &size : {Size{kCall, 42, 20}, Size{kRegistration, 4, 2}, Size{kLogin, 3, 1},
-                             Size{kSms, 2, 3}, Size{kSs, 6, 0}, Size{kPoc, 27, 22}}) {
+    for (const Size &size :
+         {Size{kCall, 42, 20}, Size{kRegistration, 4, 2}, Size{kLogin, 3, 1}, Size{kSms, 2, 3},
+          Size{kSs, 6, 0}, Size{kPoc, 27, 22}, Size{kVt, 28, 0}}) {
         const auto *info = g_dbus_node_info_lookup_interface(slot.get(), size.interface);
         ASSERT_NE(info, nullptr) << size.interface;
         int methods = 0;

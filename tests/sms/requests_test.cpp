@@ -3,56 +3,21 @@
 #include "declarations.hpp"
 #include "expectations.hpp"
 #include "request_checks.hpp"
+#include "sms_rows.hpp"
 
 #include <climits>
 
 namespace test {
-namespace {
-
-constexpr Module kSms{"ims_sms.cpp", "org.kelvo.ims.Sms"};
-
-constexpr std::uint8_t kTpdu[] = {1, 0, 255};
-constexpr ims_sms_deliver_report_s kReport{-7, kTpdu, sizeof kTpdu, 8};
-
-// Each request has an address of its own, because sending rewrites it.
-int send_sample(ims_h handle, ims_response_cb callback, void *user_data) {
-    std::uint8_t sca[] = {11, 0x91, 0x44, 0x77, 0x58, 0x10, 0x06, 0xF0};
-    const ims_sms_send_info_s info{kTpdu, sizeof kTpdu, sca, 9};
-    return ims_sms_send_sms(handle, &info, callback, user_data);
-}
-
-RequestRow send_row() {
-    RequestRow row = named_row<ims_sms_send_sms>(kSms, "ims_sms_send_sms", "SendSms", "(isisi)",
-                                                 "(42, 'AQD/', 3, 'B5FEd1gQBvA=', 9)");
-    row.call = send_sample;
-    row.missing_pointers = {
-        {"handle", [](ims_h, ims_response_cb callback,
-                      void *user_data) { return send_sample(nullptr, callback, user_data); }},
-        {"info", [](ims_h handle, ims_response_cb callback, void *user_data) {
-             return ims_sms_send_sms(handle, nullptr, callback, user_data);
-         }}};
-    return row;
-}
-
-std::vector<RequestRow> request_rows() {
-    return {with_reply(send_row(), "(iiii)", "(0, 7, 8, 9)"),
-            with_reply(record_row<ims_sms_send_deliver_report, kReport>(
-                           kSms, "ims_sms_send_deliver_report", "SendDeliverReport", "(iisii)",
-                           "(42, -7, 'AQD/', 3, 8)"),
-                       "(iiii)", "(0, 7, 8, 9)")};
-}
-
-} // namespace
 
 using ::testing::ValuesIn;
 
-INSTANTIATE_TEST_SUITE_P(Sms, Requests, ValuesIn(request_rows()), row_name<RequestRow>);
-INSTANTIATE_TEST_SUITE_P(Sms, RequestGates, ValuesIn(request_rows()), row_name<RequestRow>);
+INSTANTIATE_TEST_SUITE_P(Sms, Requests, ValuesIn(sms_request_rows()), row_name<RequestRow>);
+INSTANTIATE_TEST_SUITE_P(Sms, RequestGates, ValuesIn(sms_request_rows()), row_name<RequestRow>);
 
 namespace {
 
 TEST(SmsRows, CoverEveryDeclaredRequest) {
-    EXPECT_EQ(functions_of(request_rows()), declared_functions("ims_sms.h"));
+    EXPECT_EQ(functions_of(sms_request_rows()), declared_functions("ims_sms.h"));
 }
 
 // Both requests send a TPDU in the same way.
@@ -136,9 +101,10 @@ TEST_F(SmsRequest, ATpduThatNoBusCarriesIsRefusedAndTheNextIsSent) {
     const ims_sms_deliver_report_s large{7, bytes.data(), length, 8};
     EXPECT_EQ(ims_sms_send_deliver_report(handle_, &large, nullptr, nullptr),
               IMS_ERROR_INVALID_PARAMETER);
-    expect_one_line(kSms.unit, "ims_sms_send_deliver_report", "Invalid parameter");
+    expect_one_line("ims_sms.cpp", "ims_sms_send_deliver_report", "Invalid parameter");
     EXPECT_TRUE(requests().empty());
-    EXPECT_EQ(ims_sms_send_deliver_report(handle_, &kReport, nullptr, nullptr), IMS_ERROR_NONE);
+    const ims_sms_deliver_report_s small{7, bytes.data(), 3, 8};
+    EXPECT_EQ(ims_sms_send_deliver_report(handle_, &small, nullptr, nullptr), IMS_ERROR_NONE);
     EXPECT_EQ(requests().size(), 1U);
 }
 

@@ -63,6 +63,10 @@ void BusClient::settle(GDBusConnection *connection) {
     ask_bus(connection, "GetId", nullptr);
 }
 
+void BusClient::reload_bus_configuration() {
+    ask_bus(connection_, "ReloadConfig", nullptr);
+}
+
 bool BusClient::own_name(const char *name) {
     const Variant reply =
         ask_bus(connection_, "RequestName", g_variant_new("(su)", name, guint32{0}));

@@ -25,6 +25,9 @@ class BusClient {
     void settle() { settle(connection_); }
     static void settle(GDBusConnection *connection);
 
+    // The bus reads its configuration anew; its policies hold for all connections at once.
+    void reload_bus_configuration();
+
     // Whether the bus gave the name to this connection.
     bool own_name(const char *name);
     void release_name(const char *name);

@@ -72,12 +72,12 @@ std::string read_line(int descriptor) {
 
 } // namespace
 
-PrivateBus::PrivateBus(std::string_view policy_rules) {
+PrivateBus::PrivateBus(std::string_view policy_rules, std::string_view elements) {
     std::string pattern = "/tmp/ims-test-XXXXXX";
     if (!mkdtemp(pattern.data()))
         fail("mkdtemp");
     directory_ = pattern;
-    write_configuration(policy_rules);
+    write_configuration(policy_rules, elements);
     start();
     setenv(kAddressVariable, address_.c_str(), 1);
 }
@@ -98,7 +98,8 @@ void PrivateBus::stop() {
     daemon_ = -1;
 }
 
-void PrivateBus::write_configuration(std::string_view policy_rules) const {
+void PrivateBus::write_configuration(std::string_view policy_rules,
+                                     std::string_view elements) const {
     std::ofstream file{directory_ + "/bus.conf"};
     file << "<!DOCTYPE busconfig PUBLIC \"-//freedesktop//DTD D-BUS Bus Configuration 1.0//EN\"\n"
             " \"http://www.freedesktop.org/standards/dbus/1.0/busconfig.dtd\">\n"
@@ -117,7 +118,7 @@ void PrivateBus::write_configuration(std::string_view policy_rules) const {
          << policy_rules
          << "  </policy>\n"
             "  <limit name=\"max_replies_per_connection\">100000</limit>\n"
-            "</busconfig>\n";
+         << elements << "</busconfig>\n";
     file.close();
     if (!file)
         fail("bus.conf");

@@ -12,8 +12,8 @@ namespace test {
 class PrivateBus {
   public:
     // Listens, and is the process's system bus, when this returns. The rules are put behind those
-    // that allow everything, so they can forbid something.
-    explicit PrivateBus(std::string_view policy_rules = {});
+    // that allow everything, so they can forbid something; the elements behind everything else.
+    explicit PrivateBus(std::string_view policy_rules = {}, std::string_view elements = {});
     ~PrivateBus();
     PrivateBus(const PrivateBus &) = delete;
     PrivateBus &operator=(const PrivateBus &) = delete;
@@ -24,7 +24,7 @@ class PrivateBus {
     void stop();
 
   private:
-    void write_configuration(std::string_view policy_rules) const;
+    void write_configuration(std::string_view policy_rules, std::string_view elements) const;
     void start();
 
     std::string directory_;

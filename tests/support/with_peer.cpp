@@ -72,7 +72,7 @@ void SharedConnection::round_trip(GMainContext *context) {
 }
 
 void WithBus::SetUp() {
-    bus_.emplace(policy_rules_);
+    bus_.emplace(policy_rules_, bus_elements_);
     peer_.emplace(bus_->address());
 }
 

@@ -53,6 +53,8 @@ class WithBus : public ::testing::Test {
 
     // For bus rules of a test's own: set before SetUp(), in the constructor.
     std::string policy_rules_;
+    // And further elements of its configuration.
+    std::string bus_elements_;
 
     // Handles that are released at the end, unless the test did so.
     ims_h init(int slot = kSlot);

@@ -3,15 +3,8 @@
 
 #include <gtest/gtest.h>
 
-#include <cstddef>
-
 namespace test {
 namespace {
-
-static_assert(sizeof(ims_vt_surface_s) == 16);
-static_assert(offsetof(ims_vt_surface_s, session_id) == 0);
-static_assert(offsetof(ims_vt_surface_s, count) == 4);
-static_assert(offsetof(ims_vt_surface_s, entries) == 8);
 
 constexpr Module kVt{"ims_vt.cpp", "org.kelvo.ims.Vt"};
 

@@ -1,0 +1,103 @@
+// SPDX-License-Identifier: Apache-2.0
+// The library, the files and the stand-in say the same. A request or signal that is added to one of
+// them alone makes this fail.
+#include "declarations.hpp"
+#include "library.hpp"
+
+#include "sim/stand_in.hpp"
+
+#include <filesystem>
+#include <iostream>
+
+namespace test {
+namespace {
+
+// Interfaces that the stand-in does not serve yet.
+const std::set<std::string> kNotServed{"org.kelvo.ims.Poc", "org.kelvo.ims.Xdm"};
+
+Contract contract_of_stand_in() {
+    const sim::Log log{sim::LogLevel::kQuiet};
+    sim::MainLoop loop;
+    sim::Options options;
+    options.numbers = {"+15550100", "+15550101"};
+    const sim::StandIn stand_in{options, log, loop};
+    Contract contract;
+    for (const sim::Interface &interface : stand_in.interfaces()) {
+        const std::string name{interface.name};
+        for (const sim::Method &method : interface.methods)
+            contract.methods.insert(method_line(name, std::string{method.member},
+                                                std::string{method.in}, std::string{method.out}));
+        for (const sim::SignalInfo &signal : interface.signals)
+            contract.signals.insert(
+                signal_line(name, std::string{signal.member}, std::string{signal.signature}));
+    }
+    return contract;
+}
+
+void expect_same(const std::set<std::string> &one, const char *one_name,
+                 const std::set<std::string> &other, const char *other_name) {
+    EXPECT_EQ(missing(one, other), "") << "in " << other_name << ", but not in " << one_name;
+    EXPECT_EQ(missing(other, one), "") << "in " << one_name << ", but not in " << other_name;
+}
+
+std::set<std::string> interfaces_without_library() {
+    std::set<std::string> interfaces;
+    for (const MissingModule &module : missing_modules())
+        interfaces.insert(module.interface);
+    return interfaces;
+}
+
+TEST_F(LibraryOnTheBus, SendsAndAcceptsWhatTheFilesSay) {
+    std::set<std::string> seen;
+    for (const auto &[function, line] : observe_calls())
+        seen.insert(line);
+    expect_same(seen, "the library",
+                without(contract_of_files().methods, interfaces_without_library()), "the files");
+}
+
+TEST_F(LibraryOnTheBus, HearsTheSignalsThatTheFilesSay) {
+    expect_same(observe_events(), "the library",
+                without(contract_of_files().signals, interfaces_without_library()), "the files");
+}
+
+TEST(StandInContract, ServesWhatTheFilesSay) {
+    const Contract files = contract_of_files();
+    const Contract served = contract_of_stand_in();
+    expect_same(served.methods, "the stand-in", without(files.methods, kNotServed), "the files");
+    expect_same(served.signals, "the stand-in", without(files.signals, kNotServed), "the files");
+}
+
+TEST(ContractModules, AreMissingOnlyWhileTheirHeadersAre) {
+    for (const MissingModule &module : missing_modules())
+        EXPECT_FALSE(
+            std::filesystem::exists(std::filesystem::path{IMS_TEST_INCLUDE_DIR} / module.header))
+            << "its rows belong into all_modules()";
+}
+
+// Every exported function is in a row and has its method in the stand-in; the list is printed.
+TEST_F(LibraryOnTheBus, EveryExportedFunctionIsCovered) {
+    const std::set<std::string> served = contract_of_stand_in().methods;
+    const std::map<std::string, std::string> calls = observe_calls();
+    std::set<std::string> covered{// These make no call.
+                                  "ims_deinit",
+                                  "ims_set_notification_cb",
+                                  "ims_unset_notification_cb",
+                                  "ims_call_list_info_clear",
+                                  "ims_global_settings_clear",
+                                  "ims_profile_clear",
+                                  "ims_profile_list_clear"};
+    for (const auto &[function, line] : calls) {
+        std::cout << function << ": " << line << '\n';
+        covered.insert(function);
+        EXPECT_TRUE(served.contains(line)) << "the stand-in does not serve it: " << line;
+    }
+    std::set<std::string> declared;
+    for (const auto &entry : std::filesystem::directory_iterator{IMS_TEST_INCLUDE_DIR})
+        declared.merge(declared_functions(entry.path().filename()));
+    EXPECT_EQ(missing(covered, declared), "") << "declared, but in no row";
+    EXPECT_EQ(missing(declared, covered), "") << "in a row, but not declared";
+    std::cout << declared.size() << " functions, " << calls.size() << " of them make a call\n";
+}
+
+} // namespace
+} // namespace test

@@ -1,0 +1,34 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "modules.hpp"
+
+#include "call/call_rows.hpp"
+#include "call/event_rows.hpp"
+#include "login/event_rows.hpp"
+#include "login/login_rows.hpp"
+#include "reg/event_rows.hpp"
+#include "reg/reg_rows.hpp"
+#include "settings/settings_rows.hpp"
+#include "sms/event_rows.hpp"
+#include "sms/sms_rows.hpp"
+#include "ss/ss_rows.hpp"
+#include "vt/vt_rows.hpp"
+
+namespace test {
+
+std::vector<ModuleRows> all_modules() {
+    return {
+        {call_request_rows(), call_query_rows(), events_of(kCallEvents, call_event_rows())},
+        {login_request_rows(), login_query_rows(), events_of(kLoginEvents, login_event_rows())},
+        {reg_request_rows(), reg_query_rows(), events_of(kRegEvents, reg_event_rows())},
+        {settings_request_rows(), settings_query_rows(), {}},
+        {sms_request_rows(), {}, events_of(kSmsEvents, sms_event_rows())},
+        {ss_request_rows(), {}, {}},
+        {vt_request_rows(), {}, {}},
+    };
+}
+
+std::vector<MissingModule> missing_modules() {
+    return {{"org.kelvo.ims.Poc", "ims_poc.h"}, {"org.kelvo.ims.Xdm", "ims_xdm.h"}};
+}
+
+} // namespace test

@@ -1,0 +1,30 @@
+// SPDX-License-Identifier: Apache-2.0
+// The rows of all modules in one table. A new module is a line here and its files in
+// CMakeLists.txt.
+#pragma once
+
+#include "event_row.hpp"
+#include "request_row.hpp"
+
+#include <set>
+#include <string>
+#include <vector>
+
+namespace test {
+
+struct ModuleRows {
+    std::vector<RequestRow> requests;
+    std::vector<QueryRow> queries;
+    std::vector<ModuleEvent> events;
+};
+
+std::vector<ModuleRows> all_modules();
+
+// Interfaces whose module the library does not have yet, by header.
+struct MissingModule {
+    const char *interface;
+    const char *header;
+};
+std::vector<MissingModule> missing_modules();
+
+} // namespace test
