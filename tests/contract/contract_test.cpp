@@ -67,10 +67,9 @@ TEST(StandInContract, ServesWhatTheFilesSay) {
     expect_same(served.signals, "the stand-in", without(files.signals, kNotServed), "the files");
 }
 
-TEST(ContractModules, AreMissingOnlyWhileTheirHeadersAre) {
+TEST(ContractModules, AreMissingOnlyWhileTheirTestsAre) {
     for (const MissingModule &module : missing_modules())
-        EXPECT_FALSE(
-            std::filesystem::exists(std::filesystem::path{IMS_TEST_INCLUDE_DIR} / module.header))
+        EXPECT_FALSE(std::filesystem::exists(std::filesystem::path{IMS_TEST_DIR} / module.tests))
             << "its rows belong into all_modules()";
 }
 
@@ -89,11 +88,16 @@ TEST_F(LibraryOnTheBus, EveryExportedFunctionIsCovered) {
     for (const auto &[function, line] : calls) {
         std::cout << function << ": " << line << '\n';
         covered.insert(function);
-        EXPECT_TRUE(served.contains(line)) << "the stand-in does not serve it: " << line;
+        if (!without({line}, kNotServed).empty()) {
+            EXPECT_TRUE(served.contains(line)) << "the stand-in does not serve it: " << line;
+        }
     }
     std::set<std::string> declared;
     for (const auto &entry : std::filesystem::directory_iterator{IMS_TEST_INCLUDE_DIR})
         declared.merge(declared_functions(entry.path().filename()));
+    for (const MissingModule &module : missing_modules())
+        for (const std::string &function : declared_functions(module.header))
+            declared.erase(function);
     EXPECT_EQ(missing(covered, declared), "") << "declared, but in no row";
     EXPECT_EQ(missing(declared, covered), "") << "in a row, but not declared";
     std::cout << declared.size() << " functions, " << calls.size() << " of them make a call\n";

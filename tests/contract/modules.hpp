@@ -20,10 +20,11 @@ struct ModuleRows {
 
 std::vector<ModuleRows> all_modules();
 
-// Interfaces whose module the library does not have yet, by header.
+// Modules whose rows are not here yet.
 struct MissingModule {
     const char *interface;
     const char *header;
+    const char *tests; // the directory that their rows will be in
 };
 std::vector<MissingModule> missing_modules();
 
