@@ -14,6 +14,7 @@
 #include "sms/sms_rows.hpp"
 #include "ss/ss_rows.hpp"
 #include "vt/vt_rows.hpp"
+#include "xdm/xdm_rows.hpp"
 
 namespace test {
 namespace {
@@ -35,11 +36,8 @@ std::vector<ModuleRows> all_modules() {
         {sms_request_rows(), {}, events_of(kSmsEvents, sms_event_rows())},
         {ss_request_rows(), {}, {}},
         {vt_request_rows(), {}, {}},
+        {xdm_request_rows(), {}, {}},
     };
-}
-
-std::vector<MissingModule> missing_modules() {
-    return {{"org.kelvo.ims.Xdm", "ims_xdm.h", "xdm"}};
 }
 
 } // namespace test

@@ -20,12 +20,4 @@ struct ModuleRows {
 
 std::vector<ModuleRows> all_modules();
 
-// Modules whose rows are not here yet.
-struct MissingModule {
-    const char *interface;
-    const char *header;
-    const char *tests; // the directory that their rows will be in
-};
-std::vector<MissingModule> missing_modules();
-
 } // namespace test

@@ -1,0 +1,13 @@
+// SPDX-License-Identifier: Apache-2.0
+// The group document requests, one row each.
+#pragma once
+
+#include "request_row.hpp"
+
+#include <vector>
+
+namespace test {
+
+std::vector<RequestRow> xdm_request_rows();
+
+} // namespace test
