@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "network.hpp"
 
+#include "contract_signals.hpp"
+
 #include "sim/call_signals.hpp"
 #include "sim/login_interface.hpp"
 #include "sim/registration_interface.hpp"
@@ -36,6 +38,8 @@ Network::Network()
 template <typename Event>
 void Network::record(int slot, const Event &event) {
     const Signal signal = to_signal(event);
+    EXPECT_EQ(g_variant_get_type_string(signal.body.get()), contract_type_of_signal(signal.member))
+        << signal.member << " is not what the contract says";
     events_[slot].push_back(std::string(signal.member) + " " + signal.body.print());
 }
 
