@@ -3,7 +3,6 @@
 
 #include <gio/gio.h>
 
-#include <algorithm>
 #include <filesystem>
 #include <fstream>
 #include <iterator>
@@ -77,17 +76,6 @@ Contract contract_of_files() {
     for (const auto &entry : std::filesystem::directory_iterator{IMS_TEST_INTERFACES_DIR})
         add(contract, entry.path());
     return contract;
-}
-
-std::set<std::string> without(const std::set<std::string> &lines,
-                              const std::set<std::string> &interfaces) {
-    std::set<std::string> kept;
-    for (const std::string &line : lines)
-        if (std::none_of(interfaces.begin(), interfaces.end(), [&](const std::string &interface) {
-                return line.starts_with(interface + ".") || line.starts_with(interface + ":");
-            }))
-            kept.insert(line);
-    return kept;
 }
 
 std::string missing(const std::set<std::string> &from, const std::set<std::string> &expected) {

@@ -22,10 +22,6 @@ std::string signal_line(const std::string &interface, const std::string &member,
 // have names.
 Contract contract_of_files();
 
-// The same without what these interfaces say.
-std::set<std::string> without(const std::set<std::string> &lines,
-                              const std::set<std::string> &interfaces);
-
 // What the one has and the other has not, for messages.
 std::string missing(const std::set<std::string> &from, const std::set<std::string> &expected);
 
