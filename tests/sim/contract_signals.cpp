@@ -3,6 +3,7 @@
 
 #include "sim/introspection.hpp"
 
+#include <gtest/gtest.h>
 #include <map>
 #include <stdexcept>
 
@@ -36,10 +37,12 @@ Types read_types() {
 
 } // namespace
 
-std::string contract_type_of_signal(std::string_view member) {
+void expect_as_in_contract(const Signal &signal) {
     static const Types types = read_types();
-    const auto found = types.find(member);
-    return found == types.end() ? "" : found->second;
+    const auto found = types.find(signal.member);
+    ASSERT_NE(found, types.end()) << signal.member << " is not in the contract";
+    EXPECT_EQ(g_variant_get_type_string(signal.body.get()), found->second)
+        << signal.member << " is not what the contract says";
 }
 
 } // namespace sim::test

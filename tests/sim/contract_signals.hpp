@@ -1,12 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include <string>
-#include <string_view>
+#include "sim/service.hpp"
 
 namespace sim::test {
 
-// The type that the contract's files give to a signal; empty when they have no such signal.
-std::string contract_type_of_signal(std::string_view member);
+// The contract's files have a signal of this name and type.
+void expect_as_in_contract(const Signal &signal);
 
 } // namespace sim::test

@@ -38,8 +38,7 @@ Network::Network()
 template <typename Event>
 void Network::record(int slot, const Event &event) {
     const Signal signal = to_signal(event);
-    EXPECT_EQ(g_variant_get_type_string(signal.body.get()), contract_type_of_signal(signal.member))
-        << signal.member << " is not what the contract says";
+    expect_as_in_contract(signal);
     events_[slot].push_back(std::string(signal.member) + " " + signal.body.print());
 }
 

@@ -3,6 +3,8 @@
 
 #include "network.hpp"
 
+#include "contract_signals.hpp"
+
 #include "sim/ptt_calls.hpp"
 #include "sim/ptt_directory.hpp"
 #include "sim/ptt_files.hpp"
@@ -91,6 +93,7 @@ class PttNetwork : public Network {
         return [this](int slot, const PttEvent &event) {
             recorder_.hear(slot, event);
             const Signal signal = to_signal(event);
+            expect_as_in_contract(signal);
             events_[slot].push_back(std::string(signal.member) + " " + signal.body.print());
         };
     }
