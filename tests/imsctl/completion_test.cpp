@@ -28,7 +28,7 @@ TEST(Completion, OffersVerbs) {
     EXPECT_THAT(completed({""}),
                 ElementsAre("call", "registration", "flight-mode", "login", "logout", "login-state",
                             "sms", "ss", "settings", "network-environment", "profile", "ptt",
-                            "group", "monitor", "completion"));
+                            "group", "vt", "monitor", "completion"));
     EXPECT_THAT(completed({"c"}), ElementsAre("call", "completion"));
     EXPECT_THAT(completed({"call", "re"}),
                 ElementsAre("reject", "resume", "reject-change", "record"));

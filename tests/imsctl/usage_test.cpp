@@ -22,10 +22,11 @@ void PrintTo(const UsageRow &row, std::ostream *out) {
 }
 
 const UsageRow kMistakes[] = {
-    {"", "imsctl: a verb is missing: call, registration, flight-mode, login, logout, login-state, "
-         "sms, ss, settings, network-environment, profile, ptt, group, monitor, completion\nhelp: "
-         "imsctl "
-         "--help\n"},
+    {"",
+     "imsctl: a verb is missing: call, registration, flight-mode, login, logout, login-state, "
+     "sms, ss, settings, network-environment, profile, ptt, group, vt, monitor, completion\nhelp: "
+     "imsctl "
+     "--help\n"},
     {"call", "imsctl: call: a verb is missing: dial, answer, end, "},
     {"cal list", "imsctl: there is no verb \"cal\"; did you mean \"call\"?\nhelp: imsctl --help\n"},
     {"call dail 555", "imsctl: call: there is no verb \"dail\"; did you mean \"dial\"?\n"
