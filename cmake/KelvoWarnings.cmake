@@ -10,4 +10,6 @@ endif()
 if(IMS_SANITIZE)
   add_compile_options(-fsanitize=${IMS_SANITIZE} -fno-sanitize-recover=all -fno-omit-frame-pointer)
   add_link_options(-fsanitize=${IMS_SANITIZE})
+  # Clang's checks of C++ code, which C programs get from the library they link.
+  add_link_options("$<$<LINK_LANG_AND_ID:C,Clang>:-fsanitize-link-c++-runtime;-lstdc++>")
 endif()

@@ -69,7 +69,8 @@ Status VideoTelephony::start_recording(int slot, int id, const VideoFile &file) 
                       file.limit);
     if (auto refused = no_path(file.path, "a recording"))
         return *refused;
-    const auto [entry, is_new] = (*found)->recordings.try_emplace(file.end, file.path, false);
+    const auto [entry, is_new] =
+        (*found)->recordings.try_emplace(file.end, VideoRecording{file.path, false});
     if (!is_new)
         return refuse(Result::kWrongState, "end {} of call {} is recorded already, to {}", file.end,
                       id, entry->second.path);

@@ -1,0 +1,96 @@
+// SPDX-License-Identifier: Apache-2.0
+// Group documents from end to end, with the stand-in service.
+#include "private_bus.hpp"
+#include "program.hpp"
+#include "temporary_file.hpp"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+namespace test {
+namespace {
+
+constexpr const char *kCrew =
+    R"({"group_uri":"sip:crew@example.org",)"
+    R"("group_properties":{"display_name":"Crew","subject":"Night"},)"
+    R"("group_member_list":{"contacts":[{"uri":"tel:+15550100","active":true},)"
+    R"({"uri":"tel:+15550101","disp_name":"Bo"}]},)"
+    R"("group_rule_set":[{"rule_id":"guests","rule_identity_type":1,)"
+    R"("identity":{"contacts":[{"uri":"tel:+15550199"}]}}]})";
+
+class Groups : public ::testing::Test {
+  protected:
+    Groups() { service_.wait_for_error("sub1 signal RegistrationStatus (true"); }
+
+    static Outcome run(const std::string &line) { return run_imsctl(split(line)); }
+    static void expect_ok(const std::string &line) {
+        const Outcome outcome = run(line);
+        EXPECT_EQ(outcome.status, 0) << line << '\n' << outcome.error;
+    }
+    static void expect_refusal(const std::string &line, int result) {
+        const Outcome outcome = run(line + " --json");
+        EXPECT_EQ(outcome.status, 1) << line;
+        EXPECT_EQ(outcome.json()["error"]["result"], result) << line;
+    }
+    static Json shown(const std::string &slot) {
+        return run("--slot " + slot + " group show sip:crew@example.org --json").json();
+    }
+
+    PrivateBus bus_;
+    Process service_{{IMS_SIM_PATH, "serve", "--speed", "20", "--verbose"}};
+};
+
+TEST_F(Groups, AreFetchedEditedAndCreatedAgain) {
+    const TemporaryFile file{kCrew};
+    expect_ok("group create " + file.name());
+    expect_refusal("group create " + file.name(), 20);
+
+    const Json before = shown("1");
+    EXPECT_EQ(before["group_properties"]["subject"], "Night");
+    EXPECT_EQ(before["group_member_list"]["contacts"][1]["disp_name"], "Bo");
+    EXPECT_EQ(before["group_rule_set"][0]["identity"]["contacts"][0]["uri"], "tel:+15550199");
+
+    Json edited = before;
+    edited["group_properties"]["subject"] = "Day";
+    const TemporaryFile again{edited.dump()};
+    expect_ok("group delete sip:crew@example.org");
+    expect_refusal("group show sip:crew@example.org", 19);
+    expect_ok("group create " + again.name());
+    EXPECT_EQ(shown("0")["group_properties"], edited["group_properties"]);
+    EXPECT_EQ(shown("0")["group_member_list"], edited["group_member_list"]);
+}
+
+TEST_F(Groups, AreEditedInPlace) {
+    const TemporaryFile file{kCrew};
+    expect_ok("group create " + file.name());
+    expect_ok("--slot 1 group set subject sip:crew@example.org Day");
+    expect_ok("group add-user sip:crew@example.org tel:+15550102");
+    expect_refusal("group add-user sip:crew@example.org tel:+15550102", 20);
+    expect_ok("group remove-user sip:crew@example.org tel:+15550101");
+    expect_ok("group rule delete sip:crew@example.org guests");
+    expect_refusal("group rule delete sip:crew@example.org guests", 19);
+    const Json group = shown("0");
+    EXPECT_EQ(group["group_properties"]["subject"], "Day");
+    EXPECT_EQ(group["group_member_list"]["contacts"].size(), 2u);
+    EXPECT_EQ(group["group_member_list"]["contacts"][1]["uri"], "tel:+15550102");
+    EXPECT_EQ(group["group_rule_set"].size(), 0u);
+    const Json list = run("group list --json").json();
+    EXPECT_EQ(list["groups"][0]["group_properties"]["subject"], "Day");
+    EXPECT_EQ(run("group profile --json").json()["user_uri"], "tel:+15550100");
+}
+
+TEST_F(Groups, SayWhoTakesPartInACall) {
+    const TemporaryFile file{kCrew};
+    expect_ok("group create " + file.name());
+    expect_refusal("group participants sip:crew@example.org", 12);
+    expect_ok("ptt call sip:crew@example.org --type group");
+    service_.wait_for_error("sub1 signal PocCallIncomingInd");
+    expect_ok("--slot 1 ptt answer 1");
+    service_.wait_for_error("sub0 signal PocCallEstablished");
+    const Json participants = run("group participants sip:crew@example.org --json").json();
+    EXPECT_EQ(participants["list_service_uri"], "sip:crew@example.org");
+    EXPECT_EQ(participants["conf_participant_entry"].size(), 2u) << participants.dump(1);
+}
+
+} // namespace
+} // namespace test
