@@ -2,7 +2,7 @@
 // Field tables: which key of an "a{sv}" dictionary stands for which field of a record. One reader
 // and one writer run over all of them.
 //
-//     constexpr FieldTable kCallFields{{IMS_FIELD(ims_call_info_s, session_id), ...}};
+//     constexpr auto kCallFields = field_table({IMS_FIELD(ims_call_info_s, session_id), ...});
 //     read_dictionary(dictionary, kCallFields, &call);
 //
 // A finished table holds no pointers: it needs no relocation and no work when the library is
@@ -93,38 +93,42 @@ struct FieldsView {
 };
 
 template <std::size_t Count>
-class FieldTable {
+struct FieldTable {
     static_assert(Count <= kMaxFields);
 
-  public:
-    consteval FieldTable(const Field (&fields)[Count]) {
-        for (std::size_t at = 0; at < Count; ++at) {
-            const Field &field = fields[at];
-            if (field.key.size() > kMaxKeyLength || field.offset > UINT16_MAX)
-                throw "the key is too long or the record too large";
-            std::copy(field.key.begin(), field.key.end(), rows_[at].key.begin());
-            rows_[at].key_length = static_cast<std::uint8_t>(field.key.size());
-            rows_[at].kind = field.kind;
-            rows_[at].offset = static_cast<std::uint16_t>(field.offset);
-            by_key_[at] = static_cast<std::uint16_t>(at);
-        }
-        std::sort(by_key_.begin(), by_key_.end(), [this](std::uint16_t a, std::uint16_t b) {
-            return rows_[a].name() < rows_[b].name();
-        });
-        for (std::size_t at = 1; at < Count; ++at) {
-            if (rows_[by_key_[at - 1]].name() == rows_[by_key_[at]].name())
-                throw "a key stands in the table twice";
-        }
-    }
-
-    constexpr operator FieldsView() const noexcept { return {rows_, by_key_}; }
-    constexpr const FieldRow &operator[](std::size_t at) const noexcept { return rows_[at]; }
+    constexpr operator FieldsView() const noexcept { return {rows, by_key}; }
+    constexpr const FieldRow &operator[](std::size_t at) const noexcept { return rows[at]; }
     static constexpr std::size_t size() noexcept { return Count; }
 
-  private:
-    std::array<FieldRow, Count> rows_{};
-    std::array<std::uint16_t, Count> by_key_{};
+    std::array<FieldRow, Count> rows{};
+    std::array<std::uint16_t, Count> by_key{};
 };
+
+// A function, not a constructor: gcc 12 puts what a consteval constructor made into writable
+// memory.
+template <std::size_t Count>
+consteval FieldTable<Count> field_table(const Field (&fields)[Count]) {
+    FieldTable<Count> table;
+    for (std::size_t at = 0; at < Count; ++at) {
+        const Field &field = fields[at];
+        if (field.key.size() > kMaxKeyLength || field.offset > UINT16_MAX)
+            throw "the key is too long or the record too large";
+        FieldRow &row = table.rows[at];
+        std::copy(field.key.begin(), field.key.end(), row.key.begin());
+        row.key_length = static_cast<std::uint8_t>(field.key.size());
+        row.kind = field.kind;
+        row.offset = static_cast<std::uint16_t>(field.offset);
+        table.by_key[at] = static_cast<std::uint16_t>(at);
+    }
+    const auto key_of = [&table](std::uint16_t row) { return table.rows[row].name(); };
+    std::sort(table.by_key.begin(), table.by_key.end(),
+              [&](std::uint16_t a, std::uint16_t b) { return key_of(a) < key_of(b); });
+    for (std::size_t at = 1; at < Count; ++at) {
+        if (key_of(table.by_key[at - 1]) == key_of(table.by_key[at]))
+            throw "a key stands in the table twice";
+    }
+    return table;
+}
 
 // Whether the rows are all fields of the record, in the order of their declaration.
 template <typename Record>

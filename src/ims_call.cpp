@@ -607,14 +607,14 @@ int ims_call_modify_participants_in_conference(ims_h handle,
 
 namespace {
 
-constexpr FieldTable kCallFields{{
+constexpr auto kCallFields = field_table({
     IMS_FIELD(ims_call_info_s, session_id),
     IMS_FIELD(ims_call_info_s, peer_uri),
     IMS_FIELD(ims_call_info_s, call_type),
     IMS_FIELD(ims_call_info_s, bmocall),
     IMS_FIELD(ims_call_info_s, call_state),
     IMS_FIELD(ims_call_info_s, bconfcall),
-}};
+});
 
 } // namespace
 

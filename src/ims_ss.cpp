@@ -13,11 +13,11 @@ namespace {
 
 constexpr const char *kInterface = "org.kelvo.ims.Ss";
 
-constexpr FieldTable kWaitingFields{{
+constexpr auto kWaitingFields = field_table({
     IMS_FIELD(ims_ss_cw_info_s, ss_class),
     IMS_FIELD(ims_ss_cw_info_s, ss_status),
-}};
-constexpr FieldTable kForwardingFields{{
+});
+constexpr auto kForwardingFields = field_table({
     IMS_FIELD(ims_ss_cf_info_s, ss_class),
     IMS_FIELD(ims_ss_cf_info_s, ss_status),
     IMS_FIELD(ims_ss_cf_info_s, cf_type),
@@ -25,12 +25,12 @@ constexpr FieldTable kForwardingFields{{
     IMS_FIELD(ims_ss_cf_info_s, cf_uri_length),
     IMS_FIELD(ims_ss_cf_info_s, cf_uri_type),
     IMS_FIELD(ims_ss_cf_info_s, cf_uri),
-}};
-constexpr FieldTable kBarringFields{{
+});
+constexpr auto kBarringFields = field_table({
     IMS_FIELD(ims_ss_cb_info_s, ss_class),
     IMS_FIELD(ims_ss_cb_info_s, ss_status),
     IMS_FIELD(ims_ss_cb_info_s, cb_type),
-}};
+});
 
 // A service's name as its log lines have it.
 struct Service {

@@ -143,6 +143,9 @@ bool is_scalar(RowKind kind) noexcept {
 // The number of the row that reads a key. A service that sends the keys in the table's order is
 // met by the guess.
 std::size_t row_of(const Tree &tree, std::string_view key, std::size_t guess) noexcept {
+    // No row is read under this one: it marks those that are only sent.
+    if (key.empty())
+        return tree.count;
     if (guess < tree.count && tree.rows[guess].keys.read == key)
         return guess;
     std::size_t number = 0;

@@ -231,6 +231,7 @@ inline constexpr Field kSettingsRows[] = {
     IMS_FIELD(Settings, ehrpd_enabled),
     IMS_FIELD(Settings, ss_csfb_with_ims_error),
     IMS_FIELD(Settings, show_reg_info_to_setting_app),
+    // The service sends these three as text and takes them as numbers.
     IMS_FIELD(Settings, poc_session_expire),
     IMS_FIELD(Settings, poc_ringing_timer),
     IMS_FIELD(Settings, poc_invite_timeout),
@@ -243,7 +244,7 @@ inline constexpr Field kSettingsRows[] = {
 static_assert(std::size(kSettingsRows) == 334);
 static_assert(is_whole_record<Settings>(kSettingsRows));
 
-inline constexpr FieldTable kSettingsFields{kSettingsRows};
+inline constexpr auto kSettingsFields = field_table(kSettingsRows);
 
 // Where writing is not the reverse of reading. The three push-to-talk timers are too, by their
 // type.
@@ -317,7 +318,7 @@ inline constexpr Field kProfileRows[] = {
 static_assert(std::size(kProfileRows) == 51);
 static_assert(is_whole_record<ims_profile_s>(kProfileRows));
 
-inline constexpr FieldTable kProfileFields{kProfileRows};
+inline constexpr auto kProfileFields = field_table(kProfileRows);
 inline constexpr auto kProfileWrite = write_plan(kProfileFields, {}, &WriteRule::update);
 
 } // namespace ims

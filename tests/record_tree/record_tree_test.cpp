@@ -107,6 +107,15 @@ TEST(RecordTree, WritesEachKindOfRow) {
                  "'chosen': <{'number': <int64 -1>, 'text': <'a'>}>, 'selector': <int64 1>}"));
 }
 
+// Rows that are only sent have no key to be read under, and the empty one is not theirs.
+TEST(RecordTree, ReadsNothingUnderTheEmptyKey) {
+    const ims::Variant dictionary = ims::owned(g_variant_new_parsed(
+        "{'': <true>, 'flag': <false>, '': <int64 5>, '': <'text'>, '': <@aa{sv} []>}"));
+    const ims::Received<kRoot> received{dictionary.get()};
+    const ims::Received<kRoot> empty{ims::owned(g_variant_new_parsed("@a{sv} {}")).get()};
+    EXPECT_EQ(std::memcmp(&received.record, &empty.record, sizeof received.record), 0);
+}
+
 TEST(RecordTree, WritesNoMoreLinksThanAsked) {
     Link second{nullptr, nullptr};
     Link first{nullptr, &second};
