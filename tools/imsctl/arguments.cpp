@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "arguments.hpp"
 
+#include "failure.hpp"
 #include "suggestions.hpp"
 
 #include <CLI/CLI.hpp>
@@ -249,6 +250,18 @@ Argument<std::optional<IntSet>> Arguments::set(const std::string &names, const s
         });
     complete_with(names, {members.begin(), members.end()});
     return value;
+}
+
+std::function<void()> Arguments::no_effect_beside(const std::string &name,
+                                                  const std::vector<std::string> &others) {
+    return [&verb = verb_, name, others] {
+        if (verb.count(name) == 0)
+            return;
+        for (const std::string &other : others)
+            if (verb.count(other) > 0)
+                throw Failure(FailureKind::kUsage,
+                              fmt::format("{} has no effect with {}", other, name));
+    };
 }
 
 Argument<double> Arguments::seconds(const std::string &names, const std::string &help,

@@ -6,6 +6,7 @@
 #include "session_choice.hpp"
 
 #include <array>
+#include <functional>
 #include <ims.h>
 #include <map>
 #include <memory>
@@ -66,6 +67,10 @@ class Arguments {
     // Four integers, or the members that are 1 by name; nothing when it is left out.
     Argument<std::optional<IntSet>> set(const std::string &names, const std::string &help,
                                         std::span<const std::string_view> members);
+
+    // Refuses, once the command line is parsed, each of `others` that is given beside `name`.
+    std::function<void()> no_effect_beside(const std::string &name,
+                                           const std::vector<std::string> &others);
 
     Argument<double> seconds(const std::string &names, const std::string &help, double fallback);
 

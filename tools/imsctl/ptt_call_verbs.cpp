@@ -5,6 +5,7 @@
 #include "watching.hpp"
 
 #include <fmt/format.h>
+#include <limits>
 
 namespace imsctl {
 namespace {
@@ -69,17 +70,29 @@ void start_ad_hoc(Invocation &run, const Offer &given, const std::string &subjec
     run.request({}, with_record(ims_poc_make_ad_hoc_call, info), decode_session_id);
 }
 
+// The session whose users change; 0 when it is left out.
+Argument<std::int32_t> change_of(Arguments &arguments, const char *name, const char *help) {
+    return arguments.number_from(1, std::numeric_limits<std::int32_t>::max(), name, help, 0);
+}
+
 Action prepare_ad_hoc(Arguments &arguments) {
     const auto uris = arguments.texts("USER", "whom it is about, one or more");
-    const auto add_to = arguments.number("--add-to", "add the users to this session", 0);
+    const auto add_to = change_of(arguments, "--add-to", "add the users to this session");
     const auto remove_from =
-        arguments.number("--remove-from", "remove the users from this session", 0);
+        change_of(arguments, "--remove-from", "remove the users from this session");
     const auto subject = arguments.text_or("--subject", "what the call is about", "");
     const auto anonymous = arguments.flag("--anonymous", "hide the users from each other");
     const Offer given = offer(arguments);
+    std::vector<std::string> of_new_calls = {"--subject", "--crisis",   "--floor",   "--name",
+                                             "--media",   "--priority", "--no-wait", "--talk-time"};
+    const auto check_adding = arguments.no_effect_beside("--add-to", of_new_calls);
+    of_new_calls.insert(of_new_calls.end(), {"--automatic", "--answer-time"});
+    const auto check_removing = arguments.no_effect_beside("--remove-from", of_new_calls);
     return [=](Invocation &run) {
         if (*add_to != 0 && *remove_from != 0)
             throw Failure(FailureKind::kUsage, "--add-to and --remove-from exclude each other");
+        check_adding();
+        check_removing();
         const PttUserChain users(*uris, *anonymous);
         if (*add_to == 0 && *remove_from == 0)
             return start_ad_hoc(run, given, *subject, users);
@@ -133,9 +146,12 @@ Action prepare_modify(Arguments &arguments) {
     const PttTerms terms = ptt_terms(arguments);
     const auto reference =
         arguments.number("--reference", "a number that comes back with the outcome", 0);
+    const auto check_rejecting = arguments.no_effect_beside(
+        "--reject", {"--media", "--priority", "--no-wait", "--talk-time", "--reference"});
     return [=](Invocation &run) {
         if (*accept && *reject)
             throw Failure(FailureKind::kUsage, "--accept and --reject exclude each other");
+        check_rejecting();
         if (*reject)
             return on_number(session, ims_poc_reject_call_modify)(run);
         const auto info = media_record(*session, *reference, *media, terms.set());
