@@ -255,7 +255,7 @@ TEST_P(EndingSignal, EndsTheMonitorWithStatusZero) {
     EXPECT_EQ(monitor.error(), "monitoring slot 0\n");
 }
 
-INSTANTIATE_TEST_SUITE_P(All, EndingSignal, ::testing::Values(SIGINT, SIGTERM));
+INSTANTIATE_TEST_SUITE_P(All, EndingSignal, ::testing::Values(SIGINT, SIGTERM, SIGHUP));
 
 TEST(MonitorWithoutService, Fails) {
     const PrivateBus bus;

@@ -15,6 +15,13 @@ gboolean raise_flag(gpointer flag) {
     return G_SOURCE_CONTINUE;
 }
 
+// As nohup has it. A signal that is blocked is not ignored any more.
+bool is_ignored(int number) {
+    struct sigaction action {};
+    sigaction(number, nullptr, &action);
+    return action.sa_handler == SIG_IGN;
+}
+
 guint milliseconds(Seconds seconds) {
     return static_cast<guint>(std::ceil(std::clamp(seconds, 0.0, kLongestWait) * 1000));
 }
@@ -32,6 +39,8 @@ StopSignals::StopSignals() {
     sigemptyset(&signals_);
     sigaddset(&signals_, SIGINT);
     sigaddset(&signals_, SIGTERM);
+    if (!is_ignored(SIGHUP))
+        sigaddset(&signals_, SIGHUP);
     pthread_sigmask(SIG_BLOCK, &signals_, &mask_before_);
     descriptor_ = signalfd(-1, &signals_, SFD_CLOEXEC | SFD_NONBLOCK);
     source_.reset(g_unix_fd_source_new(descriptor_, G_IO_IN));

@@ -37,7 +37,8 @@ class Alarm {
     bool raised_ = false;
 };
 
-// Takes SIGINT and SIGTERM into the main context, and tells who sent them.
+// Takes SIGINT, SIGTERM and SIGHUP into the main context, and tells who sent them. Leaves SIGHUP
+// alone where it is ignored.
 // To be made before any thread is.
 class StopSignals {
   public:
