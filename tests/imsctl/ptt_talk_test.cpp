@@ -9,6 +9,7 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 #include <optional>
+#include <termios.h>
 #include <unistd.h>
 
 namespace test {
@@ -30,6 +31,14 @@ class PttTalk : public ::testing::Test {
         process_.emplace(imsctl_command(split("ptt talk 1 " + words)), strict_environment());
         process_->wait_for_error("talking in session 1 of slot 0\n");
         return *process_;
+    }
+
+    // In a shell in which "imsctl" is the program.
+    void talk_in_shell(std::string script) {
+        const std::string name = "imsctl";
+        script.replace(script.find(name), name.size(), "\"" IMSCTL_PATH "\"");
+        process_.emplace(std::vector<std::string>{"sh", "-c", script}, strict_environment());
+        process_->wait_for_error("talking in session 1 of slot 0\n");
     }
 
     // About a session, with a cause.
@@ -110,6 +119,55 @@ TEST_F(PttTalk, FailsWhenTheRequestIsRefused) {
     EXPECT_EQ(calls(kRelease), 0u);
 }
 
+TEST_F(PttTalk, GivesTheFloorBackWhenNobodyTakesItsOutput) {
+    for (const char *reader : {"| head -1", "| :", ">/dev/full"}) {
+        const std::size_t before = calls(kRequest);
+        talk_in_shell("{ imsctl ptt talk 1; echo status=$? >&2; } " + std::string(reader));
+        peer_.wait_for_calls(kRequest, before + 1);
+        emit_floor("PocCallFloorGranted", 1);
+        EXPECT_EQ(process_->wait(), 0) << reader;
+        EXPECT_THAT(process_->error(), testing::EndsWith("status=1\n")) << reader;
+        EXPECT_EQ(calls(kRelease), before + 1) << reader;
+    }
+}
+
+TEST_F(PttTalk, EndsOnEachSignalThatAsksForIt) {
+    for (const int number : {SIGINT, SIGTERM, SIGHUP}) {
+        const std::size_t before = calls(kRequest);
+        Process &process = talk("");
+        peer_.wait_for_calls(kRequest, before + 1);
+        process.send_signal(number);
+        EXPECT_EQ(process.wait(), 0) << number << process.both();
+        EXPECT_EQ(calls(kRelease), before + 1) << number;
+    }
+}
+
+TEST_F(PttTalk, DoesNotWaitForAnybodyWhenTheBusIsGone) {
+    Process &process = talk("--json");
+    peer_.wait_for_calls(kRequest, 1);
+    bus_.stop();
+    EXPECT_EQ(process.wait(), 1);
+    EXPECT_EQ(json_lines(process.output()).back()["error"]["kind"], "unreachable");
+    EXPECT_EQ(calls(kRelease), 0u);
+}
+
+TEST_F(PttTalk, GivesBackWhatItMayHaveGotWithoutAnAnswer) {
+    peer_.on(kRequest, failure(error_name::kNoReply));
+    EXPECT_EQ(talk("").wait(), 1) << process_->both();
+    EXPECT_THAT(process_->error(), HasSubstr("the floor request: "));
+    EXPECT_EQ(calls(kRelease), 1u);
+}
+
+TEST_F(PttTalk, GoesOnWhenAHangUpIsIgnored) {
+    talk_in_shell("trap '' HUP; exec imsctl ptt talk 1");
+    peer_.wait_for_calls(kRequest, 1);
+    process_->send_signal(SIGHUP);
+    emit_floor("PocCallFloorGranted", 1);
+    process_->wait_for_output("the floor is yours for 30 s\n");
+    process_->send_signal(SIGINT);
+    EXPECT_EQ(process_->wait(), 0) << process_->both();
+}
+
 // A terminal of the test's own, whose keys it presses.
 class Terminal {
   public:
@@ -123,34 +181,74 @@ class Terminal {
 
     std::string name() const { return ptsname(descriptor_); }
     void press(char key) const { ASSERT_EQ(write(descriptor_, &key, 1), 1); }
+    bool echoes() const {
+        termios state{};
+        return tcgetattr(descriptor_, &state) == 0 && (state.c_lflag & ECHO) != 0;
+    }
 
   private:
     int descriptor_;
 };
 
-TEST_F(PttTalk, HasTheFloorWhileAKeyIsHeld) {
-    const Terminal terminal;
-    std::vector<std::string> command = {"sh", "-c", "exec \"$@\" < " + terminal.name(), "sh"};
-    for (std::string &word : imsctl_command(split("ptt talk 1 --key")))
-        command.push_back(std::move(word));
-    process_.emplace(command, strict_environment());
-    process_->wait_for_error("talking in session 1 of slot 0\n");
-    process_->wait_for_error("hold a key to talk, q ends\n");
-    EXPECT_EQ(calls(kRequest), 0u);
+class PttTalkByKey : public PttTalk {
+  protected:
+    PttTalkByKey() {
+        talk_in_shell("exec imsctl ptt talk 1 --key <" + terminal_.name());
+        process_->wait_for_error("hold a key to talk, q ends\n");
+    }
 
-    terminal.press(' ');
+    Terminal terminal_;
+};
+
+TEST_F(PttTalkByKey, HasTheFloorWhileAKeyIsHeld) {
+    EXPECT_EQ(calls(kRequest), 0u);
+    terminal_.press(' ');
     peer_.wait_for_calls(kRequest, 1);
-    terminal.press(' '); // repeats itself
+    terminal_.press(' '); // repeats itself
     peer_.wait_for_calls(kRelease, 1);
     EXPECT_EQ(calls(kRequest), 1u);
 
-    terminal.press('x');
+    terminal_.press('x');
     peer_.wait_for_calls(kRequest, 2);
     emit_floor("PocCallFloorRejected", 1, 1); // one may press it again
     process_->wait_for_output("no floor, taken\n");
-    terminal.press('q');
+    terminal_.press('q');
+    EXPECT_EQ(process_->wait(), 0) << process_->both();
+    // The second press was still held.
+    EXPECT_EQ(calls(kRelease), 2u);
+}
+
+TEST_F(PttTalkByKey, GivesBackWhateverTheServiceSaidOfAnEarlierRequest) {
+    terminal_.press(' ');
+    peer_.wait_for_calls(kRelease, 1);
+    terminal_.press(' ');
+    peer_.wait_for_calls(kRequest, 2);
+    emit_floor("PocCallFloorCanceled", 1, 3); // the first request
+    emit_floor("PocCallFloorGranted", 1);     // the second
+    process_->wait_for_output("the floor is yours for 30 s\n");
+    peer_.wait_for_calls(kRelease, 2);
+    terminal_.press('q');
+    EXPECT_EQ(process_->wait(), 0) << process_->both();
+    EXPECT_EQ(calls(kRelease), 2u);
+}
+
+TEST_F(PttTalkByKey, SaysNothingOfAReleaseThatComesTooLate) {
+    peer_.on(kRelease, reply("(i)", "(13,)"));
+    terminal_.press(' ');
+    peer_.wait_for_calls(kRelease, 1);
+    terminal_.press('q');
+    EXPECT_EQ(process_->wait(), 0) << process_->both();
+    EXPECT_THAT(process_->error(), testing::EndsWith("q ends\n"));
+}
+
+TEST_F(PttTalkByKey, GivesFloorAndTerminalBackWhenTheTerminalHangsUp) {
+    EXPECT_FALSE(terminal_.echoes());
+    terminal_.press(' ');
+    peer_.wait_for_calls(kRequest, 1);
+    process_->send_signal(SIGHUP);
     EXPECT_EQ(process_->wait(), 0) << process_->both();
     EXPECT_EQ(calls(kRelease), 1u);
+    EXPECT_TRUE(terminal_.echoes());
 }
 
 } // namespace

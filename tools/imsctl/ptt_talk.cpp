@@ -31,6 +31,11 @@ constexpr int kFollowed[] = {
     IMS_NOTI_POC_CALL_FLOOR_REQUEST_TIMEOUT,
 };
 
+using FloorRequest = int (*)(ims_h, const ims_poc_floor_s *, ims_response_cb, void *);
+
+// What a release of a floor that is not ours any more is answered with.
+constexpr int kWrongState = 13;
+
 class Talk {
   public:
     Talk(Invocation &run, const TalkArguments &given) : run_(run), given_(given) {
@@ -41,13 +46,13 @@ class Talk {
 
     void ask() {
         wanted_ = true;
-        send("request", ims_poc_call_request_floor);
+        send(ims_poc_call_request_floor);
     }
 
-    // Whether it is had, waited for, or not even answered yet.
+    // Whatever the service said of it: that may have been about an earlier request.
     void give_back() {
-        if (std::exchange(wanted_, false))
-            send("release", ims_poc_call_release_floor);
+        if (std::exchange(wanted_, false) && !lost_)
+            send(ims_poc_call_release_floor);
     }
 
     // Why the service did not even take a request.
@@ -55,9 +60,12 @@ class Talk {
         if (refused_.empty())
             return;
         const std::string message = std::exchange(refused_, "");
-        if (!*given_.key)
+        if (!*given_.key) {
+            // Without an answer it may be had all the same.
+            lost_ = result_ != IMS_RESPONSE_FAILED;
             throw Failure(response_failure(result_).kind, message, response_failure(result_).hint,
                           {{"result", std::int64_t{result_}}});
+        }
         run_.output().note("imsctl: ptt talk: " + message);
     }
 
@@ -80,38 +88,40 @@ class Talk {
     void look_at(const Event &event) {
         switch (event.row->id) {
         case IMS_NOTI_POC_CALL_ENDED:
-            wanted_ = false;
-            throw Failure(
-                FailureKind::kCallEnded, event.row->summary(event.fields), "",
-                {{"session_id", *event.number("value_1")}, {"reason", *event.number("value_2")}});
+            lose(
+                {FailureKind::kCallEnded,
+                 event.row->summary(event.fields),
+                 "",
+                 {{"session_id", *event.number("value_1")}, {"reason", *event.number("value_2")}}});
         case IMS_NOTI_POC_CALL_FLOOR_REJECTED:
         case IMS_NOTI_POC_CALL_FLOOR_CANCELED:
         case IMS_NOTI_POC_CALL_FLOOR_REQUEST_TIMEOUT:
-            lose(event);
+            // Of no importance to one who may press the key again.
+            if (!*given_.key)
+                lose({FailureKind::kFloor,
+                      event.row->summary(event.fields),
+                      "",
+                      {{"session_id", *event.number("value_1")},
+                       {"cause", *event.number("value_6")}}});
             break;
         default:
             break;
         }
     }
 
-    // Of no importance when it was given back, or to one who may press the key again.
-    void lose(const Event &event) {
-        if (!std::exchange(wanted_, false) || *given_.key)
-            return;
-        throw Failure(
-            FailureKind::kFloor, event.row->summary(event.fields), "",
-            {{"session_id", *event.number("value_1")}, {"cause", *event.number("value_6")}});
+    [[noreturn]] void lose(const Failure &failure) {
+        lost_ = true;
+        throw failure;
     }
 
-    void send(std::string_view what,
-              int (*request)(ims_h, const ims_poc_floor_s *, ims_response_cb, void *)) {
+    void send(FloorRequest request) {
         ++unanswered_;
-        run_.client().send(with_record(request, floor_), [this, what](int result) {
+        run_.client().send(with_record(request, floor_), [this, request](int result) {
             --unanswered_;
-            if (result == 0)
+            const bool releases = request == ims_poc_call_release_floor;
+            if (result == 0 || (releases && result == kWrongState))
                 return;
-            if (what == "request")
-                wanted_ = false;
+            const char *what = releases ? "release" : "request";
             refused_ = fmt::format("the floor {}: {}", what, response_failure(result).what());
             result_ = result;
         });
@@ -120,7 +130,8 @@ class Talk {
     Invocation &run_;
     const TalkArguments &given_;
     ims_poc_floor_s floor_{};
-    bool wanted_ = false;
+    bool wanted_ = false; // by the user
+    bool lost_ = false;   // for good: nothing is left to give back
     int unanswered_ = 0;
     int result_ = 0;
     std::string refused_;
@@ -149,13 +160,24 @@ Action prepare_ptt_talk(Arguments &arguments) {
         } else {
             talk.ask();
         }
-        watch.until_end([&](const Event &event) { return talk.take(event); },
-                        [&] {
-                            talk.check();
-                            return key && key->wants_end();
-                        });
+        const auto is_settled = [&] { return talk.is_settled(); };
+        try {
+            watch.until_end([&](const Event &event) { return talk.take(event); },
+                            [&] {
+                                talk.check();
+                                return key && key->wants_end();
+                            });
+        } catch (...) {
+            key.reset();
+            if (!watch.bus_is_gone()) {
+                talk.give_back();
+                watch.finish_soon(is_settled);
+            }
+            throw;
+        }
+        key.reset(); // so that it does not ask again
         talk.give_back();
-        watch.finish([&] { return talk.is_settled(); });
+        watch.finish(is_settled);
         talk.check();
     };
 }

@@ -54,14 +54,19 @@ void Watch::until_end(const std::function<bool(const Event &)> &show,
 }
 
 void Watch::finish(const std::function<bool()> &done) {
-    const bool ending = signals_.arrived();
-    run_until(ending ? kLastMoment : run_.settings().timeout,
-              [&] { return done() || (!ending && signals_.arrived()); });
+    if (signals_.arrived())
+        return finish_soon(done);
+    run_until(run_.settings().timeout, [&] { return done() || signals_.arrived(); });
+    check_bus();
+}
+
+void Watch::finish_soon(const std::function<bool()> &done) {
+    run_until(kLastMoment, done);
     check_bus();
 }
 
 void Watch::check_bus() const {
-    if (signals_.own())
+    if (bus_is_gone())
         throw bus_break_failure();
 }
 

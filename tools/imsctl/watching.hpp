@@ -26,8 +26,8 @@ class Watch {
     Watch(Invocation &run, const WatchLimits &limits, const std::vector<const EventRow *> &rows,
           std::string_view what);
 
-    // Until SIGINT, SIGTERM or a limit, or until nobody reads any more. `show` tells whether it
-    // showed something that counts.
+    // Until SIGINT, SIGTERM, SIGHUP or a limit, or until nobody reads any more. `show` tells
+    // whether it showed something that counts.
     void until_end(const std::function<bool(const Event &)> &show);
     // The same, or until `enough` says so.
     void until_end(const std::function<bool(const Event &)> &show,
@@ -35,6 +35,10 @@ class Watch {
 
     // Waits for what is still under way: not for long when somebody wants the end.
     void finish(const std::function<bool()> &done);
+    // Not for long in any case.
+    void finish_soon(const std::function<bool()> &done);
+
+    bool bus_is_gone() const { return signals_.own(); }
 
   private:
     void check_bus() const;
