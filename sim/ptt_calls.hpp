@@ -193,6 +193,8 @@ class PttCalls {
     void pass_floor_on(PttCall &call);
     void cut_off(PttRef ref);
     void stop_waiting(PttRef ref);
+    // From one who has it or waits for it; of others nothing is taken.
+    void cancel_floor(PttCall &call, const PttParticipant &speaker, PttFloorCause cause);
     void forget_speaker(PttCall &call, int who);
     void tell_positions(PttCall &call);
     void tell_floor(const PttCall &call, const PttParticipant &participant) const;

@@ -17,8 +17,12 @@ Status PttCalls::set_channel(int slot, std::int32_t channel, PttChannelMode mode
     here.channel_mode = mode;
     if (channel == here.channel) {
         for (const auto &[session, ref] : here.sessions)
-            if (find(ref.call)->type == PttCallType::kChannel)
-                find(ref)->listens_only = mode == PttChannelMode::kListenOnly;
+            if (PttCall &call = *find(ref.call); call.type == PttCallType::kChannel) {
+                PttParticipant &self = *find(ref);
+                self.listens_only = mode == PttChannelMode::kListenOnly;
+                if (self.listens_only)
+                    cancel_floor(call, self, PttFloorCause::kListensOnly);
+            }
         return Done{};
     }
     leave_channel(slot);

@@ -178,16 +178,26 @@ Status PttCalls::release_floor(int slot, std::int32_t session) {
     if (call.floor.position(self.ref.who) == 0)
         return refuse(Result::kWrongState, "session {} neither has the floor nor waits for it",
                       session);
-    forget_speaker(call, self.ref.who);
-    emit(self, floor_event(PttFloorKind::kCanceled, call, self, PttFloorCause::kWithdrawn));
+    cancel_floor(call, self, PttFloorCause::kWithdrawn);
     return Done{};
 }
 
 void PttCalls::cut_off(PttRef ref) {
     PttCall &call = *find(ref.call);
-    const PttParticipant &holder = *call.find(ref.who);
-    emit(holder, floor_event(PttFloorKind::kCanceled, call, holder, PttFloorCause::kTalkedTooLong));
-    pass_floor_on(call);
+    cancel_floor(call, *call.find(ref.who), PttFloorCause::kTalkedTooLong);
+}
+
+void PttCalls::cancel_floor(PttCall &call, const PttParticipant &speaker, PttFloorCause cause) {
+    const auto tell = [&] {
+        emit(speaker, floor_event(PttFloorKind::kCanceled, call, speaker, cause));
+    };
+    if (call.floor.held_by(speaker.ref.who)) {
+        tell(); // while the event still names the speaker
+        pass_floor_on(call);
+    } else if (call.floor.position(speaker.ref.who) != 0) {
+        forget_speaker(call, speaker.ref.who);
+        tell();
+    }
 }
 
 void PttCalls::stop_waiting(PttRef ref) {

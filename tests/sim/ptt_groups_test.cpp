@@ -133,6 +133,34 @@ TEST_F(PttGroups, AChannelIsForThoseWhoAreTunedToIt) {
     EXPECT_EQ(take_names(0).back(), "PocCallFloorIdle");
 }
 
+TEST_F(PttGroups, WhoeverTurnsToListeningOnlyNeitherSpeaksNorWaits) {
+    using enum PttChannelMode;
+    for (const int slot : {0, 1, 2})
+        expect_accepted(ptt_.set_channel(slot, 5, kTalkAndListen));
+    place(0, "", PttCallType::kChannel);
+    advance(2s);
+    for (const int slot : {0, 1, 2})
+        expect_accepted(ask_floor(slot));
+    forget_events();
+    expect_accepted(ptt_.set_channel(1, 5, kListenOnly));
+    EXPECT_THAT(take_floor(1),
+                ElementsAre("PocCallFloorCanceled (1, <[1, 0, 0, 0]>, 0, 'tel:+15550100', 3, '', "
+                            "0, 0, 3, 'this participant listens only')"));
+    EXPECT_THAT(take_floor(2), ElementsAre(testing::StartsWith("PocCallFloorQueuePosition")));
+    forget_events();
+    expect_accepted(ptt_.set_channel(0, 5, kListenOnly));
+    EXPECT_THAT(take_floor(0),
+                ElementsAre("PocCallFloorCanceled (1, <[1, 0, 0, 0]>, 0, 'tel:+15550100', 3, '', "
+                            "0, 0, 3, 'this participant listens only')",
+                            testing::StartsWith("PocCallFloorTaken (1, <[1, 0, 0, 0]>, 0, "
+                                                "'tel:+15550102'")));
+    EXPECT_THAT(take_floor(2), ElementsAre(testing::StartsWith("PocCallFloorGranted")));
+    expect_accepted(ptt_.set_channel(1, 5, kListenOnly)); // nothing is left to take
+    EXPECT_THAT(take(1), testing::Each(testing::Not(HasSubstr("Canceled"))));
+    expect_accepted(ptt_.release_floor(2, 1));
+    EXPECT_EQ(timers_.next_due(), std::nullopt);
+}
+
 TEST_F(PttGroups, ChannelsHaveTheirLimits) {
     for (const std::int32_t channel : {-1, 17})
         expect_refused(ptt_.set_channel(0, channel, PttChannelMode::kListenOnly),
