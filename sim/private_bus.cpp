@@ -2,6 +2,7 @@
 #include "sim/private_bus.hpp"
 
 #include "sim/child.hpp"
+#include "sim/descriptor.hpp"
 #include "sim/glib_ref.hpp"
 
 #include <array>
@@ -21,22 +22,6 @@ namespace {
 constexpr int kStartMilliseconds = 10000;
 constexpr int kConfigFd = 3;
 constexpr int kAddressFd = 4;
-
-class Fd {
-  public:
-    explicit Fd(int fd) : fd_(fd) {}
-    Fd(const Fd &) = delete;
-    Fd &operator=(const Fd &) = delete;
-    ~Fd() { close_now(); }
-    int get() const { return fd_; }
-    void close_now() {
-        if (fd_ >= 0)
-            close(std::exchange(fd_, -1));
-    }
-
-  private:
-    int fd_;
-};
 
 // Everybody of the same user may do everything; without a type the bus reads no other files.
 std::string configuration() {
@@ -83,27 +68,27 @@ PrivateBus::~PrivateBus() {
 }
 
 std::optional<std::string> PrivateBus::start() {
-    const Fd config(memfd_create("ims-sim-bus", MFD_CLOEXEC));
+    const Descriptor config(memfd_create("ims-sim-bus", MFD_CLOEXEC));
     const auto text = configuration();
-    if (config.get() < 0 ||
-        write(config.get(), text.data(), text.size()) != static_cast<ssize_t>(text.size()))
+    if (!config ||
+        write(config.number(), text.data(), text.size()) != static_cast<ssize_t>(text.size()))
         return fmt::format("no memory for the configuration of the bus: {}", strerror(errno));
 
     std::array<int, 2> ends{};
     if (pipe2(ends.data(), O_CLOEXEC) != 0)
         return fmt::format("no pipe to the bus: {}", strerror(errno));
-    const Fd reading(ends[0]);
-    Fd writing(ends[1]);
+    const Descriptor reading(ends[0]);
+    Descriptor writing(ends[1]);
 
     // What the bus says matters when it does not start; otherwise it would only stand between
     // the lines of the command.
-    const Fd complaints(memfd_create("ims-sim-bus-errors", MFD_CLOEXEC));
+    const Descriptor complaints(memfd_create("ims-sim-bus-errors", MFD_CLOEXEC));
     const auto started = spawn(
         {.command = {"dbus-daemon", "--nofork", fmt::format("--config-file=/dev/fd/{}", kConfigFd),
                      fmt::format("--print-address={}", kAddressFd)},
          .environment = {},
-         .descriptors = {{config.get(), kConfigFd}, {writing.get(), kAddressFd}},
-         .error_output = complaints.get(),
+         .descriptors = {{config.number(), kConfigFd}, {writing.number(), kAddressFd}},
+         .error_output = complaints.number(),
          .death_signal = SIGTERM,
          .own_session = true});
     if (const auto *error = std::get_if<SpawnError>(&started))
@@ -111,10 +96,10 @@ std::optional<std::string> PrivateBus::start() {
                            "dbus-daemon",
                            error->text);
     pid_ = std::get<pid_t>(started);
-    writing.close_now();
-    address_ = read_line(reading.get());
+    writing = Descriptor();
+    address_ = read_line(reading.number());
     if (address_.empty())
-        return fmt::format("dbus-daemon did not start: {}", content(complaints.get()));
+        return fmt::format("dbus-daemon did not start: {}", content(complaints.number()));
     return std::nullopt;
 }
 

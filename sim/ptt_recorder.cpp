@@ -4,9 +4,8 @@
 #include "sim/ptt_media.hpp"
 
 #include <cerrno>
-#include <cstring>
 #include <fcntl.h>
-#include <filesystem>
+#include <sys/stat.h>
 #include <system_error>
 #include <unistd.h>
 
@@ -18,19 +17,29 @@ constexpr int kMostNames = 1000;
 
 } // namespace
 
-PttRecorder::File::~File() {
-    if (descriptor_ >= 0)
-        close(descriptor_);
+int PttRecorder::File::create(const std::filesystem::path &path) {
+    directory_ = Descriptor(open(path.parent_path().c_str(), O_PATH | O_DIRECTORY | O_CLOEXEC));
+    if (!directory_)
+        return errno;
+    name_ = path.filename();
+    descriptor_ = Descriptor(openat(directory_.number(), name_.c_str(),
+                                    O_WRONLY | O_CREAT | O_EXCL | O_NOFOLLOW | O_CLOEXEC, 0600));
+    return descriptor_ ? 0 : errno;
 }
 
-int PttRecorder::File::create(const std::string &path) {
-    descriptor_ = open(path.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_NOFOLLOW | O_CLOEXEC, 0600);
-    return descriptor_ < 0 ? errno : 0;
+void PttRecorder::File::remove() const {
+    struct stat own {};
+    struct stat there {};
+    if (fstat(descriptor_.number(), &own) != 0 ||
+        fstatat(directory_.number(), name_.c_str(), &there, AT_SYMLINK_NOFOLLOW) != 0)
+        return;
+    if (own.st_dev == there.st_dev && own.st_ino == there.st_ino)
+        unlinkat(directory_.number(), name_.c_str(), 0);
 }
 
 void PttRecorder::File::write(std::string_view text) const {
     while (!text.empty()) {
-        const ssize_t written = ::write(descriptor_, text.data(), text.size());
+        const ssize_t written = ::write(descriptor_.number(), text.data(), text.size());
         if (written < 0 && errno == EINTR)
             continue;
         // A full disk makes the recording short and harms nothing else.
@@ -80,7 +89,6 @@ Answer<PttRecordingInfo> PttRecorder::start(int slot, const PttRecordRequest &re
     const auto path = create(key, request.path, recording.file);
     if (!path)
         return path.refusal();
-    recording.path = *path;
     recording.source = request.source;
     if (request.longest > 0)
         recording.limit = timers_.after_waiting(std::chrono::seconds(request.longest),
@@ -138,7 +146,7 @@ Status PttRecorder::cancel(int slot, std::int32_t session) {
     const auto found = running({slot, session});
     if (!found)
         return found.refusal();
-    unlink((*found)->path.c_str());
+    (*found)->file.remove();
     recordings_.erase({slot, session});
     return Done{};
 }

@@ -2,11 +2,13 @@
 #pragma once
 
 #include "sim/clock.hpp"
+#include "sim/descriptor.hpp"
 #include "sim/ptt_calls.hpp"
 #include "sim/ptt_events.hpp"
 #include "sim/result.hpp"
 
 #include <cstdint>
+#include <filesystem>
 #include <map>
 #include <string>
 #include <string_view>
@@ -47,22 +49,18 @@ class PttRecorder {
     // A file that did not exist before.
     class File {
       public:
-        File() = default;
-        File(File &&other) noexcept : descriptor_(std::exchange(other.descriptor_, -1)) {}
-        File &operator=(File &&other) noexcept {
-            std::swap(descriptor_, other.descriptor_);
-            return *this;
-        }
-        ~File();
         // 0, or what errno says.
-        int create(const std::string &path);
+        int create(const std::filesystem::path &path);
         void write(std::string_view text) const;
+        // Whatever has taken its place in the directory meanwhile stays.
+        void remove() const;
 
       private:
-        int descriptor_ = -1;
+        Descriptor directory_; // the one it was made in, whatever its path leads to later
+        std::string name_;
+        Descriptor descriptor_;
     };
     struct Recording {
-        std::string path;
         File file;
         PttRecordSource source = PttRecordSource::kAll;
         bool paused = false;

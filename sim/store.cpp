@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "sim/store.hpp"
 
+#include "sim/descriptor.hpp"
+
 #include <cerrno>
 #include <cstring>
 #include <fcntl.h>
@@ -15,22 +17,6 @@ namespace {
 
 // Settings hold passwords: the files are for their owner alone.
 constexpr mode_t kFileMode = 0600;
-
-class Descriptor {
-  public:
-    explicit Descriptor(int number) : number_(number) {}
-    Descriptor(const Descriptor &) = delete;
-    Descriptor &operator=(const Descriptor &) = delete;
-    ~Descriptor() {
-        if (number_ >= 0)
-            close(number_);
-    }
-    explicit operator bool() const { return number_ >= 0; }
-    int number() const { return number_; }
-
-  private:
-    int number_;
-};
 
 Refusal failure(std::string_view what, const std::string &path) {
     return refuse(Result::kFailed, "cannot {} {}: {}", what, path, std::strerror(errno));

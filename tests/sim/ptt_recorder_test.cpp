@@ -83,6 +83,32 @@ TEST_F(PttRecorderTest, ACancelledOneIsGone) {
     EXPECT_FALSE(std::filesystem::exists(own->path)) << own->path;
 }
 
+TEST_F(PttRecorderTest, CancellingRemovesNoFileThatIsNotItsOwn) {
+    namespace fs = std::filesystem;
+    const auto file = [this](const char *name) { return directory_of_files_.file(name); };
+    connect_two();
+    fs::create_directory(file("chosen"));
+    fs::create_directory(file("precious"));
+    put_content(file("precious/call.txt"), "precious");
+    // Another directory where the one it was made in has been.
+    expect_accepted(recorder_.start(0, {1, PttRecordSource::kAll, 0, file("chosen/call.txt")}));
+    fs::rename(file("chosen"), file("moved"));
+    fs::create_directory_symlink(file("precious"), file("chosen"));
+    expect_accepted(recorder_.cancel(0, 1));
+    EXPECT_EQ(content_of(file("precious/call.txt")), "precious");
+    EXPECT_FALSE(fs::exists(file("moved/call.txt")));
+    // Another file, or a link to one, where it has been itself.
+    expect_accepted(recorder_.start(0, {1, PttRecordSource::kAll, 0, file("moved/call.txt")}));
+    fs::rename(file("precious/call.txt"), file("moved/call.txt"));
+    expect_accepted(recorder_.cancel(0, 1));
+    EXPECT_EQ(content_of(file("moved/call.txt")), "precious");
+    expect_accepted(recorder_.start(0, {1, PttRecordSource::kAll, 0, file("moved/link.txt")}));
+    fs::rename(file("moved/link.txt"), file("moved/own.txt"));
+    fs::create_symlink("own.txt", file("moved/link.txt"));
+    expect_accepted(recorder_.cancel(0, 1));
+    EXPECT_TRUE(fs::is_symlink(file("moved/link.txt")));
+}
+
 TEST_F(PttRecorderTest, WhatMakesNoSenseIsRefused) {
     expect_refused(start(), Result::kUnknownSession, "session 1");
     expect_refused(recorder_.pause(0, 1), Result::kUnknownSession, "session 1");
