@@ -222,11 +222,19 @@ Answer<std::vector<PttContact>> PttCalls::others(int slot, std::int32_t session,
     std::vector<PttContact> others;
     for (const auto &[who, participant] : place->call.participants)
         if (who != place->self.ref.who && participant.connected()) {
-            others.push_back(participant.contact);
-            others.back().session = participant.session;
-            others.back().group_uri = place->call.uri;
+            PttContact &other = others.emplace_back(participant.contact);
+            other.uri = participant.uri();
+            other.display_name = participant.name();
+            other.session = participant.session;
+            other.group_uri = place->call.uri;
         }
     return others;
+}
+
+std::string PttCalls::uri_in(int slot, std::int32_t session) {
+    const auto &sessions = line(slot).sessions;
+    const auto found = sessions.find(session);
+    return found == sessions.end() ? directory_.uri_of(slot) : find(found->second)->uri();
 }
 
 Answer<std::string> PttCalls::talking_to(int slot, std::int32_t session) {

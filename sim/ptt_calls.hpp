@@ -126,8 +126,11 @@ class PttCalls {
     Status accept_modify(int slot, const PttModifyRequest &request);
     Status reject_modify(int slot, std::int32_t session);
 
-    // Who takes part beside this slot; refused when the call does not have these media.
+    // Who takes part beside this slot, under the names known in the call; refused when the call
+    // does not have these media.
     Answer<std::vector<PttContact>> others(int slot, std::int32_t session, PttMedia media);
+    // Under which the others know this slot: its own where there is no such session.
+    std::string uri_in(int slot, std::int32_t session);
     Answer<std::string> talking_to(int slot, std::int32_t session);
 
   private:

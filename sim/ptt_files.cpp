@@ -78,6 +78,7 @@ Answer<PttFileReceipt> PttFiles::offer(int slot, PttFileOffer offer) {
     Transfer &transfer = transfers_[id];
     transfer.sender = slot;
     transfer.number = next_number_[static_cast<std::size_t>(slot)]++;
+    transfer.originator = to_peer(calls_.uri_in(slot, offer.session), {});
     transfer.attributes = std::move(offer.attributes);
     if (transfer.attributes.transfer_id.empty())
         transfer.attributes.transfer_id = fmt::format("transfer-{}", id);
@@ -111,9 +112,8 @@ void PttFiles::present_to_slot(LegRef ref) {
     if (!registrations_.registered(leg.to.slot))
         return finish(ref, PttFileEnd::kUnreachable, PttFileEnd::kUnreachable);
     leg.number = next_number_[static_cast<std::size_t>(leg.to.slot)]++;
-    sink_(leg.to.slot, PttIncomingFile{leg.number, to_peer(directory_.uri_of(transfer.sender), {}),
-                                       transfer.attributes, leg.to.session,
-                                       to_peer(leg.to.uri, leg.to.display_name)});
+    sink_(leg.to.slot, PttIncomingFile{leg.number, transfer.originator, transfer.attributes,
+                                       leg.to.session, to_peer(leg.to.uri, leg.to.display_name)});
     expect_answer(ref);
 }
 

@@ -56,6 +56,7 @@ class PttFiles {
     struct Transfer {
         int sender = -1;
         std::int32_t number = 0; // the sender's
+        PttPeer originator;
         PttFileAttributes attributes;
         std::map<std::int32_t, Leg> legs; // by party, from 1
 

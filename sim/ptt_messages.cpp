@@ -78,7 +78,8 @@ Answer<PttMessageReceipt> PttMessages::send(int slot, PttMessage message) {
         message.message_id = fmt::format("message-{}", next_id_++);
     if (message.content_type.empty())
         message.content_type = "text/plain";
-    message.originator = to_peer(directory_.uri_of(slot), message.originator.display_name);
+    message.originator =
+        to_peer(calls_.uri_in(slot, message.session), message.originator.display_name);
     const std::int32_t number = box(slot).next_sent++;
     const auto session = message.session;
     const auto sent = std::make_shared<const Sent>(Sent{slot, number, std::move(message)});
@@ -114,7 +115,8 @@ void PttMessages::deliver_to_slot(const Sent &sent, const PttContact &to) {
     incoming.reference = message.reference;
     incoming.target = to_peer(to.uri, to.display_name);
     receive(to.slot, std::move(incoming),
-            {message.originator, message.message_id, sent.slot, sent.number, message.notices, 0});
+            {message.originator, to.uri, message.message_id, sent.slot, sent.number,
+             message.notices, 0});
 }
 
 void PttMessages::receive(int slot, PttIncomingMessage message, Received received) {
@@ -152,7 +154,7 @@ void PttMessages::echo(const Sent &sent, const PttContact &from) {
     back.route = {kNetwork};
     back.reference = sent.message.reference;
     back.target = sent.message.originator;
-    receive(sent.slot, back, {back.originator, back.message_id, -1, 0, 0, 0});
+    receive(sent.slot, back, {back.originator, {}, back.message_id, -1, 0, 0, 0});
 }
 
 void PttMessages::tell(const Sent &sent, const PttContact &from, PttNotice notice,
@@ -190,12 +192,9 @@ Answer<std::int32_t> PttMessages::notify(int slot, const PttNoticeRequest &reque
     received.told |= bit(request.notice);
     if (received.sender < 0 || (received.wanted & bit(request.notice)) == 0)
         return 0;
-    const PttMessageNotice told{received.sent_number,
-                                to_peer(directory_.uri_of(slot), {}),
-                                received.message_id,
-                                request.notice,
-                                0,
-                                received.originator};
+    const PttMessageNotice told{
+        received.sent_number, to_peer(received.reader, {}), received.message_id, request.notice, 0,
+        received.originator};
     errands_.after(kNoticeTime, [this, sender = received.sender, told] { sink_(sender, told); });
     return 1;
 }

@@ -61,6 +61,7 @@ class PttMessages {
     // What a slot has received and may send notices about.
     struct Received {
         PttPeer originator;
+        std::string reader; // the uri under which the sender knows the slot
         std::string message_id;
         int sender = -1; // the slot to tell; none when the network has sent it
         std::int32_t sent_number = 0;
