@@ -1,8 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 // Requests in any order at any time: whatever they are, the server stays in order.
 #include "ptt_network.hpp"
+#include "settings_directory.hpp"
 
 #include <algorithm>
+#include <filesystem>
 #include <random>
 
 namespace sim::test {
@@ -56,11 +58,90 @@ class PttWalk : public PttNetwork, public testing::WithParamInterface<unsigned> 
             static_cast<void>(
                 ptt_.make_call(slot, {offer(), kGroups[upto(2)], PttCallType::kGroup}));
     }
+    void send_message(int slot, std::int32_t session) {
+        PttMessage message;
+        message.notices = upto(3);
+        message.lifetime = upto(5);
+        if (coin())
+            message.session = session;
+        else
+            message.targets = {to(anybody()), to(kTeam, true)};
+        count(messages_sent_, mail_.send(slot, message));
+    }
+    void offer_file(int slot, std::int32_t session) {
+        PttFileOffer offer;
+        offer.attributes.name = "map.png";
+        offer.attributes.size = upto(1 << 20);
+        if (coin())
+            offer.session = session;
+        else
+            offer.targets = {to(anybody()), to(kTeam, true)};
+        count(files_offered_, files_.offer(slot, offer));
+    }
+    // The latest one, by all whom it has reached.
+    void answer_file(std::int32_t session) {
+        const auto id = fmt::format("transfer-{}", files_offered_);
+        for (int slot = 0; slot < 4; ++slot)
+            for (const std::int32_t where : {0, session})
+                if (coin())
+                    count(files_accepted_, files_.accept(slot, where, id));
+                else
+                    static_cast<void>(files_.reject(slot, where, id));
+    }
+    void start_recording(int slot, std::int32_t session) {
+        const auto path = recordings_.file(std::to_string(recorded_ + 1));
+        count(recorded_,
+              recorder_.start(slot, {session, PttRecordSource{upto(2)}, upto(60), path}));
+    }
+    void change_recording(int slot, std::int32_t session) {
+        if (coin())
+            static_cast<void>(recorder_.pause(slot, session));
+        else
+            static_cast<void>(recorder_.resume(slot, session));
+    }
+    void end_recording(int slot, std::int32_t session) {
+        if (coin())
+            static_cast<void>(recorder_.stop(slot, session));
+        else
+            count(recordings_cancelled_, recorder_.cancel(slot, session));
+    }
+    static void count(int &counter, const auto &answer) { counter += answer ? 1 : 0; }
+
+    void send_or_record(int slot, std::int32_t session) {
+        switch (upto(8)) {
+        case 0:
+            return send_message(slot, session);
+        case 1:
+            return static_cast<void>(
+                mail_.notify(slot, {upto(messages_sent_), {}, {}, PttNotice{1 + upto(1)}}));
+        case 2:
+            return offer_file(slot, session);
+        case 3:
+            return answer_file(session);
+        case 4:
+            return static_cast<void>(files_.cancel(slot, upto(files_offered_)));
+        case 5:
+        case 6:
+            return start_recording(slot, session);
+        case 7:
+            return change_recording(slot, session);
+        default:
+            return end_recording(slot, session);
+        }
+    }
+    // What is over is not known any longer.
+    void expect_nothing_kept(int slot, int sessions) {
+        for (std::int32_t session = 1; session <= sessions; ++session)
+            expect_refused(recorder_.stop(slot, session), Result::kUnknownSession, "session");
+        // A slot gets at most a number for each transfer.
+        for (std::int32_t number = 1; number <= files_offered_; ++number)
+            expect_refused(files_.cancel(slot, number), Result::kUnknownRecord, "no transfer");
+    }
     void step() {
         const int slot = upto(3);
         const std::int32_t session = session_of(slot);
         const PttModifyRequest change{coin(), coin(), session, 0, media(), terms()};
-        switch (upto(18)) {
+        switch (upto(22)) {
         case 0:
         case 1:
             return call(slot);
@@ -94,14 +175,22 @@ class PttWalk : public PttNetwork, public testing::WithParamInterface<unsigned> 
             return static_cast<void>(ptt_.convert_to_crisis(slot, session));
         case 17:
             return static_cast<void>(ptt_.keep_alive(slot, upto(30)));
-        default:
+        case 18:
             if (upto(4) == 0)
                 static_cast<void>(registrations_.enable_flight_mode(slot));
-            registrations_.switch_on(upto(3));
+            return registrations_.switch_on(upto(3));
+        default:
+            return send_or_record(slot, session);
         }
     }
 
     std::mt19937 random_;
+    TemporaryDirectory recordings_;
+    int messages_sent_ = 0;
+    int files_offered_ = 0;
+    int files_accepted_ = 0;
+    int recorded_ = 0;
+    int recordings_cancelled_ = 0;
 };
 
 TEST_P(PttWalk, NothingIsLeftWhenAllHaveGone) {
@@ -126,11 +215,18 @@ TEST_P(PttWalk, NothingIsLeftWhenAllHaveGone) {
         expect_accepted(ptt_.set_channel(slot, 0, PttChannelMode::kTalkAndListen));
         expect_accepted(ptt_.keep_alive(slot, 0));
     }
+    advance(2min); // offers of files lapse, parties answer
     EXPECT_EQ(timers_.next_due(), std::nullopt);
+    EXPECT_THAT((std::vector{messages_sent_, files_offered_, files_accepted_, recorded_,
+                             recordings_cancelled_}),
+                testing::Each(testing::Gt(0))); // or the walk has left something out
+    const auto kept = std::distance(std::filesystem::directory_iterator(recordings_.path()), {});
+    EXPECT_EQ(kept, recorded_ - recordings_cancelled_);
     // Each session has its end, told once.
     for (int slot = 0; slot < 4; ++slot) {
         const auto sessions = ended(slot);
         EXPECT_GT(sessions.size(), 50u); // or the walk has led nowhere
+        expect_nothing_kept(slot, static_cast<int>(sessions.size()));
         for (std::size_t i = 0; i < sessions.size(); ++i)
             ASSERT_EQ(sessions[i], static_cast<int>(i) + 1);
     }
