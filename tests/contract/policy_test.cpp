@@ -23,6 +23,13 @@ constexpr const char *kSystemRules = "<deny own=\"*\"/>\n"
                                      "<deny send_type=\"method_call\"/>\n"
                                      "<allow send_destination=\"org.freedesktop.DBus\"/>\n";
 
+// Another service, which anybody may call: this user owns its name, whatever group it is in.
+constexpr const char *kNeighbour = "org.example.neighbour";
+constexpr const char *kNeighboursPolicy = "<policy context=\"default\">\n"
+                                          "<allow own=\"org.example.neighbour\"/>\n"
+                                          "<allow send_destination=\"org.example.neighbour\"/>\n"
+                                          "</policy>\n";
+
 std::string this_user() {
     return getpwuid(geteuid())->pw_name;
 }
@@ -94,7 +101,7 @@ class BusPolicy : public WithPeer {
     BusPolicy() {
         policy_.write(this_user(), group_of_this_user());
         policy_rules_ = kSystemRules;
-        bus_elements_ = policy_.element();
+        bus_elements_ = policy_.element() + kNeighboursPolicy;
     }
 
     void SetUp() override {
@@ -165,6 +172,19 @@ TEST_F(BusPolicy, LetsNobodyOutsideTheGroupListen) {
     emit("org.kelvo.ims.Call", "CallInProgress", parse("(i)", "(7,)"));
     fence();
     EXPECT_EQ(recorder.count(), 0U);
+}
+
+// GDBus answers a ping by itself, on a thread of its own.
+TEST_F(BusPolicy, LetsTheServiceCallAPeerOutsideTheGroup) {
+    leave_group();
+    BusClient neighbour{bus().address()};
+    ASSERT_TRUE(neighbour.own_name(kNeighbour));
+    GError *error = nullptr;
+    const Variant answer{g_dbus_connection_call_sync(
+        peer().client().connection(), kNeighbour, "/", "org.freedesktop.DBus.Peer", "Ping", nullptr,
+        G_VARIANT_TYPE_UNIT, G_DBUS_CALL_FLAGS_NONE, -1, nullptr, &error)};
+    EXPECT_TRUE(answer) << error->message;
+    g_clear_error(&error);
 }
 
 // Whether the bus's policies let this user own the name.
