@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // The library, the files and the stand-in say the same. A request or signal that is added to one of
 // them alone makes this fail.
+#include "bus_observer.hpp"
 #include "declarations.hpp"
 #include "library.hpp"
 
@@ -46,6 +47,20 @@ TEST_F(LibraryOnTheBus, SendsAndAcceptsWhatTheFilesSay) {
 
 TEST_F(LibraryOnTheBus, HearsTheSignalsThatTheFilesSay) {
     expect_same(observe_events(), "the library", contract_of_files().signals, "the files");
+}
+
+// Not by the rows: an id that has a signal in the library and nowhere else is found as well.
+TEST_F(LibraryOnTheBus, ListensForTheSignalsThatTheFilesName) {
+    constexpr int kIds = 0x1000;
+    for (int id = 0; id < kIds; ++id)
+        ims_set_notification_cb(handle_, id, NotificationRecorder::callback, nullptr);
+    std::set<std::string> heard;
+    for (const ObservedSubscription &each : observed_subscriptions())
+        heard.insert(each.interface + ":" + each.member);
+    std::set<std::string> named;
+    for (const std::string &line : contract_of_files().signals)
+        named.insert(line.substr(0, line.find(' ')));
+    expect_same(heard, "the library", named, "the files");
 }
 
 TEST(StandInContract, ServesWhatTheFilesSay) {
