@@ -14,9 +14,10 @@ cmake --preset debug -B "$work/build" -DIMS_BUILD_TOOLS=OFF -DBUILD_TESTING=OFF 
 cmake --build "$work/build"
 cmake --install "$work/build" --prefix "$prefix" >/dev/null
 
-for file in dbus-1/interfaces/org.kelvo.ims.Call.xml dbus-1/system.d/org.kelvo.ims.conf; do
-    [[ -f $prefix/share/$file ]] || { echo "not installed: $file" >&2; exit 1; }
+for file in dbus/interfaces/*.xml; do
+    cmp "$file" "$prefix/share/dbus-1/interfaces/${file##*/}"
 done
+cmp dbus/org.kelvo.ims.conf "$prefix/share/dbus-1/system.d/org.kelvo.ims.conf"
 echo "contract: ok"
 
 libraries=$(dirname "$(find "$prefix" -name 'libkelvo-ims.so')")
