@@ -90,7 +90,7 @@ std::vector<RequestRow> file_rows() {
 std::vector<RequestRow> drawing_rows() {
     return {
         session_row<ims_vt_swap_video_surface>("ims_vt_swap_video_surface", "SwapVideoSurface"),
-        // The service counts on a swipe's record being there: only the handle is checked.
+        // The record is not checked: callers never pass NULL.
         unchecked_record_row<ims_vt_swipe_video, kSwipe>(kVt, "ims_vt_swipe_video", "SwipeVideo",
                                                          "(iiiiii)", "(7, 1, -2, 3, -4, 5)"),
         record_row<ims_vt_set_near_end_surface, kSurface>(kVt, "ims_vt_set_near_end_surface",
