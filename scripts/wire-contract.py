@@ -6,6 +6,7 @@ Usage: wire-contract.py          writes the page
        wire-contract.py --check  only says, with status 1, when the page is out of date
 """
 import pathlib
+import re
 import sys
 import xml.etree.ElementTree as ElementTree
 
@@ -32,15 +33,28 @@ accepts, and against the stand-in.
 """
 
 
+def prose(comment):
+    """A comment's paragraphs and list entries as Markdown, each on one line."""
+    blocks = re.split(r"\n\s*\n|\n\s*(?=- )", comment.strip())
+    blocks = [" ".join(block.split()) for block in blocks]
+    text = blocks[0]
+    for before, block in zip(blocks, blocks[1:]):
+        in_list = before.startswith("- ") and block.startswith("- ")
+        text += ("\n" if in_list else "\n\n") + block
+    return text
+
+
 def documented(parent):
     """The children of an element, each with the comment before it."""
     comment = ""
     for child in parent:
         if child.tag is ElementTree.Comment:
-            comment = " ".join(child.text.split())
+            comment = prose(child.text)
             continue
         if not comment and child.tag in ("interface", "method", "signal"):
             sys.exit(f"{child.get('name')} has no comment before it")
+        if "\n" in comment and child.tag != "interface":
+            sys.exit(f"{child.get('name')} has more to say than a table's cell holds")
         yield child, comment
         comment = ""
 
