@@ -55,6 +55,14 @@ TEST(Nearest, PutsTheNearestFirst) {
     EXPECT_THAT(nearest("xyzzy", verbs), IsEmpty());
 }
 
+TEST(Nearest, IsNothingToALongWord) {
+    const std::vector<std::string> verbs = {"hold", "resume"};
+    EXPECT_THAT(nearest("resumeresume", verbs), IsEmpty());
+    EXPECT_THAT(nearest("resumeresumer", verbs), IsEmpty());
+    EXPECT_THAT(nearest(std::string(300'000, 'r'), verbs), IsEmpty());
+    EXPECT_THAT(nearest("resume", {}), IsEmpty());
+}
+
 TEST(DidYouMean, IsAQuestionOrNothing) {
     EXPECT_EQ(did_you_mean("dail", {"dial", "end"}), "; did you mean \"dial\"?");
     EXPECT_EQ(did_you_mean("en", {"end", "enter"}), "; did you mean \"end\" or \"enter\"?");

@@ -36,10 +36,20 @@ std::vector<std::string> nearest(std::string_view word,
         std::size_t distance;
         const std::string *name;
     };
+    std::size_t longest = 0;
+    for (const std::string &name : candidates)
+        longest = std::max(longest, name.size());
+    // The limit grows with the word: to a word without end everything would be near.
+    if (word.size() > 2 * longest)
+        return {};
     const std::size_t limit = std::max<std::size_t>(1, word.size() / 3);
     std::vector<Match> matches;
     for (const std::string &name : candidates) {
         const bool begun = word.size() > 1 && name.starts_with(word);
+        const std::size_t longer = std::max(word.size(), name.size());
+        const std::size_t shorter = std::min(word.size(), name.size());
+        if (!begun && longer - shorter > limit)
+            continue;
         const std::size_t distance = begun ? 0 : edit_distance(word, name);
         if (distance <= limit)
             matches.push_back({distance, &name});
