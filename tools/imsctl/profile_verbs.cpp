@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Registration profiles.
+#include "profile_choice.hpp"
 #include "settings_actions.hpp"
 
 #include <algorithm>
@@ -22,37 +23,6 @@ List read_profiles(Client &client) {
 std::span<ProfileRecord> profiles_in(ims_profile_list_s &list) {
     return {list.profiles, list.count};
 }
-
-// An id or a name.
-class ProfileChoice {
-  public:
-    explicit ProfileChoice(const std::string &text) : text_(text), id_(parse_number(text)) {}
-
-    std::optional<std::int32_t> id() const { return id_; }
-
-    ProfileRecord &among(std::span<ProfileRecord> profiles) const {
-        std::vector<ProfileRecord *> found;
-        for (ProfileRecord &profile : profiles)
-            if (is_meant(profile))
-                found.push_back(&profile);
-        if (found.size() != 1)
-            throw Failure(FailureKind::kProfile,
-                          fmt::format("{} {}",
-                                      found.empty() ? "there is no profile"
-                                                    : "there is more than one profile",
-                                      quote(text_)),
-                          "try: imsctl profile list");
-        return *found.front();
-    }
-
-  private:
-    bool is_meant(const ProfileRecord &profile) const {
-        return id_ ? profile.id == *id_ : profile.name != nullptr && text_ == profile.name;
-    }
-
-    std::string text_;
-    std::optional<std::int32_t> id_;
-};
 
 Argument<std::string> profile_place(Arguments &arguments) {
     return arguments.text("PROFILE", "its id or its name");
