@@ -2,8 +2,8 @@
 #include "group_document.hpp"
 
 #include "failure.hpp"
+#include "files.hpp"
 #include "group_records.hpp"
-#include "settings_file.hpp"
 #include "suggestions.hpp"
 
 #include <algorithm>

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "settings_exchange.hpp"
 
+#include "files.hpp"
 #include "settings_actions.hpp"
 #include "settings_file.hpp"
 

@@ -4,14 +4,9 @@
 #include "failure.hpp"
 
 #include <algorithm>
-#include <cerrno>
-#include <cstdio>
-#include <cstring>
-#include <fcntl.h>
 #include <fmt/format.h>
 #include <fmt/ranges.h>
 #include <iterator>
-#include <memory>
 #include <nlohmann/json.hpp>
 
 namespace imsctl {
@@ -188,49 +183,7 @@ class Checker {
     Assignments<SettingsRecord> assignments_;
 };
 
-struct Close {
-    void operator()(std::FILE *file) const { std::fclose(file); }
-};
-using File = std::unique_ptr<std::FILE, Close>;
-
-Failure file_failure(FailureKind kind, const char *what, const std::string &name, int error) {
-    return {kind,
-            fmt::format("cannot {} {}: {}", what, quote(name), std::strerror(error)),
-            "",
-            {{"file", name}}};
-}
-
-std::string read_all(std::FILE *file, const std::string &name) {
-    std::string content;
-    char block[4096];
-    while (const std::size_t length = std::fread(block, 1, sizeof block, file))
-        content.append(block, length);
-    if (std::ferror(file))
-        throw file_failure(FailureKind::kInput, "read", name, errno);
-    return content;
-}
-
 } // namespace
-
-std::string read_file(const std::string &name) {
-    if (name == kStandardStream)
-        return read_all(stdin, "standard input");
-    const File file(std::fopen(name.c_str(), "re"));
-    if (!file)
-        throw file_failure(FailureKind::kInput, "read", name, errno);
-    return read_all(file.get(), name);
-}
-
-void write_file(const std::string &name, const std::string &content) {
-    const int descriptor =
-        open(name.c_str(), O_WRONLY | O_CREAT | O_TRUNC | O_CLOEXEC, S_IRUSR | S_IWUSR);
-    File file(descriptor < 0 ? nullptr : fdopen(descriptor, "w"));
-    const bool written =
-        file && std::fwrite(content.data(), 1, content.size(), file.get()) == content.size();
-    // Only closing brings the last block to the disk.
-    if (!written || std::fclose(file.release()) != 0)
-        throw file_failure(FailureKind::kOutput, "write", name, errno);
-}
 
 std::string settings_document(const SettingsRecord &settings) {
     Json object = Json::object();

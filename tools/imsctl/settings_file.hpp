@@ -8,14 +8,6 @@
 
 namespace imsctl {
 
-// "-" stands for standard input and output.
-inline constexpr const char *kStandardStream = "-";
-
-// Throw an input or output failure. A file that write_file() makes is its owner's alone: it may
-// hold passwords.
-std::string read_file(const std::string &name);
-void write_file(const std::string &name, const std::string &content);
-
 // One key a line, in the record's order.
 std::string settings_document(const SettingsRecord &settings);
 
