@@ -170,6 +170,8 @@ TEST_F(Settings, ComeFromNoFileThatIsWrong) {
     EXPECT_THAT(run_imsctl({"settings", "import", file}).error,
                 HasSubstr("the set \"defualt\" cannot be read, and for a new one the file has no "
                           "value for id, network, "));
+    EXPECT_THAT(run_imsctl({"settings", "import", file}).error,
+                testing::ContainsRegex(" network(, [a-z_0-9]+){3} and 325 more\n"));
     write(file, R"({"ringing_timer": 5})");
     EXPECT_THAT(run_imsctl({"settings", "import", file}).error, HasSubstr("there is no \"name\""));
     EXPECT_EQ(get("default").dump(), before.dump());

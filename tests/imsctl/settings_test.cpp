@@ -14,8 +14,11 @@
 namespace imsctl {
 namespace {
 
+using testing::AnyOf;
 using testing::ElementsAre;
+using testing::EndsWith;
 using testing::HasSubstr;
+using testing::Not;
 
 template <class Record>
 std::ptrdiff_t count_of(KeyType type) {
@@ -122,7 +125,12 @@ TEST(SettingsValues, AreOfTheKeysType) {
         EXPECT_THROW(value_from_text(KeyType::kNumber, text), WrongValue) << text;
     for (const char *text : {"", "1", "True", "yes"})
         EXPECT_THROW(value_from_text(KeyType::kFlag, text), WrongValue) << text;
-    EXPECT_THROW(value_from_text(KeyType::kText, "\xff"), WrongValue);
+    try {
+        value_from_text(KeyType::kText, "S3cret\xff");
+        FAIL() << "taken";
+    } catch (const WrongValue &wrong) {
+        EXPECT_STREQ(wrong.what(), "this is not valid UTF-8"); // it may be a password
+    }
 }
 
 TEST(SettingsValues, InJsonAreOfTheKeysTypeToo) {
@@ -173,8 +181,9 @@ TEST(SettingsFile, GivesBackEveryValue) {
 }
 
 TEST(SettingsFile, LeavesOutWhatHasNoValue) {
-    EXPECT_TRUE(parse_settings(R"({"network": null})", "file").empty());
-    EXPECT_TRUE(parse_settings("{}", "file").empty());
+    const auto assignments = parse_settings(R"({"name": "a", "network": null})", "file");
+    ASSERT_EQ(assignments.size(), 1u);
+    EXPECT_EQ(assignments.front().key->name, "name");
 }
 
 struct FileRow {
@@ -207,6 +216,21 @@ const FileRow kWrongFiles[] = {
     {"{\n\"name\":\n{\"id\": [1,\n2]},\n\"min_se\": 1}",
      "f: line 2: name: this is not a text but of type object\nf: line 5: min_se: "},
     {"{\n\"id\": 1,\n\"name\": \"a\",\n\"id\": 2}", "f: line 4: id already stands in line 2"},
+    {"\n{\n\"id\": 1}", "f: line 2: there is no \"name\""},
+    {"{}", "f: line 1: there is no \"name\""},
+    {"{\n\"id\": 1,\n\"name\": \"\"}",
+     "f: line 3: name: it says which set is meant: it cannot be empty"},
+    {"{\n\"name\": null}", "f: line 2: name: it says which set is meant: it cannot be empty"},
+    // A password is not repeated, whatever is wrong with it.
+    {"{\n\"http_password\": \"S3cret\n\"}", "f: line 2: syntax error"},
+    {"{\n\"http_password\": \"S3cret\xff\"}", "f: line 2: syntax error"},
+    {"{\n\"http_password\": \"S3cret", "f: line 2: syntax error"},
+    {"{\n\"http_password\": \"S3cret\\q\"}", "f: line 2: syntax error"},
+    {"{\n\"http_password\": S3cret}", "f: line 2: syntax error"},
+    {"{\n\"http_password\": \"a\" S3cret}", "f: line 2: syntax error"},
+    {"{\n\"http_password\": 3333e999}", "f: line 2: number overflow"},
+    {"{\n\"http_password\": [\"S3cret\"]}", "f: line 2: http_password: this is not a text"},
+    {"{\n\"http_password\": \"S3cret\\u0000\"}", "f: line 2: http_password: a text cannot"},
 };
 
 class WrongFiles : public ::testing::TestWithParam<FileRow> {};
@@ -219,6 +243,7 @@ TEST_P(WrongFiles, AreRefusedWithTheLine) {
         EXPECT_EQ(failure.kind, FailureKind::kInput);
         EXPECT_EQ(failure.exit_status(), 1);
         EXPECT_THAT(failure.what(), HasSubstr(GetParam().message));
+        EXPECT_THAT(failure.what(), Not(AnyOf(HasSubstr("S3"), HasSubstr("3333"))));
     }
 }
 
@@ -226,12 +251,46 @@ INSTANTIATE_TEST_SUITE_P(All, WrongFiles, ::testing::ValuesIn(kWrongFiles));
 
 TEST(SettingsFile, NamesAllLinesThatAreWrong) {
     try {
-        parse_settings("{\n\"a\": 1,\n\"id\": 1,\n\"b\": 1\n}", "f");
+        parse_settings("{\n\"a\": 1,\n\"name\": \"n\",\n\"b\": 1\n}", "f");
         FAIL() << "taken";
     } catch (const Failure &failure) {
         EXPECT_EQ(failure.to_json()["lines"], Json({2, 4}));
         EXPECT_EQ(failure.to_json()["file"], "f");
     }
+}
+
+std::string refusal_of(const std::string &document, Json *told = nullptr) {
+    try {
+        parse_settings(document, "f");
+    } catch (const Failure &failure) {
+        if (told != nullptr)
+            *told = failure.to_json();
+        return failure.what();
+    }
+    return "taken";
+}
+
+std::string unknown_keys(std::size_t count) {
+    std::string document = "{\"name\": \"n\"";
+    for (std::size_t i = 0; i < count; ++i)
+        document += ",\n\"key" + std::to_string(i) + "\": 1";
+    return document + "}";
+}
+
+TEST(SettingsFile, CountsTheLinesThatAreWrongWhenTheyAreMany) {
+    Json told;
+    EXPECT_THAT(refusal_of(unknown_keys(20), &told), Not(HasSubstr("more")));
+    EXPECT_EQ(told["lines"].size(), 20u);
+    const std::string text = refusal_of(unknown_keys(20'000), &told);
+    EXPECT_EQ(told["lines"].size(), 20u);
+    EXPECT_EQ(std::count(text.begin(), text.end(), '\n'), 20);
+    EXPECT_THAT(text, EndsWith("\nand 19980 more"));
+}
+
+TEST(SettingsFile, SuggestsNothingForALongKey) {
+    const std::string key(300'000, 'e');
+    EXPECT_EQ(refusal_of("{\"name\": \"n\", \"" + key + "\": 1}"),
+              "f: line 1: there is no key \"" + key + "\"");
 }
 
 TEST(SettingsVerbs, NameTheLinesOfAFileThatIsNotThere) {

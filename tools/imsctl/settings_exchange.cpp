@@ -15,12 +15,21 @@ namespace {
 
 using Names = std::vector<std::string_view>;
 
+// "a, b, c, d, e and 7 more"
+std::string first_of(const Names &names) {
+    constexpr std::size_t kTold = 5;
+    if (names.size() <= kTold)
+        return fmt::format("{}", fmt::join(names, ", "));
+    return fmt::format("{} and {} more", fmt::join(std::span(names).first(kTold), ", "),
+                       names.size() - kTold);
+}
+
 // What a file says, and what becomes of it.
 class Import {
   public:
     Import(Invocation &run, const std::string &file)
         : run_(run), file_(file), assignments_(parse_settings(read_file(file), file)),
-          name_(name_or_failure()) {}
+          name_(std::get<std::string>(find("name")->value)) {}
 
     void carry_out(const Shown &shown) {
         if (const auto set = read_if_there())
@@ -31,12 +40,6 @@ class Import {
     }
 
   private:
-    std::string name_or_failure() const {
-        if (const auto *name = find("name"))
-            return std::get<std::string>(name->value);
-        throw wrong("there is no \"name\"; it says which set is meant");
-    }
-
     const Assignment<SettingsRecord> *find(std::string_view key) const {
         const auto found =
             std::find_if(assignments_.begin(), assignments_.end(),
@@ -77,7 +80,7 @@ class Import {
         if (!missing.empty())
             throw wrong(fmt::format("the set {} cannot be read, and for a new one the file has "
                                     "no value for {}",
-                                    quote(name_), fmt::join(missing, ", ")));
+                                    quote(name_), first_of(missing)));
         const auto set = new_record<SettingsRecord>();
         fill_gaps(*set);
         assign_all(*set, writable_part(*set));

@@ -67,6 +67,7 @@ class Entries {
 
     const std::vector<Entry> &found() const { return found_; }
     const std::vector<Problem> &problems() const { return problems_; }
+    std::size_t first_line() const { return first_line_; }
 
     // What the parser calls.
     bool null() { return value(nullptr); }
@@ -88,8 +89,11 @@ class Entries {
     }
 
     bool parse_error(std::size_t, const std::string &, const Json::exception &error) {
-        // The parser's own names for the error and the place stand in front.
         std::string_view text = error.what();
+        // What the parser has read may be a password.
+        for (const std::string_view start : {"; last read: ", " parsing '"})
+            text = text.substr(0, text.find(start));
+        // The parser's own names for the error and the place stand in front.
         for (const std::string_view end : {"] ", ": "})
             if (const auto found = text.find(end); found != std::string_view::npos)
                 text.remove_prefix(found + end.size());
@@ -108,6 +112,8 @@ class Entries {
     bool start(Json empty) {
         if (depth_ == 0 && !empty.is_object())
             return no_object();
+        if (depth_ == 0)
+            first_line_ = line();
         if (depth_ == 1)
             found_.back().value = std::move(empty);
         ++depth_;
@@ -128,14 +134,24 @@ class Entries {
 
     Progress progress_;
     std::size_t depth_ = 0;
+    std::size_t first_line_ = 1;
     std::vector<Entry> found_;
     std::vector<Problem> problems_;
 };
 
+// More of them than anybody reads are only counted: a file without end costs no more to refuse.
+constexpr std::size_t kToldProblems = 20;
+
 class Checker {
   public:
     explicit Checker(const Entries &entries) : problems_(entries.problems()) {
-        for (const Entry &entry : entries.found())
+        const auto &found = entries.found();
+        const auto is_name = [](const Entry &entry) { return entry.name == "name"; };
+        // The object that the parser gave up in may have had its name further on.
+        if (problems_.empty() && std::none_of(found.begin(), found.end(), is_name))
+            problems_.push_back(
+                {entries.first_line(), "there is no \"name\"; it says which set is meant"});
+        for (const Entry &entry : found)
             check(entry);
     }
 
@@ -149,6 +165,8 @@ class Checker {
             texts.push_back(
                 fmt::format("{}: line {}: {}", escape(name), problem.line, problem.text));
         }
+        if (untold_ > 0)
+            texts.push_back(fmt::format("and {} more", untold_));
         throw Failure(FailureKind::kInput, fmt::format("{}", fmt::join(texts, "\n")),
                       "help: imsctl settings import --help", {{"file", name}, {"lines", lines}});
     }
@@ -157,29 +175,39 @@ class Checker {
     void check(const Entry &entry) {
         const auto *key = find_key<SettingsRecord>(entry.name);
         if (key == nullptr)
-            return refuse(entry, unknown_key<SettingsRecord>(entry.name));
+            return refuse(entry, [&] { return unknown_key<SettingsRecord>(entry.name); });
         const auto is_same = [&](const Entry *each) { return each->name == entry.name; };
         const auto earlier = std::find_if(seen_.begin(), seen_.end(), is_same);
         if (earlier != seen_.end())
-            return refuse(
-                entry, fmt::format("{} already stands in line {}", entry.name, (*earlier)->line));
+            return refuse(entry, [&] {
+                return fmt::format("{} already stands in line {}", entry.name, (*earlier)->line);
+            });
         seen_.push_back(&entry);
+        if (entry.name == "name" && (entry.value.is_null() || entry.value == ""))
+            return refuse(entry,
+                          [] { return "name: it says which set is meant: it cannot be empty"; });
         // The service left the key out when the file was made.
         if (entry.value.is_null())
             return;
         try {
             assignments_.push_back({key, value_from_json(type_of(*key), entry.value)});
         } catch (const WrongValue &wrong) {
-            refuse(entry, fmt::format("{}: {}", entry.name, wrong.what()));
+            refuse(entry, [&] { return fmt::format("{}: {}", entry.name, wrong.what()); });
         }
     }
 
-    void refuse(const Entry &entry, const std::string &text) {
-        problems_.push_back({entry.line, text});
+    // The text costs time: only one that is told is made.
+    template <class Text>
+    void refuse(const Entry &entry, const Text &text) {
+        if (problems_.size() < kToldProblems)
+            problems_.push_back({entry.line, text()});
+        else
+            ++untold_;
     }
 
     std::vector<const Entry *> seen_;
     std::vector<Problem> problems_;
+    std::size_t untold_ = 0;
     Assignments<SettingsRecord> assignments_;
 };
 
