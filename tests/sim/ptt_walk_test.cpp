@@ -99,11 +99,14 @@ class PttWalk : public PttNetwork, public testing::WithParamInterface<unsigned> 
         else
             static_cast<void>(recorder_.resume(slot, session));
     }
-    void end_recording(int slot, std::int32_t session) {
-        if (coin())
-            static_cast<void>(recorder_.stop(slot, session));
-        else
-            count(recordings_cancelled_, recorder_.cancel(slot, session));
+    void end_recordings() {
+        for (int slot = 0; slot < 4; ++slot) {
+            const auto session = session_of(slot);
+            if (upto(2) == 0)
+                static_cast<void>(recorder_.stop(slot, session));
+            else
+                count(recordings_cancelled_, recorder_.cancel(slot, session));
+        }
     }
     static void count(int &counter, const auto &answer) { counter += answer ? 1 : 0; }
 
@@ -126,7 +129,7 @@ class PttWalk : public PttNetwork, public testing::WithParamInterface<unsigned> 
         case 7:
             return change_recording(slot, session);
         default:
-            return end_recording(slot, session);
+            return end_recordings();
         }
     }
     // What is over is not known any longer.
