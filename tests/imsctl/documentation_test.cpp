@@ -2,6 +2,7 @@
 // That docs/imsctl.md tells of everything there is.
 #include "events.hpp"
 #include "failure.hpp"
+#include "short_message.hpp"
 #include "verbs.hpp"
 
 #include <fmt/format.h>
@@ -49,6 +50,12 @@ TEST_F(Documentation, HasEveryKindOfFailure) {
     for (int kind = 0; to_string(static_cast<FailureKind>(kind)) != "unknown"; ++kind)
         EXPECT_TRUE(tells(fmt::format("\n| `{}` | ", to_string(static_cast<FailureKind>(kind)))))
             << kind;
+}
+
+TEST_F(Documentation, ShowsTheReferenceThatItsSampleMessageGets) {
+    EXPECT_TRUE(tells(fmt::format("$ imsctl sms send +15550101 'See you at 8' --wait\n"
+                                  "part=1 of=1 reference={} message_number=1\n",
+                                  usual_reference("+15550101", "See you at 8"))));
 }
 
 } // namespace

@@ -110,6 +110,19 @@ TEST_F(Sms, SendsATextAsOneMessage) {
     EXPECT_EQ(peer_.calls().size(), 2u);
 }
 
+TEST_F(Sms, TakesNumbersAsPeopleWriteThem) {
+    for (const std::string number : {"+1 555-01.01", "+1 (555) 0101", "tel:+15550101",
+                                     "tel:+1-555-0101;phone-context=example.invalid"}) {
+        const Outcome outcome = run_imsctl({"sms", "send", number, "hello", "--sca", number});
+        EXPECT_EQ(outcome.status, 0) << outcome.error;
+        const Sent sent = read_sent(peer_.calls_to(kSendSms).back());
+        EXPECT_EQ(tpdu::to_text(sent.submit.destination), "+15550101") << number;
+        EXPECT_EQ(sent.service_centre, "059151550101") << number;
+        // One message, however its number is written.
+        EXPECT_EQ(sent.submit.message_reference, usual_reference("+15550101", "hello")) << number;
+    }
+}
+
 TEST_F(Sms, SendsEachPartWithAnAddressOfItsOwn) {
     const std::string text(400, 'a');
     const Outcome outcome = run_imsctl({"sms", "send", "+15550101", text, "--sca", "+15550999000",

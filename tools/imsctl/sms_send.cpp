@@ -5,6 +5,7 @@
 #include "requests.hpp"
 #include "short_message.hpp"
 
+#include <algorithm>
 #include <fmt/format.h>
 #include <limits>
 #include <nlohmann/json.hpp>
@@ -33,9 +34,17 @@ constexpr const char *kHint = "try: imsctl sms send +15550101 'See you at 8'";
     throw Failure(FailureKind::kUsage, fmt::format("{}: {}", name, problem), kHint);
 }
 
+// As people write it and as `call dial` takes it: "tel:", separators and parameters are no part
+// of the number. The letters a to c, which an address can hold, are none that anybody dials.
 tpdu::Address address(std::string_view name, const std::string &number) {
-    const auto address = tpdu::number_address(number);
-    if (!address)
+    constexpr std::string_view kScheme = "tel:";
+    constexpr std::string_view kSeparators = " -.()";
+    constexpr std::string_view kDialled = "+0123456789*#";
+    std::string bare = number.substr(number.starts_with(kScheme) ? kScheme.size() : 0);
+    bare.resize(std::min(bare.find(';'), bare.size()));
+    std::erase_if(bare, [&](char letter) { return kSeparators.find(letter) != kSeparators.npos; });
+    const auto address = tpdu::number_address(bare);
+    if (!address || bare.find_first_not_of(kDialled) != bare.npos)
         refuse(name, fmt::format("{} is not a number of 1 to {} digits", quote(number),
                                  tpdu::kMaxAddressSemiOctets));
     return *address;
@@ -75,9 +84,10 @@ Submission submission(const SendArguments &given) {
     if (!given.validity->empty())
         submission.validity = validity(*given.validity);
     submission.status_report = *given.status_report;
-    submission.reference = *given.reference != kNotGiven
-                               ? static_cast<std::uint8_t>(*given.reference)
-                               : usual_reference(*given.number, *given.text + *given.data);
+    submission.reference =
+        *given.reference != kNotGiven
+            ? static_cast<std::uint8_t>(*given.reference)
+            : usual_reference(tpdu::to_text(submission.destination), *given.text + *given.data);
     return submission;
 }
 
