@@ -32,8 +32,10 @@ typedef struct ims_login_state_s {
  * `(i)`: the result.
  *
  * @param handle     the handle
- * @param text_1     defined by the service; NULL is sent as an empty text
- * @param text_2     defined by the service; NULL is sent as an empty text
+ * @param text_1     defined by the service; must not be NULL; the library sends an empty text
+ * rather than crash
+ * @param text_2     defined by the service; must not be NULL; the library sends an empty text
+ * rather than crash
  * @param value_1    defined by the service
  * @param callback   receives the outcome with NULL as data, or NULL
  * @param user_data  handed to the callback

@@ -32,8 +32,9 @@ typedef struct ims_ss_cf_info_s {
     int32_t no_reply_time; /**< seconds before forwarding when nobody answers */
     int32_t cf_uri_length; /**< the target's length */
     int32_t cf_uri_type;   /**< the target's kind */
-    const char *cf_uri; /**< the target. To be set: NULL is sent as an empty text. In an entry: gone
-                             after the callback, NULL when the service left it out */
+    const char *cf_uri;    /**< the target. To be set: must not be NULL; the library sends an empty
+                              text    rather than crash. In an entry: gone after the callback, NULL when
+                              the    service left it out */
 } ims_ss_cf_info_s;
 
 /** Call barring: one entry of what is set. */
@@ -48,7 +49,8 @@ typedef struct ims_ss_cb_set_s {
     int32_t ss_class;        /**< the service class */
     int32_t ss_status;       /**< the status */
     int32_t cb_type;         /**< which calls */
-    const char *cb_password; /**< the password; NULL is sent as an empty text */
+    const char *cb_password; /**< the password; must not be NULL; the library sends an empty text
+                                  rather than crash */
 } ims_ss_cb_set_s;
 
 /** What to ask for. */
