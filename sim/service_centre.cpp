@@ -39,6 +39,14 @@ std::optional<Refusal> bad_service_centre(const tpdu::Octets &octets) {
     return std::nullopt;
 }
 
+std::optional<Refusal> bad_validity(const tpdu::Validity &validity) {
+    const auto *end = std::get_if<tpdu::Timestamp>(&validity);
+    if (!end || tpdu::is_valid(*end))
+        return std::nullopt;
+    return refuse(Result::kInvalidArgument, "the validity ends at {}, which is no date and time",
+                  tpdu::to_text(*end));
+}
+
 bool single_shot(const tpdu::Validity &validity) {
     const auto *enhanced = std::get_if<tpdu::EnhancedValidity>(&validity);
     return enhanced && enhanced->single_shot;
@@ -88,6 +96,8 @@ Answer<SubmitReceipt> ServiceCentre::submit(int slot, const SubmitRequest &reque
     if (!submit)
         return refuse(Result::kInvalidArgument, "this is no SMS-SUBMIT: {}",
                       submit.error().message);
+    if (auto refusal = bad_validity(submit->validity))
+        return *refusal;
     if (auto refusal = not_deliverable(slot, *submit))
         return *refusal;
     const Id id = next_id_++;

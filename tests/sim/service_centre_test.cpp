@@ -128,6 +128,29 @@ TEST_F(Messages, ThatAreMalformedAreRefused) {
         bad.service_centre = address;
         refused(bad, "the service centre's address is malformed: ");
     }
+    // Octets of an absolute validity: 2031-05-06T07:08:09, digits swapped.
+    struct Row {
+        std::size_t octet;
+        std::uint8_t value;
+        const char *time;
+    };
+    constexpr std::size_t kValidity = 10; // behind eight digits, TP-PID and TP-DCS
+    auto timed = submit_to(kSlot1, "Hello");
+    timed.validity = tpdu::Timestamp{2031, 5, 6, 7, 8, 9, 0};
+    expect_accepted(try_send(0, timed));
+    for (const auto &[octet, value, time] : {
+             Row{1, 0x99, "2031-99-06T07:08:09+00:00"},
+             Row{1, 0x00, "2031-00-06T07:08:09+00:00"},
+             Row{2, 0x00, "2031-05-00T07:08:09+00:00"},
+             Row{2, 0x23, "2031-05-32T07:08:09+00:00"},
+             Row{3, 0x42, "2031-05-06T24:08:09+00:00"},
+             Row{4, 0x06, "2031-05-06T07:60:09+00:00"},
+             Row{5, 0x06, "2031-05-06T07:08:60+00:00"},
+         }) {
+        bad = request(timed);
+        bad.tpdu.at(kValidity + octet) = value;
+        refused(bad, fmt::format("the validity ends at {}, which is no date and time", time));
+    }
     advance(1h);
     EXPECT_THAT(take(0), IsEmpty());
     EXPECT_THAT(take(1), IsEmpty());
