@@ -15,7 +15,7 @@ constexpr SignalInfo kSignals[] = {{"LoginState", "(iuii)"}};
 } // namespace
 
 const MethodRow<LoginInterface> LoginInterface::kMethods[] = {
-    {"Login", "(ssii)", "(i)", Caller::kLastArgument, &LoginInterface::login},
+    {"Login", "(ssii)", "(i)", Caller::kLastArgument, &LoginInterface::login, 0, 1},
     {"Logout", "(i)", "(i)", Caller::kFirstArgument, &LoginInterface::logout},
     {"GetLoginState", "(ii)", "(iiui)", Caller::kLastArgument, &LoginInterface::get_login_state},
 };

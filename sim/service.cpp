@@ -245,8 +245,27 @@ std::string Service::introspect(std::string_view path) const {
 std::string Service::describe(const Call &call) const {
     const auto where = call.slot >= 0 ? fmt::format("sub{}", call.slot) : std::string(call.path);
     const auto name = applications_.name_of(call.connection);
-    return fmt::format("{} {} {} from {}{}", where, call.member, printed(call.body),
+    return fmt::format("{} {} {} from {}{}", where, call.member, describe_arguments(call),
                        call.connection, name.empty() ? "" : fmt::format(" ({})", name));
+}
+
+// By the member alone: a password is also one when the call goes astray.
+std::string Service::describe_arguments(const Call &call) const {
+    const auto *const owner = find_owner(call.member);
+    if (!owner)
+        return printed(call.body);
+    const auto method = std::ranges::find(owner->methods, call.member, &Method::member);
+    if (!method->password)
+        return printed(call.body);
+    if (method->in != call.signature)
+        return "(not shown)";
+    std::string text = "(";
+    for (gsize i = 0; i < g_variant_n_children(call.body.get()); ++i) {
+        const auto argument = Variant::adopt(g_variant_get_child_value(call.body.get(), i));
+        text += fmt::format("{}{}", i == 0 ? "" : ", ",
+                            i == *method->password ? "***" : printed(argument));
+    }
+    return text + ")";
 }
 
 void Service::respond(const Call &call, const Outcome &outcome) {

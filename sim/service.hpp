@@ -10,6 +10,7 @@
 
 #include <functional>
 #include <map>
+#include <optional>
 #include <span>
 #include <string>
 #include <string_view>
@@ -47,7 +48,8 @@ struct Method {
     std::string_view out;
     Caller caller;
     Handler handler;
-    std::size_t result_index = 0; // where in the reply the result stands
+    std::size_t result_index = 0;          // where in the reply the result stands
+    std::optional<std::size_t> password{}; // the argument that the log does not show
 };
 
 struct SignalInfo {
@@ -104,6 +106,7 @@ class Service {
     Outcome properties(const Call &call);
     std::optional<Refusal> refuse_caller(const Call &call, const Method &method) const;
 
+    std::string describe_arguments(const Call &call) const;
     const Interface *find_interface(std::string_view name) const;
     const Interface *find_owner(std::string_view member) const;
     bool is_node(std::string_view path) const;
@@ -138,6 +141,7 @@ struct MethodRow {
     Caller caller;
     Answer<Variant> (Module::*handler)(const Request &);
     std::size_t result_index = 0;
+    std::optional<std::size_t> password{};
 };
 
 template <typename Module>
@@ -148,7 +152,7 @@ std::vector<Method> bind_methods(Module &module, std::span<const MethodRow<Modul
                            [&module, handler = row.handler](const Request &request) {
                                return (module.*handler)(request);
                            },
-                           row.result_index});
+                           row.result_index, row.password});
     return methods;
 }
 

@@ -18,7 +18,7 @@ const MethodRow<SsInterface> SsInterface::kMethods[] = {
     {"GetCallWaiting", "(ii)", "(iuaa{sv})", kFirstArgument, &SsInterface::get_call_waiting},
     {"SetCallForwarding", "(iiiiiiis)", "(i)", kFirstArgument, &SsInterface::set_call_forwarding},
     {"GetCallForwarding", "(iii)", "(iuaa{sv})", kFirstArgument, &SsInterface::get_call_forwarding},
-    {"SetCallBarring", "(iiiis)", "(i)", kFirstArgument, &SsInterface::set_call_barring},
+    {"SetCallBarring", "(iiiis)", "(i)", kFirstArgument, &SsInterface::set_call_barring, 0, 4},
     {"GetCallBarring", "(iii)", "(iuaa{sv})", kFirstArgument, &SsInterface::get_call_barring},
 };
 

@@ -228,7 +228,7 @@ Status SupplementaryServices::set_barring(int slot, const BarringEntry &wanted,
     if (wanted.type == BarringType::kAll && wanted.status == 1)
         return refuse(Result::kInvalidArgument, "type 5 (all) can only be switched off");
     if (password != kBarringPassword)
-        return refuse(Result::kWrongPassword, "\"{}\" is not the barring password", password);
+        return refuse(Result::kWrongPassword, "that is not the barring password");
     for (const auto position : classes_of(wanted.service))
         for (const auto type : types)
             slots_[static_cast<std::size_t>(slot)][position].barring[type] = wanted.status == 1;
