@@ -119,7 +119,7 @@ TEST_F(Sms, TakesNumbersAsPeopleWriteThem) {
         EXPECT_EQ(outcome.status, 0) << outcome.error;
         const Sent sent = read_sent(peer_.calls_to(kSendSms).back());
         EXPECT_EQ(tpdu::to_text(sent.submit.destination), "+15550101") << number;
-        EXPECT_EQ(sent.service_centre, "059151550101") << number;
+        EXPECT_EQ(sent.service_centre, "059151551010") << number;
         references.insert(sent.submit.message_reference);
     }
     // One message, however its number is written.
