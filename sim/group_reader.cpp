@@ -55,8 +55,10 @@ void GroupReader::texts(GroupKey list, GroupKey element, std::vector<std::string
 }
 
 void GroupReader::identity(GroupKey key, std::int32_t type, RuleIdentity &identity) {
-    const auto *dictionary = take<GroupDictionary>(key);
-    if (!dictionary || dictionary->empty())
+    const auto *dictionary = take<GroupDictionary>(key, true);
+    // What is read leaves out an identity that is not set: an empty one of type 4 has no parts.
+    const bool may_be_empty = form_ == GroupForm::kRead && type == 4;
+    if (!dictionary || (dictionary->empty() && !may_be_empty))
         return;
     const Place place{this, key.in(form_), {}};
     switch (type) {

@@ -11,8 +11,8 @@
 namespace sim {
 
 // Fills a record from one dictionary. The first thing that is wrong is kept with its place, and
-// nothing after it matters. A key may only be left out of a document that is being written, where
-// it then has its empty value.
+// nothing after it matters. A key may be left out of a document that is being written, where it
+// then has its empty value; what is read leaves out nothing but texts and parts that are not set.
 class GroupReader {
   public:
     static constexpr bool kReads = true;
@@ -45,10 +45,10 @@ class GroupReader {
     void record(GroupKey key, Record &record) {
         part(key, [&](auto &part) { describe(part, record); });
     }
-    // An empty dictionary means that there is none.
+    // No dictionary and an empty one mean that there is none.
     template <typename Record>
     void record(GroupKey key, std::optional<Record> &record) {
-        const auto *dictionary = take<GroupDictionary>(key);
+        const auto *dictionary = take<GroupDictionary>(key, true);
         if (dictionary && !dictionary->empty())
             fill(*dictionary, {this, key.in(form_), {}}, record.emplace());
     }

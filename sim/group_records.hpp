@@ -8,8 +8,8 @@
 #include <variant>
 #include <vector>
 
-// The documents of push-to-talk groups. A part that is not set travels as an empty dictionary, a
-// text that is not set does not travel.
+// The documents of push-to-talk groups. Neither a text nor a part that is not set travels to
+// clients; they send an empty dictionary for such a part.
 namespace sim {
 
 using OptionalText = std::optional<std::string>;

@@ -54,7 +54,10 @@ class GroupWriter {
     }
     template <typename Record>
     void record(GroupKey key, const std::optional<Record> &record) {
-        add(key, record ? dictionary_of(*record) : GroupDictionary());
+        if (record)
+            add(key, dictionary_of(*record));
+        else
+            add_unset(key);
     }
     template <typename Record>
     void list(GroupKey key, const std::vector<Record> &records) {
@@ -68,11 +71,20 @@ class GroupWriter {
         add(key, record ? GroupDictionaries{dictionary_of(*record)} : GroupDictionaries());
     }
     void identity(GroupKey key, std::int32_t, const RuleIdentity &identity) {
-        std::visit([&](const auto &content) { add(key, dictionary_of(content)); }, identity);
+        std::visit([&](const auto &content) { add_identity(key, content); }, identity);
     }
 
   private:
-    GroupDictionary dictionary_of(const std::monostate &) const { return {}; }
+    // Clients take an empty dictionary for a part that is set, yet send one for a part that is not.
+    void add_unset(GroupKey part) {
+        if (form_ == GroupForm::kWritten)
+            add(part, GroupDictionary());
+    }
+    void add_identity(GroupKey key, std::monostate) { add_unset(key); }
+    template <typename Content>
+    void add_identity(GroupKey key, const Content &content) {
+        add(key, dictionary_of(content));
+    }
     template <typename Record>
     GroupDictionary dictionary_of(const Record &record) const {
         GroupWriter writer(form_);

@@ -60,6 +60,38 @@ TEST_F(Groups, AreFetchedEditedAndCreatedAgain) {
     EXPECT_EQ(shown("0")["group_member_list"], edited["group_member_list"]);
 }
 
+// What is not set does not come back as something that is set and empty.
+TEST_F(Groups, KeepWhatIsNotSetWhenTheyAreCreatedAgain) {
+    struct {
+        const char *document;
+        std::vector<const char *> unset;
+    } const rows[] = {
+        {R"({"group_uri":"sip:crew@example.org"})", {"/group_properties", "/group_member_list"}},
+        {R"({"group_uri":"sip:crew@example.org","group_properties":{},"group_rule_set":)"
+         R"([{"rule_id":"all"}]})",
+         {"/group_properties/group_active_policy", "/group_rule_set/0/identity",
+          "/group_rule_set/0/media_list"}},
+        {R"({"group_uri":"sip:crew@example.org","group_properties":{"group_active_policy":{},)"
+         R"("supported_services":[{"service_enabler":1}]},"group_rule_set":[{"rule_id":"home",)"
+         R"("rule_identity_type":4,"identity":{"allow_domain_id":{"domains":["example.org"]}}}]})",
+         {"/group_properties/group_active_policy/participants",
+          "/group_properties/supported_services/0/media_list",
+          "/group_rule_set/0/identity/allow_contact_id",
+          "/group_rule_set/0/identity/except_domain_id"}}};
+    for (const auto &[document, unset] : rows) {
+        const TemporaryFile file{document};
+        expect_ok("group create " + file.name());
+        const Json first = shown("0");
+        for (const char *part : unset)
+            EXPECT_TRUE(first.at(Json::json_pointer(part)).is_null()) << part << first.dump(1);
+        const TemporaryFile again{first.dump()};
+        expect_ok("group delete sip:crew@example.org");
+        expect_ok("group create " + again.name());
+        EXPECT_EQ(shown("0").dump(), first.dump());
+        expect_ok("group delete sip:crew@example.org");
+    }
+}
+
 TEST_F(Groups, AreEditedInPlace) {
     const TemporaryFile file{kCrew};
     expect_ok("group create " + file.name());

@@ -12,7 +12,9 @@
 namespace sim::test {
 namespace {
 
+using testing::ElementsAre;
 using testing::HasSubstr;
+using testing::IsEmpty;
 using enum GroupForm;
 
 using Path = std::vector<std::string>;
@@ -129,9 +131,13 @@ TEST(GroupFields, ACountThatDoesNotFitItsListIsRefused) {
 
 TEST(GroupFields, WhatIsWrittenMayBeIncompleteAndWhatIsKeptMayNot) {
     const auto optional = [](std::string_view key) {
-        constexpr std::string_view kOptional[] = {"channel_id", "version",  "as_id",    "area_id",
-                                                  "disp_name",  "assign",   "position", "rank",
-                                                  "start_time", "end_time", "from_age", "to_age"};
+        constexpr std::string_view kOptional[] = {
+            "channel_id", "version", "as_id", "area_id", "disp_name", "assign", "position", "rank",
+            "start_time", "end_time", "from_age", "to_age",
+            // Parts.
+            "group_properties", "group_member_list", "group_session_active_policy", "participants",
+            "rule_identity", "rule_media_list", "allow_domain_id", "except_domain_id",
+            "except_contact_id"};
         return std::ranges::find(kOptional, key) != std::end(kOptional);
     };
     const auto take_away = [](GroupDictionary &dictionary, std::size_t i) {
@@ -139,7 +145,6 @@ TEST(GroupFields, WhatIsWrittenMayBeIncompleteAndWhatIsKeptMayNot) {
         return true;
     };
     for_each_change(kRead, take_away, [&](const auto &read, const std::string &key) {
-        // A part that has lost its only key is one that is not set.
         if (read)
             EXPECT_TRUE(optional(key)) << key;
         else
@@ -148,6 +153,45 @@ TEST(GroupFields, WhatIsWrittenMayBeIncompleteAndWhatIsKeptMayNot) {
     const auto read = read_record<GroupDocument>({}, kWritten);
     ASSERT_TRUE(read);
     EXPECT_EQ(*read, GroupDocument());
+}
+
+// Clients read an empty dictionary as a part that is set.
+TEST(GroupFields, PartsThatAreNotSetAreEmptyWhenWrittenAndLeftOutWhenRead) {
+    const GroupDocument group{.uri = "sip:a@example.org"};
+    const auto rule = [](std::int32_t type) { return GroupRule{.id = "r", .identity_type = type}; };
+    const auto empty_parts = [](auto whole) {
+        Path parts;
+        for_each_dictionary(whole, {}, [&](GroupDictionary &dictionary, const Path &path) {
+            if (dictionary.empty())
+                parts.push_back(path.back());
+        });
+        return parts;
+    };
+    EXPECT_THAT(empty_parts(write_record(group, kWritten)),
+                ElementsAre("group_properties", "group_member_list"));
+    EXPECT_THAT(empty_parts(write_record(group, kRead)), IsEmpty());
+    EXPECT_THAT(empty_parts(write_record(SessionPolicy{}, kWritten)), ElementsAre("participants"));
+    EXPECT_THAT(empty_parts(write_record(SessionPolicy{}, kRead)), IsEmpty());
+    for (const std::int32_t type : {0, 1, 2, 3, 4}) {
+        EXPECT_THAT(empty_parts(write_record(rule(type), kWritten)),
+                    ElementsAre("rule_identity", "rule_media_list"));
+        EXPECT_THAT(empty_parts(write_record(rule(type), kRead)), IsEmpty());
+    }
+    EXPECT_THAT(empty_parts(write_record(RuleDomains{}, kWritten)),
+                ElementsAre("allow_domain_id", "allow_contact_id", "except_domain_id",
+                            "except_contact_id"));
+    EXPECT_EQ(write_record(RuleDomains{}, kRead).size(), 0u);
+}
+
+TEST(GroupFields, AnEmptyPartIsOneThatIsNotSetInBothForms) {
+    for (const auto form : {kWritten, kRead}) {
+        auto whole = write_record(GroupDocument{.uri = "sip:a@example.org"}, kRead);
+        whole.push_back({"group_properties", {GroupDictionary()}});
+        whole.push_back({"group_member_list", {GroupDictionary()}});
+        const auto read = read_record<GroupDocument>(whole, form);
+        ASSERT_TRUE(read) << read.refusal().reason;
+        EXPECT_EQ(*read, GroupDocument{.uri = "sip:a@example.org"});
+    }
 }
 
 TEST(GroupFields, RefusalsNameThePlace) {

@@ -166,15 +166,17 @@ TEST(GroupKeys, IdentitiesOfListsAndDomainsHaveOtherKeysWhenRead) {
     constexpr const char *kParts =
         "allow_domain_id allow_contact_id except_domain_id except_contact_id";
     EXPECT_EQ(identity_keys(2, kWritten), kParts);
-    EXPECT_EQ(identity_keys(2, kRead), kParts);
+    // The part that is not set is left out.
+    EXPECT_EQ(identity_keys(2, kRead), "allow_domain_id except_domain_id except_contact_id");
+    EXPECT_EQ(identity_keys(2, kWritten, {"allow_contact_id"}), "");
     EXPECT_EQ(identity_keys(2, kWritten, {"allow_domain_id"}), "num_of_domain_id contacts_v");
     EXPECT_EQ(identity_keys(2, kWritten, {"allow_domain_id", "contacts_v"}), "contacts");
     EXPECT_EQ(identity_keys(2, kRead, {"allow_domain_id"}), "num_of_domain_id domain_id_v");
     EXPECT_EQ(identity_keys(2, kRead, {"allow_domain_id", "domain_id_v"}), "domain_id");
     EXPECT_EQ(identity_keys(2, kWritten, {"except_contact_id"}), "num_of_contact_id contacts");
     EXPECT_EQ(identity_keys(2, kRead, {"except_contact_id"}), "num_of_contact_id contacts_v");
-    EXPECT_EQ(identity_keys(2, kRead, {"allow_contact_id"}), "");
-    EXPECT_EQ(identity_keys(3, kRead), "");
+    EXPECT_EQ(identity_keys(3, kWritten), "");
+    EXPECT_EQ(identity_keys(3, kRead), "nothing at rule_identity");
 }
 
 TEST(GroupKeys, TheTypeOfAMemberIsWrittenAsAFlag) {

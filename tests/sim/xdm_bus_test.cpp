@@ -28,7 +28,7 @@ TEST_F(XdmBus, ASmallDocumentGoesRoundTheWireAsItIsSpelled) {
                   .body,
               "(0,)");
     EXPECT_EQ(fetch("sip:g@x"),
-              "(0, {'group_uri': <'sip:g@x'>, 'group_properties': <@a{sv} {}>, "
+              "(0, {'group_uri': <'sip:g@x'>, "
               "'group_member_list': <{"
               "'contact_list': <{'contact_lists_v': <@aa{sv} []>, 'num_of_ct_lists': <int64 0>}>, "
               "'contacts': <{'contacts_v': <[{'uri': <'tel:1'>, 'stt': <false>, 'active': <true>, "
