@@ -58,6 +58,12 @@ TEST(GroupDocuments, AreRefusedForEverythingThatIsWrong) {
     EXPECT_THAT(problems_of("{\n\"group_uri\":"), ElementsAre("this is not JSON from line 2 on"));
     EXPECT_THAT(problems_of(R"({"group_uri":"a","group_uri":"b"})"),
                 ElementsAre("an object has the key \"group_uri\" twice"));
+    EXPECT_THAT(problems_of("{\"a\":[{},{\"b\":1,\n\"b\":2},{\"b\":3}],\"a\":1,\n1e999}"),
+                ElementsAre("an object has the key \"b\" twice",
+                            "an object has the key \"a\" twice",
+                            "this is not JSON from line 3 on"));
+    EXPECT_THAT(problems_of(R"({"group_uri":1e999})"),
+                ElementsAre("this is not JSON from line 1 on"));
     EXPECT_THAT(problems_of(R"({"group_uri":"a","versoin":"1"})"),
                 ElementsAre("there is no key \"versoin\"; did you mean \"version\"?"));
     EXPECT_THAT(problems_of(R"({"group_uri":")" + std::string(129, 'u') + R"("})"),

@@ -4,6 +4,7 @@
 #include "failure.hpp"
 #include "files.hpp"
 #include "group_records.hpp"
+#include "json_text.hpp"
 #include "suggestions.hpp"
 
 #include <algorithm>
@@ -11,7 +12,6 @@
 #include <fmt/ranges.h>
 #include <limits>
 #include <nlohmann/json.hpp>
-#include <set>
 
 namespace imsctl {
 namespace {
@@ -214,38 +214,14 @@ class Reader {
     std::vector<std::string> known_;
 };
 
-// JSON, with the keys that an object has twice told as problems.
-Json parse(const std::string &text, Problems &problems) {
-    std::vector<std::set<std::string>> keys;
-    const auto on_event = [&](int, Json::parse_event_t event, Json &parsed) {
-        if (event == Json::parse_event_t::object_start)
-            keys.emplace_back();
-        else if (event == Json::parse_event_t::object_end)
-            keys.pop_back();
-        else if (event == Json::parse_event_t::key &&
-                 !keys.back().insert(parsed.get<std::string>()).second)
-            problems.add("", fmt::format("an object has the key {} twice",
-                                         quote(parsed.get_ref<const std::string &>())));
-        return true;
-    };
-    try {
-        return Json::parse(text, on_event);
-    } catch (const Json::parse_error &error) {
-        const auto line = 1 + std::count(text.begin(),
-                                         text.begin() + static_cast<std::ptrdiff_t>(
-                                                            std::min(error.byte, text.size())),
-                                         '\n');
-        problems.add("", fmt::format("this is not JSON from line {} on", line));
-        return nullptr;
-    }
-}
-
 // Reads a file whose problems are told in one failure.
 template <class Record, class Use>
 Record *read_file_as(const std::string &file, const char *what, bool (*fits)(const Json &),
                      const Use &use) {
+    const auto [document, wrong] = parse_json(read_file(file));
     Problems problems;
-    const Json document = parse(read_file(file), problems);
+    for (const std::string &problem : wrong)
+        problems.add("", problem);
     Record *record = nullptr;
     if (problems.texts().empty() && !fits(document))
         problems.add("", fmt::format("this is not {}", what));
