@@ -91,6 +91,23 @@ TEST(GroupDocuments, AreRefusedWithThePlaceOfWhatIsWrong) {
                     "group_rule_set[0].identity: the rule_identity_type 3 has no identity"));
 }
 
+TEST(GroupRules, NeedATypeForAnIdentity) {
+    const auto problems_of_rule = [](const std::string &keys) {
+        return problems_of(R"({"group_uri":"g","group_rule_set":[{"rule_id":"r",)" + keys + "}]}");
+    };
+    const auto kForgotten = "group_rule_set[0]: there is no \"rule_identity_type\", which an "
+                            "identity needs";
+    EXPECT_THAT(problems_of_rule(R"("identity":{"contacts":[]})"), ElementsAre(kForgotten));
+    EXPECT_THAT(problems_of_rule(R"("rule_identity_type":null,"identity":{})"),
+                ElementsAre(kForgotten));
+    EXPECT_THAT(
+        problems_of_rule(R"("rule_identity_type":0,"identity":{})"),
+        ElementsAre("group_rule_set[0].identity: the rule_identity_type 0 has no identity"));
+    EXPECT_THAT(problems_of_rule(R"("rule_identity_type":2,"identity":{"domains":[]})"),
+                ElementsAre("group_rule_set[0].identity: there is no key \"domains\""));
+    EXPECT_THAT(problems_of_rule(R"("identity":null)"), ElementsAre());
+}
+
 TEST(GroupRules, HaveTheIdentityOfTheirType) {
     const TemporaryFile file(
         R"([{"rule_id":"1","rule_identity_type":1,"identity":{"contacts":[{"uri":"sip:a"}]}},)"
@@ -117,6 +134,27 @@ TEST(GroupJson, IsNullForAListThatWasDropped) {
     const Json list = to_json(group)["group_member_list"];
     EXPECT_TRUE(list["contacts"].is_null());
     EXPECT_EQ(list["ext_ref"].dump(), "[]");
+}
+
+// What a rule's identity may be for each type, and that it is none for every other.
+TEST(GroupSchema, TiesAnIdentityToItsType) {
+    const Json conditions = group_schema()["$defs"]["rule"]["allOf"];
+    ASSERT_EQ(conditions.size(), 4u);
+    const auto condition = [](const std::string &type) {
+        return R"({"properties":{"rule_identity_type":)" + type +
+               R"(},"required":["rule_identity_type"]})";
+    };
+    const char *const kinds[][2] = {
+        {"1", "identity-entries"}, {"2", "identity-urls"}, {"4", "identity-domains"}};
+    for (std::size_t at = 0; at < std::size(kinds); ++at) {
+        const auto &[type, kind] = kinds[at];
+        EXPECT_EQ(conditions[at]["if"].dump(), condition(R"({"const":)" + std::string(type) + "}"));
+        EXPECT_EQ(conditions[at]["then"].dump(),
+                  R"({"properties":{"identity":{"anyOf":[{"type":"null"},{"$ref":"#/$defs/)" +
+                      std::string(kind) + R"("}]}}})");
+    }
+    EXPECT_EQ(conditions[3]["if"].dump(), condition(R"({"enum":[1,2,4]})"));
+    EXPECT_EQ(conditions[3]["else"].dump(), R"({"properties":{"identity":{"type":"null"}}})");
 }
 
 // The published file. imsctl prints it: imsctl group schema.

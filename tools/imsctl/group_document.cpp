@@ -123,9 +123,15 @@ class Reader {
                 *cell = record;
                 read(value, here(name), *record);
             });
-            if (!has_record)
+            if (has_record)
+                return;
+            const auto found = object_.find(kIdentityType);
+            if (found == object_.end() || found->is_null())
+                problems_.add(path_, fmt::format("there is no {}, which an identity needs",
+                                                 quote(kIdentityType)));
+            else
                 problems_.add(here(name),
-                              fmt::format("the rule_identity_type {} has no identity", type));
+                              fmt::format("the {} {} has no identity", kIdentityType, type));
         });
     }
 

@@ -117,11 +117,13 @@ void visit_fields(Visitor &visit, ims_xdm_identity_domains_s &domains) {
     visit("except_contact_id", domains.except_contact_id);
 }
 
-// The type comes before the identity, whose record it chooses.
+// The key that chooses the record of a rule's identity, and so comes before it.
+inline constexpr const char *kIdentityType = "rule_identity_type";
+
 template <class Visitor>
 void visit_fields(Visitor &visit, ims_xdm_group_rule_s &rule) {
     visit.required("rule_id", rule.rule_id);
-    visit("rule_identity_type", rule.rule_identity_type);
+    visit(kIdentityType, rule.rule_identity_type);
     visit.identity("identity", rule.identity, rule.rule_identity_type);
     visit("media_list", rule.media_list);
     visit("is_list_member", rule.is_list_member);

@@ -101,19 +101,32 @@ class Writer {
             properties[name] = list_of(reference<Element>());
     }
     void identity(const char *name, void **, std::int32_t) {
-        Json choices = Json::array({{{"type", "null"}}});
+        properties[name] = or_null("object");
+        properties[name]["description"] = "what it holds is said by rule_identity_type";
+        Json types = Json::array();
         for (const std::int32_t type :
              {IMS_XDM_IDENTITY_ENTRIES, IMS_XDM_IDENTITY_URLS, IMS_XDM_IDENTITY_DOMAINS})
-            with_identity_type(
-                type, [&]<class Record>(Record *) { choices.push_back(reference<Record>()); });
-        properties[name] = {{"description", "which one is for rule_identity_type 1, 2, 4"},
-                            {"anyOf", choices}};
+            with_identity_type(type, [&]<class Record>(Record *) {
+                types.push_back(type);
+                conditions.push_back(
+                    {{"if", identity_type_is({{"const", type}})},
+                     {"then", {{"properties", {{name, record_or_null<Record>()}}}}}});
+            });
+        conditions.push_back({{"if", identity_type_is({{"enum", types}})},
+                              {"else", {{"properties", {{name, {{"type", "null"}}}}}}}});
     }
 
     Json properties = Json::object();
     Json required_names = Json::array();
+    // What ties properties to each other.
+    Json conditions = Json::array();
 
   private:
+    static Json identity_type_is(const Json &value) {
+        return {{"properties", {{kIdentityType, value}}},
+                {"required", Json::array({kIdentityType})}};
+    }
+
     static Json list_of(const Json &items) {
         Json list = or_null("array");
         list["items"] = items;
@@ -133,10 +146,13 @@ class Writer {
 };
 
 Json object_schema(const Writer &writer) {
-    return {{"type", "object"},
-            {"properties", writer.properties},
-            {"required", writer.required_names},
-            {"additionalProperties", false}};
+    Json schema = {{"type", "object"},
+                   {"properties", writer.properties},
+                   {"required", writer.required_names},
+                   {"additionalProperties", false}};
+    if (!writer.conditions.empty())
+        schema["allOf"] = writer.conditions;
+    return schema;
 }
 
 template <class Record>
