@@ -32,9 +32,9 @@ typedef struct ims_ss_cf_info_s {
     int32_t no_reply_time; /**< seconds before forwarding when nobody answers */
     int32_t cf_uri_length; /**< the target's length */
     int32_t cf_uri_type;   /**< the target's kind */
-    const char *cf_uri;    /**< the target. To be set: must not be NULL; the library sends an empty
-                              text    rather than crash. In an entry: gone after the callback, NULL when
-                              the    service left it out */
+    /** The target. To be set: must not be NULL; the library sends an empty text rather than crash.
+     * In an entry: gone after the callback, NULL when the service left it out. */
+    const char *cf_uri;
 } ims_ss_cf_info_s;
 
 /** Call barring: one entry of what is set. */
