@@ -34,6 +34,8 @@ class SetReply {
 
 class SettingsRecord : public WithPeer {
   protected:
+    // Padding included: some tests look at every byte.
+    SettingsRecord() { std::memset(&set_, 0, sizeof set_); }
     void TearDown() override {
         ims_global_settings_clear(&set_);
         WithPeer::TearDown();
@@ -44,7 +46,7 @@ class SettingsRecord : public WithPeer {
     }
     std::string image() const { return {reinterpret_cast<const char *>(&set_), sizeof set_}; }
 
-    ims_global_settings_s set_{};
+    ims_global_settings_s set_;
 };
 
 // Whether a record holds what the service sends for one key.
