@@ -13,9 +13,8 @@ void read(GVariant *dictionary, Settings &settings) {
 }
 
 Variant write(const Settings &settings) {
-    static const ims::DictionaryKeys keys{ims::kSettingsFields};
     return ims::pack<"(@a{sv})">(
-        ims::write_dictionary(ims::kSettingsFields, keys, ims::kSettingsUpdate, &settings));
+        ims::write_dictionary(ims::kSettingsFields, ims::kSettingsUpdate, &settings));
 }
 
 bool get(const Client &client, Settings &settings) {

@@ -17,7 +17,7 @@ git ls-files '*.sh' .ci/run | xargs shellcheck
 
 # The tests of the stand-in and of imsctl take most of the building and belong to the programs, not
 # to what applications link: `scripts/test.sh asan` runs them too.
-parts=(call ims login poc record_tree reg settings sms ss support vt xdm)
+parts=(call dictionary ims login poc record_tree reg settings sms ss support vt xdm)
 step "The library and its tests with the second compiler, under Address-, Leak- and UBSanitizer"
 cmake --preset asan -B build/clang \
     -DCMAKE_C_COMPILER=clang -DCMAKE_CXX_COMPILER=clang++ >/dev/null

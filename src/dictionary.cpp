@@ -6,6 +6,7 @@
 #include <bitset>
 #include <charconv>
 #include <cstring>
+#include <vector>
 
 namespace ims {
 namespace {
@@ -49,55 +50,122 @@ bool read_field(GVariant *value, const FieldRow &row, void *record) noexcept {
     return false;
 }
 
-// The values of a record as they are written, and what they take up together.
-class FieldWriter {
-  public:
-    explicit FieldWriter(const void *record) noexcept : record_{record} {}
+// How many bytes each offset takes in a container that ends with some of them.
+gsize offset_width(gsize content, gsize offsets) noexcept {
+    if (content + offsets <= UINT8_MAX)
+        return 1;
+    return content + 2 * offsets <= UINT16_MAX ? 2 : 4;
+}
 
-    // A floating value, or NULL for a text that cannot cross the bus.
-    GVariant *write(const FieldRow &row, WriteAs as) noexcept;
-    gsize size() const noexcept { return size_; }
+// An "a{sv}" in the form that GLib keeps a received one in: a single block of bytes. As values of
+// their own its entries would take a dozen allocations each, and as many releases.
+class DictionaryBytes {
+  public:
+    explicit DictionaryBytes(gsize entries) noexcept;
+
+    // False for an entry that would make the dictionary too large to cross the bus.
+    bool add(std::string_view key, char type, const void *value, gsize size) noexcept;
+    Variant finish() noexcept;
 
   private:
-    // What an entry takes up beside its key and its text: the number in a text's place, types,
-    // padding, ends.
-    static constexpr gsize kEntryOverhead = 48;
+    static constexpr gsize kAlignment = 8;
+    // What an entry takes at most beside its key and its value: padding before it and before the
+    // value, two zeros, a type, an offset.
+    static constexpr gsize kMaxEntryOverhead = 2 * (kAlignment - 1) + 2 + 1 + 4;
+    // So that the block seldom grows.
+    static constexpr gsize kUsualEntrySize = 64;
 
-    GVariant *write_number(std::int32_t number, WriteAs as) const noexcept;
-    GVariant *write_text(const char *text) noexcept;
+    void append(const void *data, gsize size) noexcept {
+        std::memcpy(block_->data + size_, data, size);
+        size_ += size;
+    }
+    void pad() noexcept {
+        for (; size_ % kAlignment != 0; ++size_)
+            block_->data[size_] = 0;
+    }
+    void append_offset(gsize offset, gsize width) noexcept;
+    void make_room(gsize size) noexcept {
+        if (size_ + size > block_->len)
+            g_byte_array_set_size(block_.get(), static_cast<guint>(2 * (size_ + size)));
+    }
 
-    const void *record_;
+    ByteArray block_{g_byte_array_new()};
     gsize size_ = 0;
+    std::vector<gsize> ends_;
 };
 
-GVariant *FieldWriter::write_number(std::int32_t number, WriteAs as) const noexcept {
-    if (as == WriteAs::kDecimalText)
-        return g_variant_new_take_string(g_strdup_printf("%d", number));
-    return g_variant_new_int32(number);
+DictionaryBytes::DictionaryBytes(gsize entries) noexcept {
+    g_byte_array_set_size(block_.get(), static_cast<guint>(entries * kUsualEntrySize));
+    ends_.reserve(entries);
 }
 
-GVariant *FieldWriter::write_text(const char *text) noexcept {
-    if (text == nullptr)
-        return nullptr;
-    const gsize length = std::strlen(text);
-    size_ += length;
-    return g_utf8_validate_len(text, length, nullptr) ? g_variant_new_string(text) : nullptr;
+// Offsets are little-endian on every machine; numbers are the machine's own.
+void DictionaryBytes::append_offset(gsize offset, gsize width) noexcept {
+    for (; width > 0; --width, offset >>= 8)
+        block_->data[size_++] = static_cast<guint8>(offset & UINT8_MAX);
 }
 
-GVariant *FieldWriter::write(const FieldRow &row, WriteAs as) noexcept {
-    size_ += row.key_length + kEntryOverhead;
+bool DictionaryBytes::add(std::string_view key, char type, const void *value, gsize size) noexcept {
+    if (size > kMaxTupleSize || size_ > kMaxTupleSize - size)
+        return false;
+    make_room(key.size() + size + kMaxEntryOverhead);
+    pad();
+    const gsize start = size_;
+    append(key.data(), key.size());
+    append("", 1);
+    const gsize key_end = size_ - start;
+    pad();
+    append(value, size);
+    append("", 1);
+    append(&type, 1);
+    append_offset(key_end, offset_width(size_ - start, 1));
+    ends_.push_back(size_);
+    return true;
+}
+
+Variant DictionaryBytes::finish() noexcept {
+    const gsize width = offset_width(size_, ends_.size());
+    make_room(ends_.size() * width);
+    for (const gsize end : ends_)
+        append_offset(end, width);
+    g_byte_array_set_size(block_.get(), static_cast<guint>(size_));
+    GBytes *bytes = g_byte_array_free_to_bytes(block_.release());
+    Variant dictionary = owned(g_variant_new_from_bytes(G_VARIANT_TYPE_VARDICT, bytes, TRUE));
+    g_bytes_unref(bytes);
+    return dictionary;
+}
+
+bool write_number(DictionaryBytes &dictionary, std::string_view key, std::int32_t number,
+                  WriteAs as) noexcept {
+    if (as != WriteAs::kDecimalText)
+        return dictionary.add(key, 'i', &number, sizeof number);
+    std::array<char, 12> text{};
+    std::to_chars(text.begin(), text.end(), number);
+    return dictionary.add(key, 's', text.data(), std::strlen(text.data()) + 1);
+}
+
+bool write_text(DictionaryBytes &dictionary, std::string_view key, const char *text) noexcept {
+    return text != nullptr && g_utf8_validate(text, -1, nullptr) &&
+           dictionary.add(key, 's', text, std::strlen(text) + 1);
+}
+
+bool write_field(DictionaryBytes &dictionary, const FieldRow &row, WriteAs as,
+                 const void *record) noexcept {
     switch (row.kind) {
     case FieldKind::kInt32:
-        return write_number(at<std::int32_t>(record_, row.offset), as);
-    case FieldKind::kBoolean:
-        return g_variant_new_boolean(at<bool>(record_, row.offset));
+        return write_number(dictionary, row.name(), at<std::int32_t>(record, row.offset), as);
+    case FieldKind::kBoolean: {
+        const guint8 flag = at<bool>(record, row.offset) ? 1 : 0;
+        return dictionary.add(row.name(), 'b', &flag, sizeof flag);
+    }
     case FieldKind::kOwnText:
     case FieldKind::kLentText:
-        return write_text(at<const char *>(record_, row.offset));
+        return write_text(dictionary, row.name(), at<const char *>(record, row.offset));
     case FieldKind::kTextAndNumber:
-        return write_number(at<std::int32_t>(record_, row.offset + kNumberOffset), as);
+        return write_number(dictionary, row.name(),
+                            at<std::int32_t>(record, row.offset + kNumberOffset), as);
     }
-    return nullptr;
+    return false;
 }
 
 // The row of a key. A service that sends the keys in the table's order is met by the guess.
@@ -146,28 +214,14 @@ void clear_record(FieldsView fields, void *record, std::size_t size) noexcept {
     std::memset(record, 0, size);
 }
 
-DictionaryKeys::DictionaryKeys(FieldsView fields) noexcept {
-    keys_.reserve(fields.rows.size());
-    for (const FieldRow &row : fields.rows)
-        keys_.push_back(owned(g_variant_new_string(row.key.data())));
-}
-
-Sized write_dictionary(FieldsView fields, const DictionaryKeys &keys,
-                       std::span<const WriteStep> plan, const void *record) noexcept {
-    FieldWriter writer{record};
-    std::vector<GVariant *> entries;
-    entries.reserve(plan.size());
+Variant write_dictionary(FieldsView fields, std::span<const WriteStep> plan,
+                         const void *record) noexcept {
+    DictionaryBytes dictionary{plan.size()};
     for (const WriteStep &step : plan) {
-        GVariant *value = writer.write(fields.rows[step.row], step.as);
-        if (value == nullptr) {
-            for (GVariant *entry : entries)
-                g_variant_unref(entry);
-            return {};
-        }
-        entries.push_back(g_variant_new_dict_entry(keys[step.row], g_variant_new_variant(value)));
+        if (!write_field(dictionary, fields.rows[step.row], step.as, record))
+            return nullptr;
     }
-    return {owned(g_variant_new_array(G_VARIANT_TYPE("{sv}"), entries.data(), entries.size())),
-            writer.size()};
+    return dictionary.finish();
 }
 
 std::uint32_t checked_count(const char *subject, std::uint32_t count, GVariant *list,

@@ -19,7 +19,6 @@
 #include <cstdint>
 #include <span>
 #include <string_view>
-#include <vector>
 
 namespace ims {
 
@@ -203,19 +202,10 @@ consteval std::array<WriteStep, Count> write_plan(const FieldTable<Count> &field
     return plan;
 }
 
-// The keys of a table as ready values: they are the same in every dictionary that is written.
-class DictionaryKeys {
-  public:
-    explicit DictionaryKeys(FieldsView fields) noexcept;
-    GVariant *operator[](std::size_t row) const noexcept { return keys_[row].get(); }
-
-  private:
-    std::vector<Variant> keys_;
-};
-
-// Writes a record as "a{sv}"; nothing when one of its texts is NULL or not valid UTF-8.
-Sized write_dictionary(FieldsView fields, const DictionaryKeys &keys,
-                       std::span<const WriteStep> plan, const void *record) noexcept;
+// Writes a record as "a{sv}"; nothing when one of its texts is NULL or not valid UTF-8, or when it
+// is too large to cross the bus.
+Variant write_dictionary(FieldsView fields, std::span<const WriteStep> plan,
+                         const void *record) noexcept;
 
 // The number of entries that a list of dictionaries really has, when the service's count says the
 // same: at most the capacity. Otherwise none; both are worth a line.

@@ -21,6 +21,7 @@ using Owned = std::unique_ptr<T, Releaser<Function>>;
 
 using Text = Owned<char, g_free>;
 using Bytes = Owned<guchar, g_free>;
+using ByteArray = Owned<GByteArray, g_byte_array_unref>;
 using Error = Owned<GError, g_error_free>;
 using Connection = Owned<GDBusConnection, g_object_unref>;
 using HashTable = Owned<GHashTable, g_hash_table_destroy>;

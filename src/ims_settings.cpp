@@ -11,18 +11,6 @@ namespace {
 
 constexpr const char *kInterface = "org.kelvo.ims.Settings";
 
-// Made at the first use and kept: no work when the library is loaded.
-Sized settings_dictionary(std::span<const WriteStep> plan,
-                          const ims_global_settings_s *settings) noexcept {
-    static const DictionaryKeys keys{kSettingsFields};
-    return write_dictionary(kSettingsFields, keys, plan, settings);
-}
-
-Sized profile_dictionary(const ims_profile_s *profile) noexcept {
-    static const DictionaryKeys keys{kProfileFields};
-    return write_dictionary(kProfileFields, keys, kProfileWrite, profile);
-}
-
 } // namespace
 
 int ims_get_global_settings_info(ims_h handle, const char *name, ims_global_settings_s *settings) {
@@ -53,7 +41,7 @@ int ims_update_global_settings(ims_h handle, const ims_global_settings_s *settin
     if (const int refused = admit({handle, settings}))
         return refused;
     return request(handle, kInterface, "UpdateGlobalSettings",
-                   pack<"(@a{sv})">(settings_dictionary(kSettingsUpdate, settings)),
+                   pack<"(@a{sv})">(write_dictionary(kSettingsFields, kSettingsUpdate, settings)),
                    {on_response_settings_update_global_settings, callback, user_data});
 }
 
@@ -67,7 +55,7 @@ int ims_add_global_settings(ims_h handle, const ims_global_settings_s *settings,
     if (const int refused = admit({handle, settings}))
         return refused;
     return request(handle, kInterface, "AddGlobalSettings",
-                   pack<"(@a{sv})">(settings_dictionary(kSettingsAdd, settings)),
+                   pack<"(@a{sv})">(write_dictionary(kSettingsFields, kSettingsAdd, settings)),
                    {on_response_settings_add_global_settings, callback, user_data});
 }
 
@@ -120,7 +108,7 @@ int ims_update_profile(ims_h handle, const ims_profile_s *profile, ims_response_
     if (const int refused = admit({handle, profile}))
         return refused;
     return request(handle, kInterface, "UpdateProfile",
-                   pack<"(@a{sv})">(profile_dictionary(profile)),
+                   pack<"(@a{sv})">(write_dictionary(kProfileFields, kProfileWrite, profile)),
                    {on_response_settings_update_profile, callback, user_data});
 }
 
@@ -133,7 +121,8 @@ int ims_add_profile(ims_h handle, const ims_profile_s *profile, ims_response_cb 
                     void *user_data) {
     if (const int refused = admit({handle, profile}))
         return refused;
-    return request(handle, kInterface, "AddProfile", pack<"(@a{sv})">(profile_dictionary(profile)),
+    return request(handle, kInterface, "AddProfile",
+                   pack<"(@a{sv})">(write_dictionary(kProfileFields, kProfileWrite, profile)),
                    {on_response_settings_add_profile, callback, user_data});
 }
 

@@ -22,12 +22,6 @@ struct Skipped {};
 // is not configured otherwise.
 inline constexpr gsize kMaxTupleSize = gsize{16} << 20;
 
-// A container whose maker knows how large it is at most. GLib would add it up entry by entry.
-struct Sized {
-    Variant value;
-    gsize size = 0;
-};
-
 // What is inside a value, however many variants are around it.
 Variant peeled(GVariant *value) noexcept;
 
@@ -50,14 +44,14 @@ consteval bool carries(std::string_view type) {
         return is_one_of<T, std::int64_t>;
     if (type == "s")
         return is_one_of<T, const char *, char *>;
-    return is_one_of<T, Variant, Sized>;
+    return std::is_same_v<T, Variant>;
 }
 
 // What unpack() can store a member of this type in. A "b" may go to a 32-bit boolean, a "v" with an
 // "ai" in it to an array of fixed size.
 template <typename T>
 consteval bool receives(std::string_view type) {
-    return (carries<T>(type) && !is_one_of<T, Sized>) || is_one_of<T, Skipped> ||
+    return carries<T>(type) || is_one_of<T, Skipped> ||
            (type == "b" && is_one_of<T, std::int32_t>) ||
            (type == "v" && is_one_of<std::remove_extent_t<T>, std::int32_t> && std::is_array_v<T>);
 }
@@ -80,9 +74,6 @@ inline Variant to_variant(std::int64_t value, const char *) noexcept {
 }
 Variant to_variant(const char *text, const char *type) noexcept;
 Variant to_variant(const Variant &value, const char *type) noexcept;
-inline Variant to_variant(const Sized &container, const char *type) noexcept {
-    return to_variant(container.value, type);
-}
 
 // What a value takes up in a message.
 template <std::integral T>
@@ -91,9 +82,6 @@ gsize size_of(T) noexcept {
 }
 gsize size_of(const char *text) noexcept;
 gsize size_of(const Variant &value) noexcept;
-inline gsize size_of(const Sized &container) noexcept {
-    return container.size;
-}
 
 inline void from_variant(GVariant *child, bool &value) noexcept {
     value = g_variant_get_boolean(child) != FALSE;
