@@ -70,6 +70,22 @@ void expect_value(void *record, const KeyRow &row, std::size_t position) {
     }
 }
 
+void empty_field(void *record, const KeyRow &row) {
+    switch (row.type) {
+    case 'i':
+        field_at<std::int32_t>(record, row.offset) = 0;
+        break;
+    case 'b':
+        field_at<bool>(record, row.offset) = false;
+        break;
+    default:
+        std::free(field_at<char *>(record, row.offset));
+        field_at<char *>(record, row.offset) = nullptr;
+    }
+    if (row.type == 't')
+        field_at<ims_settings_timer_s>(record, row.offset).value = 0;
+}
+
 TEST(SettingsKeys, HaveTheNumbersTheServiceCounts) {
     std::map<char, int> types;
     for (const KeyRow &row : settings_keys())
@@ -93,20 +109,8 @@ TEST_F(SettingsRecord, EachKeyFillsItsFieldAndNoOther) {
         ASSERT_EQ(get(SetReply{}.add(row.key, sent_value(row, at + 1).get()).finish()),
                   IMS_ERROR_NONE);
         expect_value(&set_, row, at + 1);
-        // Emptied again, nothing is left that another field got.
-        switch (row.type) {
-        case 'i':
-            field_at<std::int32_t>(&set_, row.offset) = 0;
-            break;
-        case 'b':
-            field_at<bool>(&set_, row.offset) = false;
-            break;
-        default:
-            std::free(field_at<char *>(&set_, row.offset));
-            field_at<char *>(&set_, row.offset) = nullptr;
-        }
-        if (row.type == 't')
-            field_at<ims_settings_timer_s>(&set_, row.offset).value = 0;
+        empty_field(&set_, row);
+        // Nothing is left that another field got.
         ASSERT_EQ(image(), std::string(sizeof set_, '\0')) << row.key;
     }
 }
@@ -161,17 +165,22 @@ TEST_F(SettingsRecord, KeysAreComparedWithTheirCase) {
 }
 
 TEST_F(SettingsRecord, ValuesOfAnotherTypeCountAsMissing) {
+    char kept[] = "kept";
     set_.id = -1;
+    set_.rcs_version = 4;
+    set_.is_rcs_enabled = true;
+    set_.network = kept;
     EXPECT_EQ(get(reply("(ia{sv})", "(0, {'id': <'1'>, 'name': <2>, 'is_rcs_enabled': <1>, "
                                     "'rcs_version': <uint32 3>, 'network': <<'boxed twice'>>, "
                                     "'sip_uri_only': <'true'>})")),
               IMS_ERROR_NONE);
     EXPECT_EQ(set_.id, -1);
     EXPECT_EQ(set_.name, nullptr);
-    EXPECT_EQ(set_.network, nullptr);
-    EXPECT_EQ(set_.rcs_version, 0);
-    EXPECT_FALSE(set_.is_rcs_enabled);
+    EXPECT_EQ(set_.network, kept);
+    EXPECT_EQ(set_.rcs_version, 4);
+    EXPECT_TRUE(set_.is_rcs_enabled);
     EXPECT_FALSE(set_.sip_uri_only);
+    set_.network = nullptr;
 }
 
 TEST_F(SettingsRecord, OfARepeatedKeyTheLaterValueStays) {
@@ -181,6 +190,15 @@ TEST_F(SettingsRecord, OfARepeatedKeyTheLaterValueStays) {
     EXPECT_EQ(get(answer.finish()), IMS_ERROR_NONE);
     EXPECT_STREQ(set_.name, "later");
     EXPECT_EQ(set_.id, 2);
+}
+
+TEST_F(SettingsRecord, OfARepeatedKeyALaterValueOfAnotherTypeChangesNothing) {
+    SetReply answer;
+    answer.add("name", g_variant_new_string("earlier")).add("id", g_variant_new_int32(1));
+    answer.add("name", g_variant_new_int32(2)).add("id", g_variant_new_string("2"));
+    EXPECT_EQ(get(answer.finish()), IMS_ERROR_NONE);
+    EXPECT_STREQ(set_.name, "earlier");
+    EXPECT_EQ(set_.id, 1);
 }
 
 // The service sends the three timers as text and takes them as numbers.
@@ -227,6 +245,20 @@ TEST_F(SettingsRecord, AMissingNameIsSentAsAnEmptyOne) {
     expect_sent(sent[0], "(s)", "('',)");
 }
 
+TEST_F(SettingsRecord, ANameThatIsNotUtf8IsNotSent) {
+    EXPECT_EQ(ims_get_global_settings_info(handle_, "caf\xe9", &set_),
+              IMS_ERROR_INVALID_PARAMETER);
+    expect_one_line("ims_settings.cpp", "ims_get_global_settings_info", "Invalid parameter");
+    EXPECT_TRUE(requests().empty());
+}
+
+TEST_F(SettingsRecord, WithoutANameIsDeletedUnderAnEmptyOne) {
+    peer().on("org.kelvo.ims.Settings.DeleteGlobalSettings", reply("(i)", "(0,)"));
+    EXPECT_EQ(ims_delete_global_settings(handle_, &set_, nullptr, nullptr), IMS_ERROR_NONE);
+    const auto calls = peer().wait_for_calls("org.kelvo.ims.Settings.DeleteGlobalSettings", 1);
+    expect_sent(calls[0], "(s)", "('',)");
+}
+
 // Written and read back, a set keeps everything but the two fields that are never written.
 TEST_F(SettingsRecord, SurvivesTheWayToTheServiceAndBack) {
     ims_global_settings_s sent{};
@@ -249,6 +281,18 @@ TEST_F(SettingsRecord, SurvivesTheWayToTheServiceAndBack) {
         else if (row.type != 't')
             expect_value(&set_, row, at + 1);
     }
+}
+
+// Its timers came as text and go as numbers.
+TEST_F(SettingsRecord, KeepsItsTimersWhenItIsWrittenAsItWasRead) {
+    SetReply answer;
+    for (std::size_t at = 0; at < settings_keys().size(); ++at)
+        answer.add(settings_keys()[at].key, sent_value(settings_keys()[at], at + 1).get());
+    ASSERT_EQ(get(answer.finish()), IMS_ERROR_NONE);
+    peer().on("org.kelvo.ims.Settings.UpdateGlobalSettings", reply("(i)", "(0,)"));
+    ASSERT_EQ(ims_update_global_settings(handle_, &set_, nullptr, nullptr), IMS_ERROR_NONE);
+    const auto calls = peer().wait_for_calls("org.kelvo.ims.Settings.UpdateGlobalSettings", 1);
+    expect_sent(calls[0], "(a{sv})", written_settings(Direction::kUpdate));
 }
 
 TEST(SettingsClear, ReleasesTheTextsAndZeroesTheRecord) {
@@ -283,6 +327,16 @@ class ProfileList : public WithPeer {
         EXPECT_EQ(lines[0].message,
                   std::string{"profile list count is NOT valid - Count: ["} + count + "]");
     }
+    // One profile with these keys, the first of them from this position.
+    static Answer one_profile(std::span<const KeyRow> keys, std::size_t position) {
+        GVariantBuilder profile;
+        g_variant_builder_init(&profile, G_VARIANT_TYPE_VARDICT);
+        for (const KeyRow &row : keys)
+            g_variant_builder_add(&profile, "{sv}", row.key, sent_value(row, position++).get());
+        GVariant *dictionary = g_variant_builder_end(&profile);
+        return reply_with(g_variant_new(
+            "(iu@aa{sv})", 0, 1, g_variant_new_array(G_VARIANT_TYPE_VARDICT, &dictionary, 1)));
+    }
     // So many profiles whose ids count from 0.
     static Answer profiles(guint count, guint entries) {
         GVariantBuilder list;
@@ -300,18 +354,22 @@ class ProfileList : public WithPeer {
     std::unique_ptr<ims_profile_list_s> list_ = std::make_unique<ims_profile_list_s>();
 };
 
-TEST_F(ProfileList, EachKeyFillsItsField) {
-    GVariantBuilder profile;
-    g_variant_builder_init(&profile, G_VARIANT_TYPE_VARDICT);
+TEST_F(ProfileList, EachKeyFillsItsFieldAndNoOther) {
     for (std::size_t at = 0; at < profile_keys().size(); ++at) {
         const KeyRow &row = profile_keys()[at];
-        g_variant_builder_add(&profile, "{sv}", row.key, sent_value(row, at + 1).get());
+        std::memset(list_.get(), 0, sizeof *list_);
+        ASSERT_EQ(get(one_profile(profile_keys().subspan(at, 1), at + 1)), IMS_ERROR_NONE);
+        ASSERT_EQ(list_->count, 1U);
+        expect_value(&list_->profiles[0], row, at + 1);
+        empty_field(&list_->profiles[0], row);
+        const std::string image{reinterpret_cast<const char *>(list_->profiles),
+                                sizeof list_->profiles};
+        ASSERT_EQ(image, std::string(sizeof list_->profiles, '\0')) << row.key;
     }
-    GVariant *dictionary = g_variant_builder_end(&profile);
-    ASSERT_EQ(
-        get(reply_with(g_variant_new("(iu@aa{sv})", 0, 1,
-                                     g_variant_new_array(G_VARIANT_TYPE_VARDICT, &dictionary, 1)))),
-        IMS_ERROR_NONE);
+}
+
+TEST_F(ProfileList, AllKeysAreReadTogether) {
+    ASSERT_EQ(get(one_profile(profile_keys(), 1)), IMS_ERROR_NONE);
     ASSERT_EQ(list_->count, 1U);
     for (std::size_t at = 0; at < profile_keys().size(); ++at)
         expect_value(&list_->profiles[0], profile_keys()[at], at + 1);
