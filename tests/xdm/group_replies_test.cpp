@@ -268,18 +268,54 @@ TEST_F(GroupReplies, DropAListWhoseCountLies) {
           });
 }
 
+struct InlineText {
+    const char *name;
+    std::size_t size; // of its buffer
+    std::string before, after;
+    const char *(*of)(const ims_xdm_group_info_s &);
+};
+
+const std::vector<InlineText> &inline_texts() {
+    using Group = ims_xdm_group_info_s;
+    static const std::vector<InlineText> texts{
+        {"group_uri", 129, "{'group_uri': <'", "'>}",
+         [](const Group &group) -> const char * { return group.group_uri; }},
+        {"display_name", 101, "{'group_properties': <{'display_name': <'", "'>}>}",
+         [](const Group &group) -> const char * { return group.group_properties->display_name; }},
+        {"subject", 257, "{'group_properties': <{'subject': <'", "'>}>}",
+         [](const Group &group) -> const char * { return group.group_properties->subject; }},
+        {"rule_id", 101, "{'group_rule_set': <[{'rule_id': <'", "'>}]>}",
+         [](const Group &group) -> const char * { return group.group_rule_set->rule_id; }},
+        {"a member's uri", 1537,
+         "{'group_member_list': <{'contacts': <{'num_of_contacts': <int64 1>, 'contacts_v': "
+         "<[{'uri': <'",
+         "'>}]>}>}>}",
+         [](const Group &group) -> const char * {
+             return group.group_member_list->contacts[0].uri;
+         }},
+    };
+    return texts;
+}
+
 TEST_F(GroupReplies, CutTextsToTheirBuffersAtAWholeCharacter) {
-    const std::string uri(128, 'u');
-    std::string name;
-    for (int character = 0; character < 60; ++character)
-        name += "é"; // two bytes: 50 of them fill the buffer
-    fetch("{'group_uri': <'" + uri + "tail'>, 'group_properties': <{'display_name': <'x" + name +
-              "'>, 'subject': <'" + name + "'>}>}",
-          [&](const ims_xdm_group_info_s &group) {
-              EXPECT_EQ(group.group_uri, uri);
-              EXPECT_EQ(group.group_properties->display_name, "x" + name.substr(0, 98));
-              EXPECT_EQ(group.group_properties->subject, name);
-          });
+    for (const InlineText &text : inline_texts()) {
+        SCOPED_TRACE(text.name);
+        const auto read = [&](const std::string &sent, const std::string &expected) {
+            fetch(text.before + sent + text.after,
+                  [&](const ims_xdm_group_info_s &group) { EXPECT_EQ(text.of(group), expected); });
+        };
+        // All sizes are odd, and a terminator is in them.
+        std::string pairs;
+        for (std::size_t character = 0; character < text.size / 2; ++character)
+            pairs += "é";
+        const std::string whole(text.size - 1, 'u');
+        read(whole, whole);
+        read(whole + "v", whole);
+        read(pairs, pairs);
+        read(pairs + "é", pairs);
+        read("x" + pairs, "x" + pairs.substr(0, text.size - 3));
+        read("xx" + pairs, "xx" + pairs.substr(0, text.size - 3));
+    }
 }
 
 // The identity comes before its type here, the list before its count, and both in variants.
