@@ -57,7 +57,7 @@ bool single_shot(const tpdu::Validity &validity) {
 ServiceCentre::ServiceCentre(const NumberPlan &plan, Timers &timers, Registrations &registrations,
                              std::int64_t epoch, Sink sink)
     : plan_(plan), timers_(timers), registrations_(registrations), epoch_(epoch),
-      sink_(std::move(sink)), boxes_(static_cast<std::size_t>(plan.slots())) {
+      sink_(std::move(sink)), boxes_(static_cast<std::size_t>(plan.slots())), errands_(timers) {
     registrations.when_lost([this](int slot) { take_back(slot); });
     registrations.when_registered([this](int slot) { deliver_stored(slot); });
 }
@@ -72,14 +72,6 @@ std::int64_t ServiceCentre::now_in_seconds() const {
 tpdu::Timestamp ServiceCentre::now() const {
     const auto time = tpdu::timestamp_from_unix(now_in_seconds());
     return time ? *time : tpdu::Timestamp{};
-}
-
-void ServiceCentre::later(Timers::Duration delay, std::function<void()> action) {
-    const Id id = next_id_++;
-    errands_[id] = timers_.after(delay, [this, id, act = std::move(action)] {
-        errands_.erase(id);
-        act();
-    });
 }
 
 Answer<SubmitReceipt> ServiceCentre::submit(int slot, const SubmitRequest &request) {
@@ -224,7 +216,8 @@ void ServiceCentre::echo(const Message &message) {
     deliver.originator = message.submit.destination;
     deliver.data_coding = message.submit.data_coding;
     deliver.user_data = message.submit.user_data;
-    later(kEchoTime, [this, slot = message.sender, deliver] { send_from_network(slot, deliver); });
+    errands_.after(kEchoTime,
+                   [this, slot = message.sender, deliver] { send_from_network(slot, deliver); });
 }
 
 void ServiceCentre::send_from_network(int slot, tpdu::Deliver message) {
@@ -254,7 +247,7 @@ void ServiceCentre::conclude(Id id, std::uint8_t status) {
     report.service_centre_time = message.taken;
     report.discharge_time = now();
     report.status = status;
-    later(kStatusReportTime, [this, slot = message.sender, report] {
+    errands_.after(kStatusReportTime, [this, slot = message.sender, report] {
         post(slot, {report, std::nullopt, false, {}});
     });
 }

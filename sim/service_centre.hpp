@@ -2,6 +2,7 @@
 #pragma once
 
 #include "sim/clock.hpp"
+#include "sim/errands.hpp"
 #include "sim/message_parties.hpp"
 #include "sim/number_plan.hpp"
 #include "sim/registrations.hpp"
@@ -118,7 +119,6 @@ class ServiceCentre {
     Mailbox &box(int slot) { return boxes_[static_cast<std::size_t>(slot)]; }
     tpdu::Timestamp now() const;
     std::int64_t now_in_seconds() const;
-    void later(Timers::Duration delay, std::function<void()> action);
 
     std::optional<Refusal> not_deliverable(int slot, const tpdu::Submit &submit) const;
     tpdu::Deliver to_deliver(int sender, const tpdu::Submit &submit, tpdu::Timestamp taken) const;
@@ -146,7 +146,7 @@ class ServiceCentre {
     std::vector<Mailbox> boxes_;
     Id next_id_ = 1;
     std::map<Id, Message> held_;
-    std::map<Id, Timer> errands_;
+    Errands errands_;
 };
 
 } // namespace sim
