@@ -166,6 +166,15 @@ TEST_F(VideoCall, EachEndIsRecordedOnItsOwn) {
     wrong_state(video_.end_recording(0, id_, VideoEnd::kFar), "not being recorded");
 }
 
+// Where the camera comes back, the recording has it again.
+TEST_F(VideoCall, ARecordingOfTheNearEndOutlivesItsCamera) {
+    expect_accepted(video_.start_camera(0, id_, Camera::kFront));
+    expect_accepted(video_.start_recording(0, id_, {VideoEnd::kNear, VideoFormat::kMp4, "/v", 0}));
+    expect_accepted(video_.stop_camera(0, id_));
+    expect_accepted(video_.pause_recording(0, id_, VideoEnd::kNear));
+    expect_accepted(video_.end_recording(0, id_, VideoEnd::kNear));
+}
+
 TEST_F(VideoCall, RecordingsPauseAndResume) {
     const auto every_step = [&](VideoEnd end) {
         return std::vector<Status>{video_.pause_recording(0, id_, end),
