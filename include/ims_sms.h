@@ -26,8 +26,8 @@ typedef struct ims_sms_send_info_s {
     /**
      * The service centre's address: the number of digits, the type of address, the digits as BCD,
      * two an octet: for d digits (d + 1) / 2 + 2 bytes are read. The first byte is rewritten to the
-     * number of bytes that follow it and stays so: to send with the same buffer again, restore it.
-     * NULL is sent as an empty text.
+     * number of bytes that follow it and stays so, also when the message turns out to be too large
+     * to be sent: to use the same buffer again, restore it. NULL is sent as an empty text.
      */
     uint8_t *sca;
     int32_t send_option; /**< defined by the service */

@@ -49,7 +49,7 @@ Action prepare_completion(Arguments &arguments) {
 }
 
 constexpr Verb kVerbs[] = {
-    {"monitor", "show events as they arrive, until SIGINT or SIGTERM",
+    {"monitor", "show events as they arrive, until it is stopped with Ctrl-C or a signal",
      "monitor call-incoming-ind call-ended --json", prepare_monitor},
     {"completion", "print a script that completes imsctl's words in a shell",
      "completion bash > ~/.local/share/bash-completion/completions/imsctl", prepare_completion},
