@@ -1,7 +1,8 @@
 #!/usr/bin/env bash
 # SPDX-License-Identifier: Apache-2.0
-# The checks beyond the tests: formatting, shell scripts, the library with a second compiler and its
-# tests under sanitizers, static analysis, and an installation that others can build against.
+# The checks beyond the tests: formatting, shell scripts, everything but the programs' tests with a
+# second compiler and under sanitizers, static analysis, and an installation that others can build
+# against.
 set -euo pipefail
 cd "$(dirname "$0")/.."
 
@@ -15,15 +16,21 @@ git ls-files '*.c' '*.h' '*.cpp' '*.hpp' | xargs clang-format --dry-run --Werror
 step "Shell scripts"
 git ls-files '*.sh' .ci/run | xargs shellcheck
 
-# The tests of the stand-in and of imsctl take most of the building and belong to the programs, not
-# to what applications link: `scripts/test.sh asan` runs them too.
+# All tests built a second time would take longer than all else here: of those that belong to the
+# programs, the ones that run them are run once more as the test command has built them, with
+# sanitized programs. `scripts/test.sh asan` builds and runs everything sanitized.
 parts=(call dictionary ims login poc record_tree reg settings sms ss support vt xdm)
-step "The library and its tests with the second compiler, under Address-, Leak- and UBSanitizer"
+step "The library, its tests and the programs with the second compiler, under Address-, Leak- and UBSanitizer"
 cmake --preset asan -B build/clang \
     -DCMAKE_C_COMPILER=clang -DCMAKE_CXX_COMPILER=clang++ >/dev/null
-cmake --build build/clang --target "${parts[@]/#/tests.}"
+cmake --build build/clang --target "${parts[@]/#/tests.}" ims-sim imsctl
 ctest --test-dir build/clang --progress --output-on-failure --no-tests=error --parallel 4 \
     --label-regex "^($(IFS='|' && echo "${parts[*]}"))\$"
+
+step "The sanitized programs"
+cmake --preset debug >/dev/null
+cmake --build --preset debug
+IMS_PROGRAMS=$PWD/build/clang/bin ctest --preset debug --progress --label-regex '^programs$'
 
 step "Static analysis of the library"
 git ls-files 'src/*.cpp' 'platform/*.cpp' |

@@ -1,8 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Group documents from end to end, with the stand-in service.
-#include "private_bus.hpp"
-#include "program.hpp"
 #include "temporary_file.hpp"
+#include "with_stand_in.hpp"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
@@ -18,26 +17,11 @@ constexpr const char *kCrew =
     R"("group_rule_set":[{"rule_id":"guests","rule_identity_type":1,)"
     R"("identity":{"contacts":[{"uri":"tel:+15550199"}]}}]})";
 
-class Groups : public ::testing::Test {
+class Groups : public WithStandIn {
   protected:
-    Groups() { service_.wait_for_error("sub1 signal RegistrationStatus (true"); }
-
-    static Outcome run(const std::string &line) { return run_imsctl(split(line)); }
-    static void expect_ok(const std::string &line) {
-        const Outcome outcome = run(line);
-        EXPECT_EQ(outcome.status, 0) << line << '\n' << outcome.error;
-    }
-    static void expect_refusal(const std::string &line, int result) {
-        const Outcome outcome = run(line + " --json");
-        EXPECT_EQ(outcome.status, 1) << line;
-        EXPECT_EQ(outcome.json()["error"]["result"], result) << line;
-    }
     static Json shown(const std::string &slot) {
         return run("--slot " + slot + " group show sip:crew@example.org --json").json();
     }
-
-    PrivateBus bus_;
-    Process service_{{IMS_SIM_PATH, "serve", "--speed", "20", "--verbose"}};
 };
 
 TEST_F(Groups, AreFetchedEditedAndCreatedAgain) {

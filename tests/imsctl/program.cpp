@@ -20,7 +20,7 @@ Environment strict_environment() {
 }
 
 std::vector<std::string> imsctl_command(std::vector<std::string> words) {
-    words.insert(words.begin(), IMSCTL_PATH);
+    words.insert(words.begin(), program("imsctl"));
     return words;
 }
 

@@ -3,6 +3,7 @@
 #pragma once
 
 #include "process.hpp"
+#include "programs.hpp"
 
 #include <nlohmann/json.hpp>
 

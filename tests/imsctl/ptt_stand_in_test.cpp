@@ -1,9 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // Push-to-talk from end to end: three applications on three slots, the library, a bus and the
 // stand-in service.
-#include "private_bus.hpp"
-#include "program.hpp"
 #include "sized_file.hpp"
+#include "with_stand_in.hpp"
 
 #include <csignal>
 #include <gmock/gmock.h>
@@ -14,37 +13,25 @@ namespace {
 
 using testing::HasSubstr;
 
-class PttStandIn : public ::testing::Test {
+class PttStandIn : public WithStandIn {
   protected:
-    PttStandIn() {
-        service_.wait_for_error("is ready");
-        for (int slot = 0; slot < 3; ++slot) {
-            while (run(slot, "registration show").output.find("registered=true") ==
-                   std::string::npos)
-                continue; // the stand-in registers its slots one after the other
-        }
-    }
+    PttStandIn() : WithStandIn(3) {}
 
+    static std::string in_slot(int slot, const std::string &line) {
+        return "--slot " + std::to_string(slot) + " " + line;
+    }
     static Outcome run(int slot, const std::string &line) {
-        return run_imsctl(split("--slot " + std::to_string(slot) + " " + line));
+        return WithStandIn::run(in_slot(slot, line));
     }
-
     static void expect_ok(int slot, const std::string &line) {
-        const Outcome outcome = run(slot, line);
-        EXPECT_EQ(outcome.status, 0) << line << '\n' << outcome.error;
+        WithStandIn::expect_ok(in_slot(slot, line));
     }
 
     // One that is watching already.
-    struct Application : Process {
+    struct Application : Watcher {
         explicit Application(int slot, const std::string &words = "ptt watch")
-            : Process(imsctl_command(split("--slot " + std::to_string(slot) + " " + words)),
-                      strict_environment()) {
-            wait_for_error(" slot " + std::to_string(slot) + "\n");
-        }
+            : Watcher(in_slot(slot, words)) {}
     };
-
-    PrivateBus bus_;
-    Process service_{{IMS_SIM_PATH, "serve", "--speed", "20", "--slots", "3", "--verbose"}};
 };
 
 // All three in one group call, which slot 0 places.

@@ -36,7 +36,7 @@ class PttTalk : public ::testing::Test {
     // In a shell in which "imsctl" is the program.
     void talk_in_shell(std::string script) {
         const std::string name = "imsctl";
-        script.replace(script.find(name), name.size(), "\"" IMSCTL_PATH "\"");
+        script.replace(script.find(name), name.size(), "\"" + program("imsctl") + "\"");
         process_.emplace(std::vector<std::string>{"sh", "-c", script}, strict_environment());
         process_->wait_for_error("talking in session 1 of slot 0\n");
     }

@@ -1,8 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Registration, login, short messages and supplementary services from end to end, with the stand-in
 // service.
-#include "private_bus.hpp"
-#include "program.hpp"
+#include "with_stand_in.hpp"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
@@ -19,40 +18,7 @@ std::string repeated(std::string_view piece, int count) {
     return text;
 }
 
-class Services : public ::testing::Test {
-  protected:
-    // Both slots have registered: no such event of theirs is under way any more.
-    Services() { service_.wait_for_error("sub1 signal RegistrationStatus (true"); }
-
-    // The stand-in's clock runs fast: nothing here takes long.
-    static Outcome run(const std::string &line) { return run_imsctl(split(line)); }
-
-    static void expect_ok(const std::string &line) {
-        const Outcome outcome = run(line);
-        EXPECT_EQ(outcome.status, 0) << line << '\n' << outcome.error;
-    }
-
-    static void expect_refusal(const std::string &line, int result) {
-        const Outcome outcome = run(line + " --json");
-        EXPECT_EQ(outcome.status, 1) << line;
-        EXPECT_EQ(outcome.json()["error"]["result"], result) << line;
-    }
-
-    // One that is watching already.
-    struct Inbox : Process {
-        explicit Inbox(const std::string &words)
-            : Process(imsctl_command(split(words)), strict_environment()) {
-            wait_for_error(" slot ");
-        }
-        std::vector<Json> lines() {
-            EXPECT_EQ(wait(), 0) << both();
-            return json_lines(output());
-        }
-    };
-
-    PrivateBus bus_;
-    Process service_{{IMS_SIM_PATH, "serve", "--speed", "20", "--verbose"}};
-};
+using Services = WithStandIn;
 
 struct TextRow {
     const char *name;
@@ -69,7 +35,7 @@ class ServicesText : public Services, public ::testing::WithParamInterface<TextR
 
 TEST_P(ServicesText, ArrivesInTheOtherSlotAsItWasSent) {
     const TextRow &row = GetParam();
-    Inbox inbox("--slot 1 sms watch --count 1 --json");
+    Watcher inbox("--slot 1 sms watch --count 1 --json");
     const Outcome sent = run_imsctl({"sms", "send", "+15550101", row.text, "--wait", "--json"});
     ASSERT_EQ(sent.status, 0) << sent.error;
     EXPECT_EQ(sent.json()["alphabet"], row.alphabet);
@@ -94,7 +60,7 @@ INSTANTIATE_TEST_SUITE_P(
     [](const ::testing::TestParamInfo<TextRow> &row) { return row.param.name; });
 
 TEST_F(Services, BringsDataAndItsClass) {
-    Inbox inbox("--slot 1 sms watch --count 1 --json");
+    Watcher inbox("--slot 1 sms watch --count 1 --json");
     expect_ok("sms send +15550101 --data 00ff1b --class flash");
     const auto lines = inbox.lines();
     ASSERT_EQ(lines.size(), 1u);
@@ -104,9 +70,9 @@ TEST_F(Services, BringsDataAndItsClass) {
 }
 
 TEST_F(Services, ReportsTheDeliveryToTheSender) {
-    Inbox sender("sms watch --count 1 --json");
-    Inbox acknowledgement("--slot 1 monitor sms-delivery-report-ack --count 1 --json");
-    Inbox receiver("--slot 1 sms watch --count 1 --json");
+    Watcher sender("sms watch --count 1 --json");
+    Watcher acknowledgement("--slot 1 monitor sms-delivery-report-ack --count 1 --json");
+    Watcher receiver("--slot 1 sms watch --count 1 --json");
     expect_ok("sms send +15550101 hello --report --reference 77");
     EXPECT_EQ(receiver.lines().at(0)["message"]["text"], "hello");
     EXPECT_EQ(acknowledgement.lines().at(0)["member_2"], 0);
@@ -117,8 +83,8 @@ TEST_F(Services, ReportsTheDeliveryToTheSender) {
 }
 
 TEST_F(Services, ReportsARefusalThatWasMadeByHand) {
-    Inbox sender("sms watch --count 1 --json");
-    Inbox receiver("--slot 1 sms watch --count 1 --json --no-report");
+    Watcher sender("sms watch --count 1 --json");
+    Watcher receiver("--slot 1 sms watch --count 1 --json --no-report");
     expect_ok("sms send +15550101 hello --report --reference 78");
     const Json message = receiver.lines().at(0);
     const std::string number = message["member_3"].dump();
@@ -137,7 +103,7 @@ TEST_F(Services, TellWhyAMessageWasNotTaken) {
 }
 
 TEST_F(Services, FollowFlightMode) {
-    Inbox watch("registration watch --count 2 --json");
+    Watcher watch("registration watch --count 2 --json");
     EXPECT_EQ(run("flight-mode").output, "ok\n");
     EXPECT_EQ(run("registration show --json").json()["registered"], false);
     expect_refusal("flight-mode", 13);
@@ -153,7 +119,7 @@ TEST_F(Services, FollowFlightMode) {
 }
 
 TEST_F(Services, StoreMessagesForASlotInFlightMode) {
-    Inbox inbox("--slot 1 sms watch --count 1 --json");
+    Watcher inbox("--slot 1 sms watch --count 1 --json");
     expect_ok("--slot 1 flight-mode");
     expect_ok("sms send +15550101 later --wait");
     expect_ok("--slot 1 registration register");
@@ -161,7 +127,7 @@ TEST_F(Services, StoreMessagesForASlotInFlightMode) {
 }
 
 TEST_F(Services, LogAUserInAndOut) {
-    Inbox events("monitor login-state --count 3 --json");
+    Watcher events("monitor login-state --count 3 --json");
     expect_refusal("login alice wrong", 18);
     expect_refusal("logout", 13);
     EXPECT_EQ(run("login alice secret").output, "ok\n");
@@ -209,8 +175,8 @@ TEST_F(Services, BarCalls) {
 }
 
 TEST(ServicesRun, SendsAMessageOnTheBusThatIsMadeForIt) {
-    Process process({IMS_SIM_PATH, "run", "--", IMSCTL_PATH, "sms", "send", "+15550101", "hello",
-                     "--wait", "--json"},
+    Process process({program("ims-sim"), "run", "--", program("imsctl"), "sms", "send", "+15550101",
+                     "hello", "--wait", "--json"},
                     strict_environment());
     EXPECT_EQ(process.wait(), 0) << process.both();
     EXPECT_EQ(Json::parse(process.output())["parts"][0]["message_number"], 1);

@@ -1,7 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Settings, profiles and the network environment from end to end, with the stand-in service.
-#include "private_bus.hpp"
-#include "program.hpp"
+#include "with_stand_in.hpp"
 
 #include <filesystem>
 #include <fstream>
@@ -42,16 +41,12 @@ void write(const std::string &file, const std::string &content) {
     std::ofstream(file) << content;
 }
 
-class Settings : public ::testing::Test {
+class Settings : public WithStandIn {
   protected:
-    Settings() { service_.wait_for_error("is ready"); }
-
     static Json get(const std::string &set) {
         return run_imsctl({"settings", "get", set, "--json"}).json()["settings"];
     }
 
-    PrivateBus bus_;
-    Process service_{{IMS_SIM_PATH, "serve"}};
     Directory directory_;
 };
 

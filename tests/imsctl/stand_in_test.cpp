@@ -1,7 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // From end to end: imsctl, the library, a bus and the stand-in service.
-#include "private_bus.hpp"
-#include "program.hpp"
+#include "with_stand_in.hpp"
 
 #include <csignal>
 #include <gmock/gmock.h>
@@ -13,10 +12,8 @@ namespace {
 using testing::ElementsAre;
 using testing::HasSubstr;
 
-class StandIn : public ::testing::Test {
+class StandIn : public WithStandIn {
   protected:
-    StandIn() { service_.wait_for_error("is ready"); }
-
     // A call from slot 0 to slot 1 that both sides follow.
     void connect_slots() {
         Process ring(imsctl_command(split("--slot 1 monitor call-incoming-ind --count 1")),
@@ -34,9 +31,6 @@ class StandIn : public ::testing::Test {
         return run_imsctl({"call", "list", "--json", "--slot", std::to_string(slot)})
             .json()["calls"];
     }
-
-    PrivateBus bus_;
-    Process service_{{IMS_SIM_PATH, "serve", "--speed", "20", "--verbose"}};
 };
 
 TEST_F(StandIn, CarriesACallFromSlotToSlot) {
@@ -139,17 +133,18 @@ TEST_F(StandIn, ActsOnEveryKindOfVerb) {
 }
 
 TEST(RunByTheStandIn, FindsTheBusThatIsMadeForIt) {
-    Process process({IMS_SIM_PATH, "run", "--", IMSCTL_PATH, "call", "list", "--json"},
+    Process process({program("ims-sim"), "run", "--", program("imsctl"), "call", "list", "--json"},
                     strict_environment());
     EXPECT_EQ(process.wait(), 0) << process.both();
     EXPECT_EQ(Json::parse(process.output()), Json::parse(R"({"verb":"call list","calls":[]})"));
 }
 
 TEST(RunByTheStandIn, PassesOnTheExitStatus) {
-    Process failed({IMS_SIM_PATH, "run", "--", IMSCTL_PATH, "call", "end", "1"},
+    Process failed({program("ims-sim"), "run", "--", program("imsctl"), "call", "end", "1"},
                    strict_environment());
     EXPECT_EQ(failed.wait(), 1) << failed.both();
-    Process misused({IMS_SIM_PATH, "run", "--", IMSCTL_PATH, "call", "dail"}, strict_environment());
+    Process misused({program("ims-sim"), "run", "--", program("imsctl"), "call", "dail"},
+                    strict_environment());
     EXPECT_EQ(misused.wait(), 2) << misused.both();
 }
 

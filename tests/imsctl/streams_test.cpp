@@ -18,7 +18,7 @@ class Streams : public ::testing::Test {
 
     // In a shell that knows the program as "imsctl".
     static std::vector<std::string> shell(const std::string &script) {
-        return {"sh", "-c", "imsctl() { \"" IMSCTL_PATH "\" \"$@\"; }\n" + script};
+        return {"sh", "-c", "imsctl() { \"" + program("imsctl") + "\" \"$@\"; }\n" + script};
     }
 
     PrivateBus bus_;

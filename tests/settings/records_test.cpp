@@ -246,8 +246,7 @@ TEST_F(SettingsRecord, AMissingNameIsSentAsAnEmptyOne) {
 }
 
 TEST_F(SettingsRecord, ANameThatIsNotUtf8IsNotSent) {
-    EXPECT_EQ(ims_get_global_settings_info(handle_, "caf\xe9", &set_),
-              IMS_ERROR_INVALID_PARAMETER);
+    EXPECT_EQ(ims_get_global_settings_info(handle_, "caf\xe9", &set_), IMS_ERROR_INVALID_PARAMETER);
     expect_one_line("ims_settings.cpp", "ims_get_global_settings_info", "Invalid parameter");
     EXPECT_TRUE(requests().empty());
 }

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "bus_client.hpp"
 
+#include "programs.hpp"
 #include "sim/service.hpp"
 
 #include <algorithm>
@@ -43,14 +44,15 @@ Program::Program(const std::vector<std::string> &arguments, const Environment &e
     g_subprocess_launcher_setenv(launcher.get(), "G_DEBUG", "fatal-warnings", TRUE);
     for (const auto &[name, value] : environment)
         g_subprocess_launcher_setenv(launcher.get(), name.c_str(), value.c_str(), TRUE);
-    std::vector<const char *> argv{IMS_SIM_PATH};
+    const std::string path = ::test::program("ims-sim");
+    std::vector<const char *> argv{path.c_str()};
     for (const auto &argument : arguments)
         argv.push_back(argument.c_str());
     argv.push_back(nullptr);
     ErrorSlot error;
     process_.reset(g_subprocess_launcher_spawnv(launcher.get(), argv.data(), &error.raw));
     if (!process_)
-        give_up("cannot start {}: {}", IMS_SIM_PATH, error.message());
+        give_up("cannot start {}: {}", path, error.message());
     output_ = lines_of(g_subprocess_get_stdout_pipe(process_.get()));
     errors_ = lines_of(g_subprocess_get_stderr_pipe(process_.get()));
 }

@@ -240,8 +240,8 @@ constexpr Verb kVerbs[] = {
     {"ptt channel", "tune to a channel", "ptt channel 5 --mode listen", prepare_channel},
     {"ptt crisis", "make a call a crisis call", "ptt crisis 1", prepare_crisis},
     {"ptt keep-alive", "give a sign of life", "ptt keep-alive 30", prepare_keep_alive},
-    {"ptt watch", "show what happens, in words, until it is stopped with Ctrl-C or a signal", "ptt watch",
-     prepare_watch},
+    {"ptt watch", "show what happens, in words, until it is stopped with Ctrl-C or a signal",
+     "ptt watch", prepare_watch},
 };
 
 } // namespace
