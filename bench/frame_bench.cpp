@@ -34,17 +34,32 @@ void measure_signals(benchmark::State &state, const Client &client, const Side &
     report(state, traffic.wrong());
 }
 
+using Measure = void (*)(benchmark::State &state, const Client &client, const Side &side);
+
+template <std::int64_t Outstanding>
+void measure_requests(benchmark::State &state, const Client &client, const Side &side) {
+    measure_requests(state, client, side, Outstanding);
+}
+
+constexpr struct {
+    const char *name;
+    Measure measure;
+} kWorks[] = {
+    {"request_1", measure_requests<1>},
+    {"request_64", measure_requests<64>},
+    {"request_1000", measure_requests<1000>},
+    {"query", measure_queries},
+    {"signal", measure_signals},
+};
+
+// The sides of a work run one after the other, so that both meet the same machine.
 void add_all(const Client &client) {
-    for (const Side *side : kSides) {
-        for (const std::int64_t outstanding : {1, 64, 1000})
-            add("request_" + std::to_string(outstanding) + "/" + side->name,
-                [&client, side, outstanding](benchmark::State &state) {
-                    measure_requests(state, client, *side, outstanding);
+    for (const auto &work : kWorks) {
+        for (const Side *side : kSides)
+            add(std::string{work.name} + "/" + side->name,
+                [&client, &work, side](benchmark::State &state) {
+                    work.measure(state, client, *side);
                 });
-        add(std::string{"query/"} + side->name,
-            [&client, side](benchmark::State &state) { measure_queries(state, client, *side); });
-        add(std::string{"signal/"} + side->name,
-            [&client, side](benchmark::State &state) { measure_signals(state, client, *side); });
     }
 }
 
