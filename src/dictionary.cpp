@@ -57,14 +57,15 @@ gsize offset_width(gsize content, gsize offsets) noexcept {
     return content + 2 * offsets <= UINT16_MAX ? 2 : 4;
 }
 
-// An "a{sv}" in the form that GLib keeps a received one in: a single block of bytes. As values of
-// their own its entries would take a dozen allocations each, and as many releases.
+// An "a{sv}" as the bytes that GLib serialises one to, in a single block. As values of their own
+// its entries would take a dozen allocations each, and as many releases.
 class DictionaryBytes {
   public:
     explicit DictionaryBytes(gsize entries) noexcept;
 
     // False for an entry that would make the dictionary too large to cross the bus.
     bool add(std::string_view key, char type, const void *value, gsize size) noexcept;
+    // Nothing when it has become too large all the same.
     Variant finish() noexcept;
 
   private:
@@ -84,9 +85,10 @@ class DictionaryBytes {
             block_->data[size_] = 0;
     }
     void append_offset(gsize offset, gsize width) noexcept;
+    // The array grows by powers of two by itself.
     void make_room(gsize size) noexcept {
         if (size_ + size > block_->len)
-            g_byte_array_set_size(block_.get(), static_cast<guint>(2 * (size_ + size)));
+            g_byte_array_set_size(block_.get(), static_cast<guint>(size_ + size));
     }
 
     ByteArray block_{g_byte_array_new()};
@@ -128,6 +130,8 @@ Variant DictionaryBytes::finish() noexcept {
     make_room(ends_.size() * width);
     for (const gsize end : ends_)
         append_offset(end, width);
+    if (size_ > kMaxTupleSize)
+        return nullptr;
     g_byte_array_set_size(block_.get(), static_cast<guint>(size_));
     GBytes *bytes = g_byte_array_free_to_bytes(block_.release());
     Variant dictionary = owned(g_variant_new_from_bytes(G_VARIANT_TYPE_VARDICT, bytes, TRUE));
@@ -155,7 +159,8 @@ bool write_field(DictionaryBytes &dictionary, const FieldRow &row, WriteAs as,
     case FieldKind::kInt32:
         return write_number(dictionary, row.name(), at<std::int32_t>(record, row.offset), as);
     case FieldKind::kBoolean: {
-        const guint8 flag = at<bool>(record, row.offset) ? 1 : 0;
+        // A byte: C code may have left another value than 0 or 1.
+        const guint8 flag = at<guint8>(record, row.offset) != 0 ? 1 : 0;
         return dictionary.add(row.name(), 'b', &flag, sizeof flag);
     }
     case FieldKind::kOwnText:

@@ -5,8 +5,7 @@
 
 #include <gtest/gtest.h>
 
-#include <climits>
-#include <cstring>
+#include <cstdint>
 #include <string>
 
 namespace test {
@@ -110,6 +109,52 @@ TEST(WrittenDictionary, HasTheBytesOfOneThatIsBuiltAtEveryLengthOfItsTexts) {
     check(1 << 20);
 }
 
+struct Numbers {
+    const char *text;
+    std::int32_t n01, n02, n03, n04, n05, n06, n07, n08, n09, n10, n11, n12, n13, n14, n15, n16;
+    std::int32_t n17, n18, n19, n20, n21, n22, n23, n24, n25, n26, n27, n28, n29, n30, n31, n32;
+};
+
+consteval auto numbers_table() {
+    ims::Field fields[33]{IMS_FIELD(Numbers, text)};
+    constexpr std::string_view kKeys = "n01n02n03n04n05n06n07n08n09n10n11n12n13n14n15n16"
+                                       "n17n18n19n20n21n22n23n24n25n26n27n28n29n30n31n32";
+    for (std::size_t at = 1; at < std::size(fields); ++at)
+        fields[at] = ims::field<std::int32_t>(kKeys.substr(3 * (at - 1), 3),
+                                              offsetof(Numbers, n01) + 4 * (at - 1));
+    return ims::field_table(fields);
+}
+
+// The text pushes what follows it, entries and their ends, across the end of the writer's block.
+TEST(WrittenDictionary, HasRoomForItsEntriesWhateverIsBeforeThem) {
+    static constexpr auto kNumbers = numbers_table();
+    static constexpr auto kPlan =
+        ims::write_plan(kNumbers, std::span<const ims::WriteRule>{}, &ims::WriteRule::update);
+    for (std::size_t length = 0; length < 5000; ++length) {
+        const std::string text(length, 'x');
+        Numbers record{};
+        record.text = text.c_str();
+        record.n32 = static_cast<std::int32_t>(length);
+        const auto dictionary = ims::write_dictionary(kNumbers, kPlan, &record);
+        Numbers back{};
+        ims::read_dictionary(dictionary.get(), kNumbers, &back);
+        ASSERT_EQ(text, back.text);
+        ASSERT_EQ(back.n32, record.n32);
+    }
+}
+
+TEST(WrittenDictionary, TakesAnyByteButZeroForTrue) {
+    for (const unsigned char byte : {0, 1, 2, 255}) {
+        Record record{"one", 1, false, {nullptr, 1}, "two"};
+        *reinterpret_cast<unsigned char *>(&record.flag) = byte;
+        const auto dictionary = ims::write_dictionary(kFields, kUpdate, &record);
+        gboolean flag = byte == 0;
+        EXPECT_TRUE(g_variant_lookup(dictionary.get(), "flag", "b", &flag));
+        EXPECT_EQ(flag, byte != 0 ? TRUE : FALSE);
+        EXPECT_TRUE(g_variant_is_normal_form(dictionary.get()));
+    }
+}
+
 TEST(WrittenDictionary, IsNoneForAMissingOrBrokenText) {
     Record record{"one", 1, true, {nullptr, 1}, "two"};
     record.last = nullptr;
@@ -129,6 +174,20 @@ TEST(WrittenDictionary, IsNoneWhenItsTextsAreTooLargeTogether) {
     const std::string whole(ims::kMaxTupleSize, 'x');
     record.last = whole.c_str();
     EXPECT_EQ(ims::write_dictionary(kFields, kUpdate, &record), nullptr);
+}
+
+TEST(WrittenDictionary, IsAsLargeAsARequestMayBeAtMost) {
+    const auto size_with = [](const std::string &text) {
+        return g_variant_get_size(built({{"first", g_variant_new_string(text.c_str())}}).get());
+    };
+    const gsize edge = ims::kMaxTupleSize - size_with(std::string(1 << 20, 'x')) + (1 << 20);
+    for (const gsize length : {edge - 1, edge, edge + 1}) {
+        const std::string text(length, 'x');
+        const Record record{text.c_str(), 0, false, {nullptr, 0}, nullptr};
+        const auto dictionary = ims::write_dictionary(kOnlyText, kOnlyTextPlan, &record);
+        EXPECT_EQ(dictionary != nullptr, size_with(text) <= ims::kMaxTupleSize) << length - edge;
+        EXPECT_EQ(dictionary != nullptr, length <= edge) << length - edge;
+    }
 }
 
 TEST(WrittenDictionary, IsReadBack) {
