@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "verb_checks.hpp"
 
+#include <algorithm>
 #include <gmock/gmock.h>
 
 namespace test {
@@ -12,6 +13,17 @@ std::string verb_of(const VerbRow &row) {
     for (std::size_t i = 1; i < row.verb_words; ++i)
         verb += ' ' + words[i];
     return verb;
+}
+
+// The library logs on standard error.
+void expect_logged(const VerbRow &row, const Outcome &outcome) {
+    const std::string end = row.line_logged;
+    if (end.empty()) {
+        EXPECT_EQ(outcome.error, "");
+        return;
+    }
+    EXPECT_EQ(std::count(outcome.error.begin(), outcome.error.end(), '\n'), 1);
+    EXPECT_THAT(outcome.error, testing::EndsWith(end + "\n"));
 }
 
 } // namespace
@@ -30,7 +42,8 @@ TEST_P(ServiceVerbs, SendsItsRequestOnceAndShowsTheReply) {
     const VerbRow &row = GetParam();
     answer(row.method, row.reply_type, row.reply);
     const Outcome outcome = run_imsctl(split(row.line));
-    EXPECT_EQ(outcome.status, 0) << outcome.error;
+    EXPECT_EQ(outcome.status, 0);
+    expect_logged(row, outcome);
     EXPECT_EQ(outcome.output, row.text + std::string("\n"));
 
     const auto calls = calls_to(row.method);
@@ -48,7 +61,8 @@ TEST_P(ServiceVerbs, ShowsTheReplyAsOneJsonObject) {
     const VerbRow &row = GetParam();
     answer(row.method, row.reply_type, row.reply);
     const Outcome outcome = run_imsctl(split(row.line + std::string(" --json")));
-    EXPECT_EQ(outcome.status, 0) << outcome.error;
+    EXPECT_EQ(outcome.status, 0);
+    expect_logged(row, outcome);
     Json expected = {{"verb", verb_of(row)}};
     expected.update(Json::parse(row.json));
     EXPECT_EQ(outcome.json().dump(), expected.dump());

@@ -23,6 +23,7 @@ struct VerbRow {
     const char *refusal; // the same with the result 77
     const char *json;    // without the verb
     const char *text;
+    const char *line_logged = ""; // the end of the library's one line about this reply
 };
 
 void PrintTo(const VerbRow &row, std::ostream *out);

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "with_stand_in.hpp"
 
+#include <csignal>
+
 namespace test {
 
 WithStandIn::WithStandIn(int slots)
@@ -8,6 +10,11 @@ WithStandIn::WithStandIn(int slots)
                 "--verbose"}} {
     // They register one after the other.
     service_.wait_for_error("sub" + std::to_string(slots - 1) + " signal RegistrationStatus (true");
+}
+
+WithStandIn::~WithStandIn() {
+    service_.send_signal(SIGTERM);
+    EXPECT_EQ(service_.wait(), 0) << service_.both();
 }
 
 void WithStandIn::expect_ok(const std::string &line) {
@@ -29,7 +36,10 @@ void WithStandIn::expect_refusal(const std::string &line, int result) {
 
 WithStandIn::Watcher::Watcher(const std::string &line)
     : Process(imsctl_command(split(line)), strict_environment()) {
-    wait_for_error(" slot ");
+    const std::string option = "--slot ";
+    const auto at = line.find(option);
+    wait_for_error(" slot " + (at == std::string::npos ? "0" : line.substr(at + option.size(), 1)) +
+                   "\n");
 }
 
 std::vector<Json> WithStandIn::Watcher::lines() {

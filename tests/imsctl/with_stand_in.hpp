@@ -16,6 +16,8 @@ class WithStandIn : public ::testing::Test {
     // When this returns all slots have registered: no event of that is under way any more. The
     // service's clock runs fast.
     explicit WithStandIn(int slots = kUsualSlots);
+    // The service ends well: what its memory holds then is looked at where it is sanitized.
+    ~WithStandIn() override;
 
     // A command line without quoting.
     static Outcome run(const std::string &line) { return run_imsctl(split(line)); }
