@@ -75,7 +75,7 @@ GVariant *answered_at(const std::string &path, GVariant *value) {
         return answered_dictionary(path, value);
     if (g_variant_is_of_type(value, G_VARIANT_TYPE("aa{sv}")))
         return answered_list(path, value);
-    return g_variant_ref(value);
+    return value; // the builder takes a reference of its own
 }
 
 } // namespace

@@ -16,7 +16,7 @@ class Copier {
             return copy_dictionary(value);
         if (g_variant_is_of_type(value, G_VARIANT_TYPE("aa{sv}")))
             return copy_list(value);
-        return g_variant_ref(value);
+        return value; // the builder takes a reference of its own
     }
     std::size_t count() const { return count_; }
 
