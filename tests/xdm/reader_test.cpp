@@ -112,7 +112,7 @@ TEST_F(Reader, PeelsAnyNumberOfVariants) {
             EXPECT_EQ(image_with(number,
                                  [layers](GVariantBuilder *dictionary, const char *key,
                                           GVariant *content) {
-                                     GVariant *wrapped = g_variant_ref(content);
+                                     GVariant *wrapped = content;
                                      for (int layer = 0; layer < layers; ++layer)
                                          wrapped = g_variant_new_variant(wrapped);
                                      g_variant_builder_add(dictionary, "{sv}", key, wrapped);
