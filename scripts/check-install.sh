@@ -42,7 +42,7 @@ find_package(kelvo-ims 1 REQUIRED)
 add_executable(app app.cpp)
 target_link_libraries(app PRIVATE kelvo-ims::kelvo-ims)
 APP
-cmake -S "$work/app-cmake" -B "$work/app-build" -DCMAKE_PREFIX_PATH="$prefix" >/dev/null
+cmake -G Ninja -S "$work/app-cmake" -B "$work/app-build" -DCMAKE_PREFIX_PATH="$prefix" >/dev/null
 cmake --build "$work/app-build" >/dev/null
 "$work/app-build/app" 2>/dev/null
 echo "CMake package: ok"
