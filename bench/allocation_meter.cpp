@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "allocation_meter.hpp"
+#include "bench/allocation_meter.hpp"
 
 #include <atomic>
 #include <cerrno>

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "protocol.hpp"
-#include "side.hpp"
+#include "bench/protocol.hpp"
+#include "bench/side.hpp"
 
 #include <cstring>
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "client.hpp"
+#include "bench/client.hpp"
 
-#include "protocol.hpp"
+#include "bench/protocol.hpp"
 
 #include <stdexcept>
 

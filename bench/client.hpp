@@ -2,8 +2,8 @@
 // The application under measurement. Both sides use the one connection, which is the process's.
 #pragma once
 
+#include "bench/owned.hpp"
 #include "ims.h"
-#include "owned.hpp"
 
 #include <cstdint>
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Rates through the library beside the same calls made with GDBus alone.
-#include "measure.hpp"
-#include "traffic.hpp"
+#include "bench/measure.hpp"
+#include "bench/traffic.hpp"
 
 namespace bench {
 namespace {

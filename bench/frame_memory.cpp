@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 // Heap in use per pending request, through the library and with GDBus alone.
-#include "allocation_meter.hpp"
-#include "protocol.hpp"
-#include "stage.hpp"
-#include "traffic.hpp"
+#include "bench/allocation_meter.hpp"
+#include "bench/protocol.hpp"
+#include "bench/stage.hpp"
+#include "bench/traffic.hpp"
 
 #include <algorithm>
 #include <array>

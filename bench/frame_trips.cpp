@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Makes a fixed number of round trips, one after the other, for a tool that counts instructions.
-#include "stage.hpp"
-#include "traffic.hpp"
+#include "bench/stage.hpp"
+#include "bench/traffic.hpp"
 
 #include <cstdio>
 #include <cstdlib>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "side.hpp"
+#include "bench/side.hpp"
 
 #include <stdexcept>
 

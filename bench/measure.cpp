@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "measure.hpp"
+#include "bench/measure.hpp"
 
-#include "stage.hpp"
+#include "bench/stage.hpp"
 
 #include <unistd.h>
 

@@ -2,7 +2,7 @@
 // What the programs that measure rates share.
 #pragma once
 
-#include "client.hpp"
+#include "bench/client.hpp"
 
 #include <benchmark/benchmark.h>
 

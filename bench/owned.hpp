@@ -2,7 +2,7 @@
 // Owners for what GLib hands out.
 #pragma once
 
-#include "glib.hpp"
+#include "src/glib.hpp"
 
 namespace bench {
 

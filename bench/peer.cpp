@@ -2,8 +2,8 @@
 // Answers in the service's place, as cheaply as GDBus lets it: straight from the connection's own
 // thread. A call is given the session that the caller sent as its call type, so that the caller
 // can tell every answer apart.
-#include "owned.hpp"
-#include "protocol.hpp"
+#include "bench/owned.hpp"
+#include "bench/protocol.hpp"
 
 #include <cstdint>
 #include <cstdio>

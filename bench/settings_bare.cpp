@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // The two sides that do without the library. They take the names of the keys from its table.
-#include "protocol.hpp"
-#include "settings_record.hpp"
-#include "settings_side.hpp"
+#include "bench/protocol.hpp"
+#include "bench/settings_record.hpp"
+#include "bench/settings_side.hpp"
 
 #include <cstdlib>
 #include <cstring>

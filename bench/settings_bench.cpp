@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // A full settings record read and written, and moved over the bus, by each side.
-#include "measure.hpp"
-#include "settings_work.hpp"
+#include "bench/measure.hpp"
+#include "bench/settings_work.hpp"
 
 #include <memory>
 

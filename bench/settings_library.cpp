@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "protocol.hpp"
-#include "settings_side.hpp"
+#include "bench/protocol.hpp"
+#include "bench/settings_side.hpp"
 
-#include "settings_fields.hpp"
-#include "wire.hpp"
+#include "src/settings_fields.hpp"
+#include "src/wire.hpp"
 
 namespace bench {
 namespace {

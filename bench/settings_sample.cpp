@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "settings_sample.hpp"
+#include "bench/settings_sample.hpp"
 
-#include "protocol.hpp"
+#include "bench/protocol.hpp"
 
 #include <stdexcept>
 #include <string_view>

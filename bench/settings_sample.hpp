@@ -2,9 +2,9 @@
 // A full settings record, and its dictionary as GDBus hands it to an application.
 #pragma once
 
-#include "settings_record.hpp"
+#include "bench/settings_record.hpp"
 
-#include "owned.hpp"
+#include "bench/owned.hpp"
 
 #include <string>
 #include <vector>

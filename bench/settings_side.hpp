@@ -3,7 +3,7 @@
 // alone, and as little as GDBus lets anybody do.
 #pragma once
 
-#include "client.hpp"
+#include "bench/client.hpp"
 
 #include <array>
 

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // Does one kind of work with a settings record a fixed number of times, for a tool that counts
 // instructions.
-#include "settings_work.hpp"
-#include "stage.hpp"
+#include "bench/settings_work.hpp"
+#include "bench/stage.hpp"
 
 #include <cstdio>
 #include <cstdlib>

@@ -3,8 +3,8 @@
 // trips.
 #pragma once
 
-#include "settings_sample.hpp"
-#include "settings_side.hpp"
+#include "bench/settings_sample.hpp"
+#include "bench/settings_side.hpp"
 
 #include <string_view>
 

@@ -3,7 +3,7 @@
 // application without the library would write it.
 #pragma once
 
-#include "client.hpp"
+#include "bench/client.hpp"
 
 #include <array>
 #include <cstdint>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "stage.hpp"
+#include "bench/stage.hpp"
 
 #include <array>
 #include <cerrno>

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "traffic.hpp"
+#include "bench/traffic.hpp"
 
-#include "protocol.hpp"
+#include "bench/protocol.hpp"
 
 #include <memory>
 

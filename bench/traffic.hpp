@@ -2,7 +2,7 @@
 // The three kinds of traffic that are measured, for either side.
 #pragma once
 
-#include "side.hpp"
+#include "bench/side.hpp"
 
 namespace bench {
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // What the call list's reply becomes.
-#include "expectations.hpp"
-#include "with_peer.hpp"
+#include "tests/support/expectations.hpp"
+#include "tests/support/with_peer.hpp"
 
 #include <algorithm>
 #include <cstdlib>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "call_rows.hpp"
+#include "tests/call/call_rows.hpp"
 
 #include <glib.h>
 #include <gtest/gtest.h>

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // CallConfNotifyReceived carries two counts beside its two arrays, and the service may be wrong
 // about them.
-#include "with_peer.hpp"
+#include "tests/support/with_peer.hpp"
 
 #include <climits>
 #include <cstdlib>

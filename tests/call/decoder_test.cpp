@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // The call decoder called by itself: ids that no signal leads to, and what it is not to trust.
-#include "decoder_checks.hpp"
-#include "event_rows.hpp"
+#include "tests/call/event_rows.hpp"
+#include "tests/support/decoder_checks.hpp"
 
 #include <climits>
 

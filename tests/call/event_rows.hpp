@@ -2,7 +2,7 @@
 // The call notifications: what the service sends and what the application gets.
 #pragma once
 
-#include "event_row.hpp"
+#include "tests/support/event_row.hpp"
 
 namespace test {
 

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // The call signals as they reach the application's callback.
-#include "event_checks.hpp"
-#include "event_rows.hpp"
-#include "released.hpp"
+#include "tests/call/event_rows.hpp"
+#include "tests/support/event_checks.hpp"
+#include "tests/support/released.hpp"
 
 #include <cstdlib>
 #include <set>

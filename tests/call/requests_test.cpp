@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // Every row of the call module through every check, and that no row is missing.
-#include "call_rows.hpp"
-#include "declarations.hpp"
-#include "request_checks.hpp"
+#include "tests/call/call_rows.hpp"
+#include "tests/support/declarations.hpp"
+#include "tests/support/request_checks.hpp"
 
 #include <algorithm>
 #include <set>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "contract.hpp"
+#include "tests/contract/contract.hpp"
 
 #include <gio/gio.h>
 

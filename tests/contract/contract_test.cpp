@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 // The library, the files and the stand-in say the same. A request or signal that is added to one of
 // them alone makes this fail.
-#include "bus_observer.hpp"
-#include "declarations.hpp"
-#include "library.hpp"
+#include "tests/contract/library.hpp"
+#include "tests/support/bus_observer.hpp"
+#include "tests/support/declarations.hpp"
 
 #include "sim/stand_in.hpp"
 

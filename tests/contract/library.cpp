@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "library.hpp"
+#include "tests/contract/library.hpp"
 
 namespace test {
 namespace {

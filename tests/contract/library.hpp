@@ -2,9 +2,9 @@
 // What the library really sends and accepts, seen on the bus.
 #pragma once
 
-#include "contract.hpp"
-#include "modules.hpp"
-#include "with_peer.hpp"
+#include "tests/contract/contract.hpp"
+#include "tests/contract/modules.hpp"
+#include "tests/support/with_peer.hpp"
 
 #include <map>
 #include <string>

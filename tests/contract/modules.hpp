@@ -3,8 +3,8 @@
 // CMakeLists.txt.
 #pragma once
 
-#include "event_row.hpp"
-#include "request_row.hpp"
+#include "tests/support/event_row.hpp"
+#include "tests/support/request_row.hpp"
 
 #include <set>
 #include <string>

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // The bus policy, as a dbus-daemon applies it. The service and its clients are this very user, so
 // the names in the policy are replaced; everything else is the file's.
-#include "expectations.hpp"
-#include "with_peer.hpp"
+#include "tests/support/expectations.hpp"
+#include "tests/support/with_peer.hpp"
 
 #include <gmock/gmock.h>
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // The bytes of a written dictionary beside those that GLib makes of the same entries. No bus.
-#include "dictionary.hpp"
-#include "variant.hpp"
+#include "src/dictionary.hpp"
+#include "tests/support/variant.hpp"
 
 #include <gtest/gtest.h>
 

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // An ims_init() that gets no memory.
-#include "bus_observer.hpp"
-#include "expectations.hpp"
-#include "with_peer.hpp"
+#include "tests/support/bus_observer.hpp"
+#include "tests/support/expectations.hpp"
+#include "tests/support/with_peer.hpp"
 
 // In failing_new.cpp.
 extern bool out_of_memory;

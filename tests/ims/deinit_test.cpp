@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // Releasing handles.
-#include "bus_observer.hpp"
-#include "expectations.hpp"
-#include "with_peer.hpp"
+#include "tests/support/bus_observer.hpp"
+#include "tests/support/expectations.hpp"
+#include "tests/support/with_peer.hpp"
 
 #include <algorithm>
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // When, where and in which order answers and notifications arrive.
-#include "expectations.hpp"
-#include "with_peer.hpp"
+#include "tests/support/expectations.hpp"
+#include "tests/support/with_peer.hpp"
 
 #include <thread>
 

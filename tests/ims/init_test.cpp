@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 // Making and releasing handles.
-#include "bus_observer.hpp"
-#include "expectations.hpp"
-#include "glib_watch.hpp"
-#include "request_row.hpp"
-#include "with_peer.hpp"
+#include "tests/support/bus_observer.hpp"
+#include "tests/support/expectations.hpp"
+#include "tests/support/glib_watch.hpp"
+#include "tests/support/request_row.hpp"
+#include "tests/support/with_peer.hpp"
 
 #include <cerrno>
 #include <climits>

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Ending notifications and releasing the handle inside a callback, with more signals waiting.
-#include "with_peer.hpp"
+#include "tests/support/with_peer.hpp"
 
 #include <optional>
 

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 // Asking for notifications and ending them.
-#include "bus_observer.hpp"
-#include "expectations.hpp"
-#include "notification_table.hpp"
-#include "with_peer.hpp"
+#include "tests/ims/notification_table.hpp"
+#include "tests/support/bus_observer.hpp"
+#include "tests/support/expectations.hpp"
+#include "tests/support/with_peer.hpp"
 
 #include <iterator>
 #include <set>

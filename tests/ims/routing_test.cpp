@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 // The signal callback called as the bus never calls it, and a table that fails.
-#include "bus_observer.hpp"
-#include "client.hpp"
-#include "expectations.hpp"
-#include "with_peer.hpp"
+#include "src/client.hpp"
+#include "tests/support/bus_observer.hpp"
+#include "tests/support/expectations.hpp"
+#include "tests/support/with_peer.hpp"
 
 #include <dlfcn.h>
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // The largest request: one more byte is refused, before the bus would cut the process off.
-#include "expectations.hpp"
-#include "with_peer.hpp"
+#include "tests/support/expectations.hpp"
+#include "tests/support/with_peer.hpp"
 
 namespace test {
 namespace {

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Every verb of calls against a scripted service: what it sends, and what it shows of the reply.
-#include "verb_checks.hpp"
+#include "tests/imsctl/verb_checks.hpp"
 
 #include <set>
 

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // What the shell is offered.
-#include "in_process.hpp"
+#include "tests/imsctl/in_process.hpp"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

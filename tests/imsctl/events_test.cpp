@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "events.hpp"
+#include "tools/imsctl/events.hpp"
 
 #include <algorithm>
 #include <cstdlib>

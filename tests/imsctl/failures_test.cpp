@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // What imsctl says, and how it exits, when something is in the way.
-#include "private_bus.hpp"
-#include "program.hpp"
-#include "scripted_peer.hpp"
+#include "tests/imsctl/program.hpp"
+#include "tests/support/private_bus.hpp"
+#include "tests/support/scripted_peer.hpp"
 
 #include <csignal>
 #include <cstdlib>

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "files.hpp"
+#include "tools/imsctl/files.hpp"
 
-#include "failure.hpp"
+#include "tools/imsctl/failure.hpp"
 
 #include <cstdlib>
 #include <fcntl.h>

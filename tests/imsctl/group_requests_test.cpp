@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 // The verbs about groups against a scripted service: what each sends, and what it shows.
-#include "group_documents.hpp"
-#include "private_bus.hpp"
-#include "program.hpp"
-#include "scripted_peer.hpp"
-#include "temporary_file.hpp"
+#include "tests/imsctl/group_documents.hpp"
+#include "tests/imsctl/program.hpp"
+#include "tests/imsctl/temporary_file.hpp"
+#include "tests/support/private_bus.hpp"
+#include "tests/support/scripted_peer.hpp"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Group documents from end to end, with the stand-in service.
-#include "temporary_file.hpp"
-#include "with_stand_in.hpp"
+#include "tests/imsctl/temporary_file.hpp"
+#include "tests/imsctl/with_stand_in.hpp"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

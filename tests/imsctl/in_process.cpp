@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "in_process.hpp"
+#include "tests/imsctl/in_process.hpp"
 
-#include "command_line.hpp"
+#include "tools/imsctl/command_line.hpp"
 
 #include <cstdlib>
 

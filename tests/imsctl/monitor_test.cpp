@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // Every event, in both forms, and every way for the monitor to end.
-#include "private_bus.hpp"
-#include "program.hpp"
-#include "scripted_peer.hpp"
+#include "tests/imsctl/program.hpp"
+#include "tests/support/private_bus.hpp"
+#include "tests/support/scripted_peer.hpp"
 
 #include <algorithm>
 #include <csignal>

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "process.hpp"
+#include "tests/imsctl/process.hpp"
 
-#include "pump.hpp"
+#include "tests/support/pump.hpp"
 
 #include <csignal>
 #include <stdexcept>

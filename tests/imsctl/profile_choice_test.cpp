@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "profile_choice.hpp"
+#include "tools/imsctl/profile_choice.hpp"
 
-#include "failure.hpp"
+#include "tools/imsctl/failure.hpp"
 
 #include <gtest/gtest.h>
 #include <vector>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "program.hpp"
+#include "tests/imsctl/program.hpp"
 
 #include <sstream>
 

@@ -2,8 +2,8 @@
 // imsctl as a child process, and what it writes.
 #pragma once
 
-#include "process.hpp"
-#include "programs.hpp"
+#include "tests/imsctl/process.hpp"
+#include "tests/programs/programs.hpp"
 
 #include <nlohmann/json.hpp>
 

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // Every push-to-talk event: as monitor shows it, to programs, and as watch tells it in words.
-#include "private_bus.hpp"
-#include "program.hpp"
-#include "scripted_peer.hpp"
+#include "tests/imsctl/program.hpp"
+#include "tests/support/private_bus.hpp"
+#include "tests/support/scripted_peer.hpp"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // The push-to-talk verbs against a scripted service: what each sends, and what it shows of the
 // reply.
-#include "sized_file.hpp"
-#include "verb_checks.hpp"
+#include "tests/imsctl/sized_file.hpp"
+#include "tests/imsctl/verb_checks.hpp"
 
 #include <gmock/gmock.h>
 #include <set>

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // Push-to-talk from end to end: three applications on three slots, the library, a bus and the
 // stand-in service.
-#include "sized_file.hpp"
-#include "with_stand_in.hpp"
+#include "tests/imsctl/sized_file.hpp"
+#include "tests/imsctl/with_stand_in.hpp"
 
 #include <csignal>
 #include <gmock/gmock.h>

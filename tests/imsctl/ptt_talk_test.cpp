@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // imsctl ptt talk against a scripted service.
-#include "private_bus.hpp"
-#include "program.hpp"
-#include "scripted_peer.hpp"
+#include "tests/imsctl/program.hpp"
+#include "tests/support/private_bus.hpp"
+#include "tests/support/scripted_peer.hpp"
 
 #include <csignal>
 #include <fcntl.h>

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Registration, login, delivery reports and supplementary services against a scripted service: what
 // each verb sends, and what it shows of the reply.
-#include "verb_checks.hpp"
+#include "tests/imsctl/verb_checks.hpp"
 
 #include <gmock/gmock.h>
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Registration, login, short messages and supplementary services from end to end, with the stand-in
 // service.
-#include "with_stand_in.hpp"
+#include "tests/imsctl/with_stand_in.hpp"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

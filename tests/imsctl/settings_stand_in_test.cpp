@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Settings, profiles and the network environment from end to end, with the stand-in service.
-#include "with_stand_in.hpp"
+#include "tests/imsctl/with_stand_in.hpp"
 
 #include <filesystem>
 #include <fstream>

@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 // Sending and watching short messages against a scripted service.
-#include "private_bus.hpp"
-#include "program.hpp"
-#include "scripted_peer.hpp"
+#include "tests/imsctl/program.hpp"
+#include "tests/support/private_bus.hpp"
+#include "tests/support/scripted_peer.hpp"
 
-#include "tpdu/tpdu.hpp"
+#include "tools/tpdu/tpdu.hpp"
 
 #include <csignal>
 #include <gmock/gmock.h>

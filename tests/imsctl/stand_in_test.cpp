@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // From end to end: imsctl, the library, a bus and the stand-in service.
-#include "with_stand_in.hpp"
+#include "tests/imsctl/with_stand_in.hpp"
 
 #include <csignal>
 #include <gmock/gmock.h>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "verb_checks.hpp"
+#include "tests/imsctl/verb_checks.hpp"
 
 #include <algorithm>
 #include <gmock/gmock.h>

@@ -3,9 +3,9 @@
 // against a scripted service: what each sends, and what it shows of the reply.
 #pragma once
 
-#include "private_bus.hpp"
-#include "program.hpp"
-#include "scripted_peer.hpp"
+#include "tests/imsctl/program.hpp"
+#include "tests/support/private_bus.hpp"
+#include "tests/support/scripted_peer.hpp"
 
 #include <gtest/gtest.h>
 #include <ostream>

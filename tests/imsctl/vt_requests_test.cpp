@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Video telephony against a scripted service, and how a verb finds the call that it is about.
-#include "verb_checks.hpp"
+#include "tests/imsctl/verb_checks.hpp"
 
 #include <gmock/gmock.h>
 

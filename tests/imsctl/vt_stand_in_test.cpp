@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // A video call from end to end, with the stand-in service.
-#include "with_stand_in.hpp"
+#include "tests/imsctl/with_stand_in.hpp"
 
 #include <gtest/gtest.h>
 

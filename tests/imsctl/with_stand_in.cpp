@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "with_stand_in.hpp"
+#include "tests/imsctl/with_stand_in.hpp"
 
 #include <csignal>
 

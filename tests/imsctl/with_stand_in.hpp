@@ -2,8 +2,8 @@
 // The command line from end to end: imsctl and the stand-in service, processes on a private bus.
 #pragma once
 
-#include "private_bus.hpp"
-#include "program.hpp"
+#include "tests/imsctl/program.hpp"
+#include "tests/support/private_bus.hpp"
 
 #include <gtest/gtest.h>
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // The login decoder called by itself.
-#include "decoder_checks.hpp"
-#include "event_rows.hpp"
+#include "tests/login/event_rows.hpp"
+#include "tests/support/decoder_checks.hpp"
 
 #include <climits>
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "login_rows.hpp"
+#include "tests/login/login_rows.hpp"
 
 #include <gtest/gtest.h>
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // The login signal as it reaches the application's callback.
-#include "event_checks.hpp"
-#include "event_rows.hpp"
+#include "tests/login/event_rows.hpp"
+#include "tests/support/event_checks.hpp"
 
 namespace test {
 

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 // The login module's rows through every check, and what its requests do beside that.
-#include "declarations.hpp"
-#include "expectations.hpp"
-#include "login_rows.hpp"
-#include "request_checks.hpp"
+#include "tests/login/login_rows.hpp"
+#include "tests/support/declarations.hpp"
+#include "tests/support/expectations.hpp"
+#include "tests/support/request_checks.hpp"
 
 namespace test {
 

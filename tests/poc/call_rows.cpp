@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "poc_rows.hpp"
+#include "tests/poc/poc_rows.hpp"
 
 #include <gtest/gtest.h>
 

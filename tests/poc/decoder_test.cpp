@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // The push-to-talk decoder called by itself: what no signal leads to, and events for nobody.
-#include "decoder_checks.hpp"
-#include "event_rows.hpp"
+#include "tests/poc/event_rows.hpp"
+#include "tests/support/decoder_checks.hpp"
 
 #include <climits>
 

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // Who has the floor: the values that are asked with, the list that comes back.
-#include "expectations.hpp"
-#include "released.hpp"
-#include "with_peer.hpp"
+#include "tests/support/expectations.hpp"
+#include "tests/support/released.hpp"
+#include "tests/support/with_peer.hpp"
 
 #include <climits>
 

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // Events with dictionaries in them: what is missing, what is wrong, what is released.
-#include "event_rows.hpp"
-#include "released.hpp"
-#include "with_peer.hpp"
+#include "tests/poc/event_rows.hpp"
+#include "tests/support/released.hpp"
+#include "tests/support/with_peer.hpp"
 
 #include <functional>
 #include <set>

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // The push-to-talk signals as they reach the application's callback.
-#include "event_checks.hpp"
-#include "event_rows.hpp"
+#include "tests/poc/event_rows.hpp"
+#include "tests/support/event_checks.hpp"
 
 #include <array>
 #include <set>

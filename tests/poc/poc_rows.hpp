@@ -2,7 +2,7 @@
 // The push-to-talk module's requests, one row each.
 #pragma once
 
-#include "request_row.hpp"
+#include "tests/support/request_row.hpp"
 
 #include <vector>
 

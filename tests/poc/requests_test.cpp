@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // Every row of the push-to-talk module through every check, and that no row is missing.
-#include "declarations.hpp"
-#include "poc_rows.hpp"
-#include "request_checks.hpp"
+#include "tests/poc/poc_rows.hpp"
+#include "tests/support/declarations.hpp"
+#include "tests/support/request_checks.hpp"
 
 namespace test {
 namespace {

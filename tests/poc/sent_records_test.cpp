@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // The lists and dictionaries that requests send.
-#include "expectations.hpp"
-#include "request_row.hpp"
-#include "with_peer.hpp"
+#include "tests/support/expectations.hpp"
+#include "tests/support/request_row.hpp"
+#include "tests/support/with_peer.hpp"
 
 #include <climits>
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Each kind of row in both directions, and what does not fit. No bus: values in and out.
-#include "record_tree.hpp"
-#include "variant.hpp"
+#include "src/record_tree.hpp"
+#include "tests/support/variant.hpp"
 
 #include <gtest/gtest.h>
 

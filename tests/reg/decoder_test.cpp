@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // The registration decoder called by itself, and the request that uses its handle without a look.
-#include "decoder_checks.hpp"
-#include "event_rows.hpp"
-#include "unguarded.hpp"
+#include "tests/reg/event_rows.hpp"
+#include "tests/support/decoder_checks.hpp"
+#include "tests/support/unguarded.hpp"
 
 #include <climits>
 

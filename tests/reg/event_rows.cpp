@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "event_rows.hpp"
+#include "tests/reg/event_rows.hpp"
 
 #include "ims.h"
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // The registration signals as they reach the application's callback.
-#include "event_checks.hpp"
-#include "event_rows.hpp"
+#include "tests/reg/event_rows.hpp"
+#include "tests/support/event_checks.hpp"
 
 namespace test {
 

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // What the registration's reply becomes.
-#include "expectations.hpp"
-#include "guarded.hpp"
-#include "with_peer.hpp"
+#include "tests/support/expectations.hpp"
+#include "tests/support/guarded.hpp"
+#include "tests/support/with_peer.hpp"
 
 namespace test {
 namespace {

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "reg_rows.hpp"
+#include "tests/reg/reg_rows.hpp"
 
 #include <gtest/gtest.h>
 

@@ -2,7 +2,7 @@
 // The registration module's requests and its query, one row each.
 #pragma once
 
-#include "request_row.hpp"
+#include "tests/support/request_row.hpp"
 
 #include <vector>
 

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 // The registration module's rows through every check, and what its requests do beside that.
-#include "declarations.hpp"
-#include "expectations.hpp"
-#include "reg_rows.hpp"
-#include "request_checks.hpp"
+#include "tests/reg/reg_rows.hpp"
+#include "tests/support/declarations.hpp"
+#include "tests/support/expectations.hpp"
+#include "tests/support/request_checks.hpp"
 
 namespace test {
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "keys.hpp"
+#include "tests/settings/keys.hpp"
 
 #include "ims.h"
 

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // The settings and profile records against their dictionaries.
-#include "expectations.hpp"
-#include "sample.hpp"
-#include "with_peer.hpp"
+#include "tests/settings/sample.hpp"
+#include "tests/support/expectations.hpp"
+#include "tests/support/with_peer.hpp"
 
 #include <cstdlib>
 #include <cstring>

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // Every row of the settings module through every check.
-#include "declarations.hpp"
-#include "request_checks.hpp"
-#include "settings_rows.hpp"
+#include "tests/settings/settings_rows.hpp"
+#include "tests/support/declarations.hpp"
+#include "tests/support/request_checks.hpp"
 
 #include <set>
 

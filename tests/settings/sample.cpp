@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sample.hpp"
+#include "tests/settings/sample.hpp"
 
 #include <deque>
 #include <string_view>

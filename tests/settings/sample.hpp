@@ -4,8 +4,8 @@
 #pragma once
 
 #include "ims.h"
-#include "keys.hpp"
-#include "variant.hpp"
+#include "tests/settings/keys.hpp"
+#include "tests/support/variant.hpp"
 
 #include <cstdint>
 #include <string>

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "settings_rows.hpp"
+#include "tests/settings/settings_rows.hpp"
 
-#include "sample.hpp"
+#include "tests/settings/sample.hpp"
 
 #include <memory>
 #include <string>

@@ -3,7 +3,7 @@
 // among the queries: no result fails it.
 #pragma once
 
-#include "request_row.hpp"
+#include "tests/support/request_row.hpp"
 
 #include <vector>
 

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Registration, login and supplementary services, as applications see them.
-#include "bus_client.hpp"
+#include "tests/sim/bus_client.hpp"
 
 namespace sim::test {
 namespace {

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Calls from end to end, as two applications live them.
-#include "bus_client.hpp"
+#include "tests/sim/bus_client.hpp"
 
 namespace sim::test {
 namespace {

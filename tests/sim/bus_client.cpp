@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "bus_client.hpp"
+#include "tests/sim/bus_client.hpp"
 
-#include "programs.hpp"
 #include "sim/service.hpp"
+#include "tests/programs/programs.hpp"
 
 #include <algorithm>
 #include <csignal>

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Applications that ask for much at once, and those that do not wait for the answer.
-#include "bus_client.hpp"
+#include "tests/sim/bus_client.hpp"
 
 #include <fmt/format.h>
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Short messages between two applications.
-#include "bus_client.hpp"
-#include "messages.hpp"
+#include "tests/sim/bus_client.hpp"
+#include "tests/sim/messages.hpp"
 
 #include "sim/wire.hpp"
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Every method that only registered applications may call, one row each: what it takes, what it
 // answers and where it learns who asks.
-#include "bus_client.hpp"
+#include "tests/sim/bus_client.hpp"
 
 #include "sim/result.hpp"
 

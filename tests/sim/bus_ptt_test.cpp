@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Push-to-talk from end to end: three applications on three slots.
-#include "bus_client.hpp"
+#include "tests/sim/bus_client.hpp"
 
 #include <filesystem>
 #include <fmt/format.h>

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // The program itself: its two commands, their exit statuses and what they leave behind.
-#include "bus_client.hpp"
+#include "tests/sim/bus_client.hpp"
 
 #include <csignal>
 #include <filesystem>

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Objects, interfaces and errors; who may ask.
-#include "bus_client.hpp"
+#include "tests/sim/bus_client.hpp"
 
 #include "sim/result.hpp"
 

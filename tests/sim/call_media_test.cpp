@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "network.hpp"
+#include "tests/sim/network.hpp"
 
 namespace sim::test {
 namespace {

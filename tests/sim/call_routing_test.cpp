@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // How call waiting, forwarding and barring act on calls.
-#include "network.hpp"
+#include "tests/sim/network.hpp"
 
 namespace sim::test {
 namespace {

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // What the running stand-in says about itself is what the contract's files say, and every method
 // that it names answers in the type that it names.
-#include "bus_client.hpp"
+#include "tests/sim/bus_client.hpp"
 
 #include <filesystem>
 #include <fstream>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "contract_signals.hpp"
+#include "tests/sim/contract_signals.hpp"
 
 #include "sim/introspection.hpp"
 

@@ -3,7 +3,7 @@
 #include "sim/group_reader.hpp"
 #include "sim/group_writer.hpp"
 
-#include "group_samples.hpp"
+#include "tests/sim/group_samples.hpp"
 
 #include <algorithm>
 #include <gmock/gmock.h>

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "group_samples.hpp"
 #include "sim/group_edits.hpp"
 #include "sim/group_model.hpp"
+#include "tests/sim/group_samples.hpp"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

@@ -2,8 +2,8 @@
 #include "sim/group_json.hpp"
 #include "sim/group_store.hpp"
 
-#include "group_samples.hpp"
-#include "settings_directory.hpp"
+#include "tests/sim/group_samples.hpp"
+#include "tests/sim/settings_directory.hpp"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // The lists in which a user finds its groups.
-#include "group_fixture.hpp"
+#include "tests/sim/group_fixture.hpp"
 
 namespace sim::test {
 namespace {

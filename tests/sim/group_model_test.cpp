@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "group_fixture.hpp"
+#include "tests/sim/group_fixture.hpp"
 
 namespace sim::test {
 namespace {

@@ -4,7 +4,7 @@
 #include "sim/group_reader.hpp"
 #include "sim/group_writer.hpp"
 
-#include "group_samples.hpp"
+#include "tests/sim/group_samples.hpp"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

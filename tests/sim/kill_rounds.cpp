@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "kill_rounds.hpp"
+#include "tests/sim/kill_rounds.hpp"
 
 #include <csignal>
 #include <poll.h>

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "kill_rounds.hpp"
 #include "sim/group_json.hpp"
 #include "sim/settings_json.hpp"
+#include "tests/sim/kill_rounds.hpp"
 
 #include <csignal>
 

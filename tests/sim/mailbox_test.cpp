@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Short messages that wait: for a slot that is not there, until they expire, at another pace.
-#include "message_network.hpp"
+#include "tests/sim/message_network.hpp"
 
 namespace sim::test {
 namespace {

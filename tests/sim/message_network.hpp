@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "messages.hpp"
-#include "network.hpp"
+#include "tests/sim/messages.hpp"
+#include "tests/sim/network.hpp"
 
 #include <optional>
 #include <string>

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "network.hpp"
+#include "tests/sim/network.hpp"
 
-#include "contract_signals.hpp"
+#include "tests/sim/contract_signals.hpp"
 
 #include "sim/call_signals.hpp"
 #include "sim/login_interface.hpp"

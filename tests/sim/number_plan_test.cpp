@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "sim/number_plan.hpp"
 
-#include "network.hpp"
+#include "tests/sim/network.hpp"
 
 #include <algorithm>
 #include <set>

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // The numbers with a meaning.
-#include "network.hpp"
+#include "tests/sim/network.hpp"
 
 namespace sim::test {
 namespace {

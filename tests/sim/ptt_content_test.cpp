@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Messages and files.
-#include "ptt_network.hpp"
+#include "tests/sim/ptt_network.hpp"
 
 namespace sim::test {
 namespace {

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Who speaks, who waits, who is interrupted.
-#include "ptt_network.hpp"
+#include "tests/sim/ptt_network.hpp"
 
 namespace sim::test {
 namespace {

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Ad hoc groups, channels, and who belongs to a group.
-#include "ptt_network.hpp"
+#include "tests/sim/ptt_network.hpp"
 
 namespace sim::test {
 namespace {

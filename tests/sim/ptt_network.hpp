@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "network.hpp"
+#include "tests/sim/network.hpp"
 
-#include "contract_signals.hpp"
+#include "tests/sim/contract_signals.hpp"
 
 #include "sim/ptt_calls.hpp"
 #include "sim/ptt_directory.hpp"

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Recordings, which are files of who spoke when.
-#include "ptt_network.hpp"
-#include "settings_directory.hpp"
+#include "tests/sim/ptt_network.hpp"
+#include "tests/sim/settings_directory.hpp"
 
 #include <filesystem>
 #include <fstream>

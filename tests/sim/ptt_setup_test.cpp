@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Push-to-talk calls from their first request to their end.
-#include "ptt_network.hpp"
+#include "tests/sim/ptt_network.hpp"
 
 namespace sim::test {
 namespace {

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Requests in any order at any time: whatever they are, the server stays in order.
-#include "ptt_network.hpp"
-#include "settings_directory.hpp"
+#include "tests/sim/ptt_network.hpp"
+#include "tests/sim/settings_directory.hpp"
 
 #include <algorithm>
 #include <filesystem>

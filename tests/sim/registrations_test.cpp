@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // The device in the network, and what flight mode does to everything else.
-#include "network.hpp"
+#include "tests/sim/network.hpp"
 
 namespace sim::test {
 namespace {

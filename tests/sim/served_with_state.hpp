@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "bus_client.hpp"
-#include "settings_directory.hpp"
+#include "tests/sim/bus_client.hpp"
+#include "tests/sim/settings_directory.hpp"
 
 namespace sim::test {
 

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Short messages on their way: what is refused, acknowledged, delivered and reported.
-#include "message_network.hpp"
+#include "tests/sim/message_network.hpp"
 
 #include "sim/sms_interface.hpp"
 

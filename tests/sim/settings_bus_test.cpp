@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // org.kelvo.ims.Settings of the real program.
-#include "served_with_state.hpp"
-#include "settings_samples.hpp"
+#include "tests/sim/served_with_state.hpp"
+#include "tests/sim/settings_samples.hpp"
 
 #include <csignal>
 

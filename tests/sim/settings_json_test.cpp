@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "sim/settings_json.hpp"
 
-#include "settings_samples.hpp"
+#include "tests/sim/settings_samples.hpp"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

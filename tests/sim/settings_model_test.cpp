@@ -2,7 +2,7 @@
 #include "sim/settings_entries.hpp"
 #include "sim/settings_model.hpp"
 
-#include "settings_samples.hpp"
+#include "tests/sim/settings_samples.hpp"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

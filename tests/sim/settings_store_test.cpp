@@ -3,7 +3,7 @@
 #include "sim/settings_store.hpp"
 #include "sim/store.hpp"
 
-#include "settings_directory.hpp"
+#include "tests/sim/settings_directory.hpp"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

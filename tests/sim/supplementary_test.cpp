@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Setting and querying; how the services act on calls is in call_routing_test.cpp.
-#include "network.hpp"
+#include "tests/sim/network.hpp"
 
 namespace sim::test {
 namespace {

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // A video call as an application steers it.
-#include "bus_client.hpp"
+#include "tests/sim/bus_client.hpp"
 
 namespace sim::test {
 namespace {

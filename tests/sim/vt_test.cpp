@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // The video of a call: what goes when, and what makes no sense.
-#include "network.hpp"
+#include "tests/sim/network.hpp"
 
 namespace sim::test {
 namespace {

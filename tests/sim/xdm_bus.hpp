@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "group_samples.hpp"
-#include "served_with_state.hpp"
 #include "sim/group_wire.hpp"
 #include "sim/group_writer.hpp"
+#include "tests/sim/group_samples.hpp"
+#include "tests/sim/served_with_state.hpp"
 
 // org.kelvo.ims.Xdm of the real program.
 namespace sim::test {

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Group documents are created, edited and read.
-#include "xdm_bus.hpp"
+#include "tests/sim/xdm_bus.hpp"
 
 #include <csignal>
 

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // What is refused to those who ask for group documents.
-#include "xdm_bus.hpp"
+#include "tests/sim/xdm_bus.hpp"
 
 #include <csignal>
 

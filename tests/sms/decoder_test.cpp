@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 // The short-message decoder called by itself.
-#include "broken_texts.hpp"
-#include "decoder_checks.hpp"
-#include "event_rows.hpp"
-#include "expectations.hpp"
+#include "tests/sms/broken_texts.hpp"
+#include "tests/sms/event_rows.hpp"
+#include "tests/support/decoder_checks.hpp"
+#include "tests/support/expectations.hpp"
 
 #include <climits>
 

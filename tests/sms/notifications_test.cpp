@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 // The short-message signals as they reach the application's callback.
-#include "broken_texts.hpp"
-#include "event_checks.hpp"
-#include "event_rows.hpp"
-#include "expectations.hpp"
-#include "released.hpp"
+#include "tests/sms/broken_texts.hpp"
+#include "tests/sms/event_rows.hpp"
+#include "tests/support/event_checks.hpp"
+#include "tests/support/expectations.hpp"
+#include "tests/support/released.hpp"
 
 namespace test {
 

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 // The short-message module's rows through every check, and what its requests do beside that.
-#include "declarations.hpp"
-#include "expectations.hpp"
-#include "request_checks.hpp"
-#include "sms_rows.hpp"
+#include "tests/sms/sms_rows.hpp"
+#include "tests/support/declarations.hpp"
+#include "tests/support/expectations.hpp"
+#include "tests/support/request_checks.hpp"
 
 #include <climits>
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // The service centre's address: rewritten in the caller's buffer, sent, and left rewritten.
-#include "expectations.hpp"
-#include "with_peer.hpp"
+#include "tests/support/expectations.hpp"
+#include "tests/support/with_peer.hpp"
 
 namespace test {
 namespace {

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sms_rows.hpp"
+#include "tests/sms/sms_rows.hpp"
 
 #include <gtest/gtest.h>
 

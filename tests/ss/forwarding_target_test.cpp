@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // The forwarding target, the one text in the lists.
-#include "released.hpp"
-#include "services.hpp"
-#include "with_peer.hpp"
+#include "tests/ss/services.hpp"
+#include "tests/support/released.hpp"
+#include "tests/support/with_peer.hpp"
 
 #include <optional>
 

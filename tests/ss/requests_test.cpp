@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 // The supplementary services' rows through every check, and what the set requests do beside that.
-#include "declarations.hpp"
-#include "expectations.hpp"
-#include "request_checks.hpp"
-#include "ss_rows.hpp"
+#include "tests/ss/ss_rows.hpp"
+#include "tests/support/declarations.hpp"
+#include "tests/support/expectations.hpp"
+#include "tests/support/request_checks.hpp"
 
 #include <climits>
 #include <cstddef>

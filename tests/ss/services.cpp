@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "services.hpp"
+#include "tests/ss/services.hpp"
 
 namespace test {
 namespace {

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "ss_rows.hpp"
+#include "tests/ss/ss_rows.hpp"
 
 #include <gtest/gtest.h>
 

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 // What the list of a get request becomes, for each of the three services.
-#include "expectations.hpp"
-#include "released.hpp"
-#include "services.hpp"
-#include "with_peer.hpp"
+#include "tests/ss/services.hpp"
+#include "tests/support/expectations.hpp"
+#include "tests/support/released.hpp"
+#include "tests/support/with_peer.hpp"
 
 #include <climits>
 

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 // The two call-waiting requests use their handle and their record without a look.
-#include "unguarded.hpp"
+#include "tests/support/unguarded.hpp"
 
-#include "client.hpp"
 #include "ims.h"
+#include "src/client.hpp"
 
 namespace test {
 namespace {

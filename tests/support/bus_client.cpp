@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "bus_client.hpp"
+#include "tests/support/bus_client.hpp"
 
 #include <stdexcept>
 

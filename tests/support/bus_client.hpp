@@ -2,7 +2,7 @@
 // A raw connection to the private bus: signals of any kind, from anybody.
 #pragma once
 
-#include "variant.hpp"
+#include "tests/support/variant.hpp"
 
 #include <gio/gio.h>
 

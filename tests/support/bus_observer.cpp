@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Compiled into each test executable, so that these definitions stand in front of GIO's.
-#include "bus_observer.hpp"
+#include "tests/support/bus_observer.hpp"
 
 #include <cstring>
 #include <mutex>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "declarations.hpp"
+#include "tests/support/declarations.hpp"
 
 #include <fstream>
 #include <iterator>

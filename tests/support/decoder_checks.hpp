@@ -3,11 +3,11 @@
 // library: the shared one does not export them.
 #pragma once
 
-#include "event_row.hpp"
-#include "notifications.hpp"
-#include "platform_capture.hpp"
-#include "recorders.hpp"
-#include "variant.hpp"
+#include "src/notifications.hpp"
+#include "tests/support/event_row.hpp"
+#include "tests/support/platform_capture.hpp"
+#include "tests/support/recorders.hpp"
+#include "tests/support/variant.hpp"
 
 #include <gtest/gtest.h>
 

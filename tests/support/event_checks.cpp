@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "event_checks.hpp"
+#include "tests/support/event_checks.hpp"
 
-#include "expectations.hpp"
-#include "malformed.hpp"
+#include "tests/support/expectations.hpp"
+#include "tests/support/malformed.hpp"
 
 namespace test {
 

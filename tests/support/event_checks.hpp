@@ -3,8 +3,8 @@
 // check over a table.
 #pragma once
 
-#include "event_row.hpp"
-#include "with_peer.hpp"
+#include "tests/support/event_row.hpp"
+#include "tests/support/with_peer.hpp"
 
 #include <string>
 

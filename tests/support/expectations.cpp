@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "expectations.hpp"
+#include "tests/support/expectations.hpp"
 
-#include "bus_observer.hpp"
 #include "ims.h"
-#include "platform_capture.hpp"
-#include "with_peer.hpp"
+#include "tests/support/bus_observer.hpp"
+#include "tests/support/platform_capture.hpp"
+#include "tests/support/with_peer.hpp"
 
 #include <gtest/gtest.h>
 

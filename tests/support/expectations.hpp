@@ -3,7 +3,7 @@
 // made.
 #pragma once
 
-#include "scripted_peer.hpp"
+#include "tests/support/scripted_peer.hpp"
 
 #include <string>
 

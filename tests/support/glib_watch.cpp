@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "glib_watch.hpp"
+#include "tests/support/glib_watch.hpp"
 
 #include <gio/gio.h>
 #include <gtest/gtest.h>

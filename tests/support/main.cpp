@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // The main of the test executables: each test begins with the gate on and nothing noted.
-#include "bus_observer.hpp"
-#include "glib_watch.hpp"
-#include "platform_capture.hpp"
+#include "tests/support/bus_observer.hpp"
+#include "tests/support/glib_watch.hpp"
+#include "tests/support/platform_capture.hpp"
 
 #include <gtest/gtest.h>
 

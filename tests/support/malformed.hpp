@@ -2,7 +2,7 @@
 // Bodies that are not what a decoder expects.
 #pragma once
 
-#include "variant.hpp"
+#include "tests/support/variant.hpp"
 
 #include <string>
 #include <utility>

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Compiled into each test executable, so that these definitions stand in front of any provider.
-#include "platform_capture.hpp"
+#include "tests/support/platform_capture.hpp"
 
 #include "platform.h"
 

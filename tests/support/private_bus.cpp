@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "private_bus.hpp"
+#include "tests/support/private_bus.hpp"
 
-#include "pump.hpp"
+#include "tests/support/pump.hpp"
 
 #include <array>
 #include <cerrno>

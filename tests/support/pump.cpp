@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "pump.hpp"
+#include "tests/support/pump.hpp"
 
 #include <string>
 

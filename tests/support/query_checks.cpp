@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "request_checks.hpp"
+#include "tests/support/request_checks.hpp"
 
-#include "bus_observer.hpp"
+#include "tests/support/bus_observer.hpp"
 
 namespace test {
 namespace {

@@ -2,9 +2,9 @@
 // INSTANTIATE_TEST_SUITE_P(Call, Requests, ValuesIn(rows), row_name) runs every check over a table.
 #pragma once
 
-#include "expectations.hpp"
-#include "request_row.hpp"
-#include "with_peer.hpp"
+#include "tests/support/expectations.hpp"
+#include "tests/support/request_row.hpp"
+#include "tests/support/with_peer.hpp"
 
 namespace test {
 

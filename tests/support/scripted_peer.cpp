@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "scripted_peer.hpp"
+#include "tests/support/scripted_peer.hpp"
 
-#include "pump.hpp"
+#include "tests/support/pump.hpp"
 
 #include <condition_variable>
 #include <map>

@@ -3,8 +3,8 @@
 // script says. It answers in GDBus's own thread, so also while the test's thread blocks in a query.
 #pragma once
 
-#include "bus_client.hpp"
-#include "variant.hpp"
+#include "tests/support/bus_client.hpp"
+#include "tests/support/variant.hpp"
 
 #include <functional>
 #include <memory>

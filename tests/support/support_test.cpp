@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 // What watches over the other tests does fail them.
-#include "glib_watch.hpp"
-#include "malformed.hpp"
 #include "platform.h"
-#include "platform_capture.hpp"
-#include "with_peer.hpp"
+#include "tests/support/glib_watch.hpp"
+#include "tests/support/malformed.hpp"
+#include "tests/support/platform_capture.hpp"
+#include "tests/support/with_peer.hpp"
 
 #include <gtest/gtest-spi.h>
 

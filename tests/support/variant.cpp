@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "variant.hpp"
+#include "tests/support/variant.hpp"
 
 #include <stdexcept>
 #include <vector>

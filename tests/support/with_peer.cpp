@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "with_peer.hpp"
+#include "tests/support/with_peer.hpp"
 
 #include <algorithm>
 

@@ -3,11 +3,11 @@
 #pragma once
 
 #include "ims.h"
-#include "platform_capture.hpp"
-#include "private_bus.hpp"
-#include "pump.hpp"
-#include "recorders.hpp"
-#include "scripted_peer.hpp"
+#include "tests/support/platform_capture.hpp"
+#include "tests/support/private_bus.hpp"
+#include "tests/support/pump.hpp"
+#include "tests/support/recorders.hpp"
+#include "tests/support/scripted_peer.hpp"
 
 #include <gtest/gtest.h>
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "support.hpp"
+#include "tests/tpdu/support.hpp"
 
-#include "tpdu/status.hpp"
+#include "tools/tpdu/status.hpp"
 
 #include <gtest/gtest.h>
 

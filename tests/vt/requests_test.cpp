@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 // The video telephony rows through every check, and what the requests do beside that.
-#include "declarations.hpp"
-#include "expectations.hpp"
-#include "request_checks.hpp"
-#include "vt_rows.hpp"
+#include "tests/support/declarations.hpp"
+#include "tests/support/expectations.hpp"
+#include "tests/support/request_checks.hpp"
+#include "tests/vt/vt_rows.hpp"
 
 #include <climits>
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // The list of a surface: how many entries are sent, and the count as it was.
-#include "expectations.hpp"
-#include "with_peer.hpp"
+#include "tests/support/expectations.hpp"
+#include "tests/support/with_peer.hpp"
 
 #include <climits>
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "vt_rows.hpp"
+#include "tests/vt/vt_rows.hpp"
 
 #include <gtest/gtest.h>
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "answered.hpp"
+#include "tests/xdm/answered.hpp"
 
 namespace test {
 namespace {

@@ -2,7 +2,7 @@
 // A document as the service would answer it, made from one as it was sent.
 #pragma once
 
-#include "variant.hpp"
+#include "tests/support/variant.hpp"
 
 namespace test {
 

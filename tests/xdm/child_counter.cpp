@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "child_counter.hpp"
+#include "tests/xdm/child_counter.hpp"
 
 #include <glib.h>
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "comparison.hpp"
+#include "tests/xdm/comparison.hpp"
 
-#include "answered.hpp"
+#include "tests/xdm/answered.hpp"
 
 #include <gtest/gtest.h>
 

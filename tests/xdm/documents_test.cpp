@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // What the rows do not show: documents that lack parts, counts that lie, texts that do not fit.
-#include "expectations.hpp"
-#include "sample.hpp"
-#include "with_peer.hpp"
+#include "tests/support/expectations.hpp"
+#include "tests/support/with_peer.hpp"
+#include "tests/xdm/sample.hpp"
 
 #include <cstring>
 

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 // Group documents as the service answers them, and their release.
-#include "expectations.hpp"
-#include "released.hpp"
-#include "sample.hpp"
-#include "with_peer.hpp"
+#include "tests/support/expectations.hpp"
+#include "tests/support/released.hpp"
+#include "tests/support/with_peer.hpp"
+#include "tests/xdm/sample.hpp"
 
 namespace test {
 namespace {

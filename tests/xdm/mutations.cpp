@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "mutations.hpp"
+#include "tests/xdm/mutations.hpp"
 
 namespace test {
 namespace {

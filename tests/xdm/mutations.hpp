@@ -2,7 +2,7 @@
 // A document with one of its values changed, at any depth.
 #pragma once
 
-#include "variant.hpp"
+#include "tests/support/variant.hpp"
 
 #include <functional>
 

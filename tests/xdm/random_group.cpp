@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "random_group.hpp"
+#include "tests/xdm/random_group.hpp"
 
 #include <array>
 #include <limits>

@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 // The reader of group documents on what no honest service sends, and on very large ones.
-#include "answered.hpp"
-#include "child_counter.hpp"
-#include "mutations.hpp"
-#include "sample.hpp"
-#include "xdm_records.hpp"
+#include "src/xdm_records.hpp"
+#include "tests/xdm/answered.hpp"
+#include "tests/xdm/child_counter.hpp"
+#include "tests/xdm/mutations.hpp"
+#include "tests/xdm/sample.hpp"
 
 #include <gtest/gtest.h>
 

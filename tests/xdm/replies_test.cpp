@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // The answers that are no group documents: participant groups, user profiles, participants.
-#include "released.hpp"
-#include "with_peer.hpp"
+#include "tests/support/released.hpp"
+#include "tests/support/with_peer.hpp"
 
 namespace test {
 namespace {

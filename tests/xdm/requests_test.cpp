@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // Every row of the module through every check.
-#include "declarations.hpp"
-#include "request_checks.hpp"
-#include "xdm_rows.hpp"
+#include "tests/support/declarations.hpp"
+#include "tests/support/request_checks.hpp"
+#include "tests/xdm/xdm_rows.hpp"
 
 namespace test {
 namespace {

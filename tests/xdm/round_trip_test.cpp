@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 // Any document that is created and fetched again is the same, as far as the wire lets it.
-#include "answered.hpp"
-#include "comparison.hpp"
-#include "random_group.hpp"
-#include "with_peer.hpp"
+#include "tests/support/with_peer.hpp"
+#include "tests/xdm/answered.hpp"
+#include "tests/xdm/comparison.hpp"
+#include "tests/xdm/random_group.hpp"
 
 namespace test {
 namespace {

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sample.hpp"
+#include "tests/xdm/sample.hpp"
 
 namespace test {
 namespace {

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "xdm_rows.hpp"
+#include "tests/xdm/xdm_rows.hpp"
 
-#include "sample.hpp"
+#include "tests/xdm/sample.hpp"
 
 #include <gtest/gtest.h>
 

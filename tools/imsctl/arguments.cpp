@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "arguments.hpp"
+#include "tools/imsctl/arguments.hpp"
 
-#include "failure.hpp"
-#include "suggestions.hpp"
+#include "tools/imsctl/failure.hpp"
+#include "tools/imsctl/suggestions.hpp"
 
 #include <CLI/CLI.hpp>
 #include <algorithm>

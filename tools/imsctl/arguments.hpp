@@ -2,8 +2,8 @@
 // The arguments of one verb. What is returned holds its value once the command line is parsed.
 #pragma once
 
-#include "service_values.hpp"
-#include "session_choice.hpp"
+#include "tools/imsctl/service_values.hpp"
+#include "tools/imsctl/session_choice.hpp"
 
 #include <array>
 #include <functional>

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // What tells of calls.
-#include "event_fields.hpp"
+#include "tools/imsctl/event_fields.hpp"
 
 namespace imsctl {
 namespace {

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Placing, answering, ending and changing calls.
-#include "dial.hpp"
-#include "requests.hpp"
+#include "tools/imsctl/dial.hpp"
+#include "tools/imsctl/requests.hpp"
 
 #include <fmt/format.h>
 #include <nlohmann/json.hpp>

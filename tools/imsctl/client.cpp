@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "client.hpp"
+#include "tools/imsctl/client.hpp"
 
-#include "last_words.hpp"
+#include "tools/imsctl/last_words.hpp"
 
 #include <fmt/format.h>
 

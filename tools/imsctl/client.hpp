@@ -2,8 +2,8 @@
 // One handle of the library, with its asynchronous requests turned into waiting for the outcome.
 #pragma once
 
-#include "main_loop.hpp"
-#include "output.hpp"
+#include "tools/imsctl/main_loop.hpp"
+#include "tools/imsctl/output.hpp"
 
 #include <deque>
 #include <functional>

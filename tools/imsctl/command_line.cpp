@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "command_line.hpp"
+#include "tools/imsctl/command_line.hpp"
 
-#include "completion.hpp"
-#include "suggestions.hpp"
-#include "verbs.hpp"
+#include "tools/imsctl/completion.hpp"
+#include "tools/imsctl/suggestions.hpp"
+#include "tools/imsctl/verbs.hpp"
 
 #include <CLI/CLI.hpp>
 #include <algorithm>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "completion.hpp"
+#include "tools/imsctl/completion.hpp"
 
 #include <CLI/CLI.hpp>
 #include <algorithm>

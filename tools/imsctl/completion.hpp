@@ -2,7 +2,7 @@
 // Shell completion: the shell asks the program itself.
 #pragma once
 
-#include "arguments.hpp"
+#include "tools/imsctl/arguments.hpp"
 
 #include <span>
 #include <string>

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Calls with more than two parties.
-#include "requests.hpp"
+#include "tools/imsctl/requests.hpp"
 
 namespace imsctl {
 namespace {

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "delivery_report.hpp"
+#include "tools/imsctl/delivery_report.hpp"
 
 namespace imsctl {
 

@@ -2,9 +2,9 @@
 // The answer to a received message.
 #pragma once
 
-#include "service_values.hpp"
+#include "tools/imsctl/service_values.hpp"
 
-#include "tpdu/tpdu.hpp"
+#include "tools/tpdu/tpdu.hpp"
 
 #include <ims.h>
 #include <optional>

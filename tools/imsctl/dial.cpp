@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // Placing a call, and following it until it is established or over.
-#include "dial.hpp"
+#include "tools/imsctl/dial.hpp"
 
-#include "requests.hpp"
+#include "tools/imsctl/requests.hpp"
 
 #include <array>
 #include <fmt/format.h>

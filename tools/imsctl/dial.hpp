@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "verbs.hpp"
+#include "tools/imsctl/verbs.hpp"
 
 namespace imsctl {
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "failure.hpp"
+#include "tools/imsctl/failure.hpp"
 
-#include "service_values.hpp"
+#include "tools/imsctl/service_values.hpp"
 
 #include <fmt/format.h>
 #include <ims.h>

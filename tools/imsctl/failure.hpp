@@ -2,7 +2,7 @@
 // What can go wrong, and the words for it.
 #pragma once
 
-#include "fields.hpp"
+#include "tools/imsctl/fields.hpp"
 
 #include <stdexcept>
 #include <string>

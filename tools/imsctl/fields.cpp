@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "fields.hpp"
+#include "tools/imsctl/fields.hpp"
 
 #include <fmt/format.h>
 #include <fmt/ranges.h>

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // What is not a request: watching, and shell completion.
-#include "completion.hpp"
-#include "requests.hpp"
-#include "watching.hpp"
+#include "tools/imsctl/completion.hpp"
+#include "tools/imsctl/requests.hpp"
+#include "tools/imsctl/watching.hpp"
 
 #include <algorithm>
 

@@ -1,11 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "group_document.hpp"
+#include "tools/imsctl/group_document.hpp"
 
-#include "failure.hpp"
-#include "files.hpp"
-#include "group_records.hpp"
-#include "json_text.hpp"
-#include "suggestions.hpp"
+#include "tools/imsctl/failure.hpp"
+#include "tools/imsctl/files.hpp"
+#include "tools/imsctl/group_records.hpp"
+#include "tools/imsctl/json_text.hpp"
+#include "tools/imsctl/suggestions.hpp"
 
 #include <algorithm>
 #include <fmt/format.h>

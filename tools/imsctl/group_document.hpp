@@ -2,7 +2,7 @@
 // Group documents and parts of them from JSON.
 #pragma once
 
-#include "fields.hpp"
+#include "tools/imsctl/fields.hpp"
 
 #include <deque>
 #include <ims.h>

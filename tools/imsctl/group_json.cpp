@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "group_json.hpp"
+#include "tools/imsctl/group_json.hpp"
 
-#include "group_reply_records.hpp"
+#include "tools/imsctl/group_reply_records.hpp"
 
 #include <fmt/format.h>
 #include <nlohmann/json.hpp>

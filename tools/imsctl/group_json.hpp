@@ -3,7 +3,7 @@
 // own length, and is null when the service's count was wrong.
 #pragma once
 
-#include "fields.hpp"
+#include "tools/imsctl/fields.hpp"
 
 #include <ims.h>
 

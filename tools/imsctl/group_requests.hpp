@@ -2,9 +2,9 @@
 // What the verbs about groups share.
 #pragma once
 
-#include "failure.hpp"
-#include "group_json.hpp"
-#include "requests.hpp"
+#include "tools/imsctl/failure.hpp"
+#include "tools/imsctl/group_json.hpp"
+#include "tools/imsctl/requests.hpp"
 
 #include <fmt/format.h>
 #include <nlohmann/json.hpp>

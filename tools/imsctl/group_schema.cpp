@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "group_schema.hpp"
+#include "tools/imsctl/group_schema.hpp"
 
-#include "group_records.hpp"
+#include "tools/imsctl/group_records.hpp"
 
 #include <limits>
 #include <nlohmann/json.hpp>

@@ -2,7 +2,7 @@
 // The JSON schema of the group documents that imsctl takes and shows.
 #pragma once
 
-#include "fields.hpp"
+#include "tools/imsctl/fields.hpp"
 
 namespace imsctl {
 

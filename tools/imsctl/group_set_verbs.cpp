@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // The properties of a group, one at a time.
-#include "failure.hpp"
-#include "group_document.hpp"
-#include "group_requests.hpp"
+#include "tools/imsctl/failure.hpp"
+#include "tools/imsctl/group_document.hpp"
+#include "tools/imsctl/group_requests.hpp"
 
 #include <algorithm>
 #include <fmt/format.h>

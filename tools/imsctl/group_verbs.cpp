@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 // Group documents: as a whole, their members and rules, and what the service tells of groups.
-#include "failure.hpp"
-#include "group_document.hpp"
-#include "group_requests.hpp"
-#include "group_schema.hpp"
+#include "tools/imsctl/failure.hpp"
+#include "tools/imsctl/group_document.hpp"
+#include "tools/imsctl/group_requests.hpp"
+#include "tools/imsctl/group_schema.hpp"
 
 #include <algorithm>
 #include <fmt/format.h>

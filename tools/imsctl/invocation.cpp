@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "invocation.hpp"
+#include "tools/imsctl/invocation.hpp"
 
 #include <utility>
 

@@ -2,7 +2,7 @@
 // One run of one verb.
 #pragma once
 
-#include "client.hpp"
+#include "tools/imsctl/client.hpp"
 
 #include <functional>
 #include <optional>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "json_text.hpp"
+#include "tools/imsctl/json_text.hpp"
 
 #include <algorithm>
 #include <fmt/format.h>

@@ -2,7 +2,7 @@
 // Text as JSON, for files that people write.
 #pragma once
 
-#include "fields.hpp"
+#include "tools/imsctl/fields.hpp"
 
 #include <nlohmann/json.hpp>
 #include <string>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "last_words.hpp"
+#include "tools/imsctl/last_words.hpp"
 
 #include <algorithm>
 #include <cmath>

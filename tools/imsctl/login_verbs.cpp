@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Logging a user in and out.
-#include "requests.hpp"
+#include "tools/imsctl/requests.hpp"
 
 namespace imsctl {
 namespace {

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "command_line.hpp"
+#include "tools/imsctl/command_line.hpp"
 
 #include <clocale>
 #include <csignal>

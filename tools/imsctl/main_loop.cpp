@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "main_loop.hpp"
+#include "tools/imsctl/main_loop.hpp"
 
 #include <algorithm>
 #include <cmath>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "output.hpp"
+#include "tools/imsctl/output.hpp"
 
 #include <algorithm>
 #include <cerrno>

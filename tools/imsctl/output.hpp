@@ -2,9 +2,9 @@
 // The two forms of everything that imsctl says: lines for people, JSON objects for programs.
 #pragma once
 
-#include "events.hpp"
-#include "failure.hpp"
-#include "last_words.hpp"
+#include "tools/imsctl/events.hpp"
+#include "tools/imsctl/failure.hpp"
+#include "tools/imsctl/last_words.hpp"
 
 #include <cstdio>
 #include <string>

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // What tells of push-to-talk.
-#include "event_fields.hpp"
-#include "poc_summaries.hpp"
+#include "tools/imsctl/event_fields.hpp"
+#include "tools/imsctl/poc_summaries.hpp"
 
 namespace imsctl {
 namespace {

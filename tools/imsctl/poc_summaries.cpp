@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "poc_summaries.hpp"
+#include "tools/imsctl/poc_summaries.hpp"
 
-#include "ptt_values.hpp"
+#include "tools/imsctl/ptt_values.hpp"
 
 #include <fmt/format.h>
 #include <fmt/ranges.h>

@@ -2,7 +2,7 @@
 // What the fields of the push-to-talk events come to, in words: those of the stand-in service.
 #pragma once
 
-#include "fields.hpp"
+#include "tools/imsctl/fields.hpp"
 
 namespace imsctl {
 

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "profile_choice.hpp"
+#include "tools/imsctl/profile_choice.hpp"
 
-#include "failure.hpp"
-#include "service_values.hpp"
+#include "tools/imsctl/failure.hpp"
+#include "tools/imsctl/service_values.hpp"
 
 #include <fmt/format.h>
 #include <vector>

@@ -2,7 +2,7 @@
 // Which profile a verb is about.
 #pragma once
 
-#include "settings_keys.hpp"
+#include "tools/imsctl/settings_keys.hpp"
 
 #include <cstdint>
 #include <optional>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "settings_keys.hpp"
+#include "tools/imsctl/settings_keys.hpp"
 
 #include <iterator>
 

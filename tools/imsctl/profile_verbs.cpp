@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Registration profiles.
-#include "profile_choice.hpp"
-#include "settings_actions.hpp"
+#include "tools/imsctl/profile_choice.hpp"
+#include "tools/imsctl/settings_actions.hpp"
 
 #include <algorithm>
 #include <fmt/format.h>

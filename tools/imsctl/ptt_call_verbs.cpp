@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // Push-to-talk calls: placing, answering, changing and ending them; channels.
-#include "ptt_parties.hpp"
-#include "requests.hpp"
-#include "watching.hpp"
+#include "tools/imsctl/ptt_parties.hpp"
+#include "tools/imsctl/requests.hpp"
+#include "tools/imsctl/watching.hpp"
 
 #include <fmt/format.h>
 #include <limits>

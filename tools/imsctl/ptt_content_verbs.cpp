@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // What is sent and kept: messages, files, recordings.
-#include "ptt_file.hpp"
-#include "ptt_parties.hpp"
-#include "requests.hpp"
+#include "tools/imsctl/ptt_file.hpp"
+#include "tools/imsctl/ptt_parties.hpp"
+#include "tools/imsctl/requests.hpp"
 
 namespace imsctl {
 namespace {

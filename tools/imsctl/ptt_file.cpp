@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 // Offering a file of this machine. The service sends it: the library tells what it is.
-#include "ptt_file.hpp"
+#include "tools/imsctl/ptt_file.hpp"
 
-#include "ptt_parties.hpp"
-#include "requests.hpp"
+#include "tools/imsctl/ptt_parties.hpp"
+#include "tools/imsctl/requests.hpp"
 
 #include <filesystem>
 #include <fmt/format.h>

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // The floor: asking for it, giving it back, and who has it.
-#include "ptt_parties.hpp"
-#include "ptt_talk.hpp"
-#include "requests.hpp"
+#include "tools/imsctl/ptt_parties.hpp"
+#include "tools/imsctl/ptt_talk.hpp"
+#include "tools/imsctl/requests.hpp"
 
 #include <algorithm>
 #include <fmt/format.h>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "ptt_parties.hpp"
+#include "tools/imsctl/ptt_parties.hpp"
 
 #include <algorithm>
 

@@ -2,8 +2,8 @@
 // Push-to-talk parties, sets and terms from a command line to the library's records.
 #pragma once
 
-#include "ptt_values.hpp"
-#include "verbs.hpp"
+#include "tools/imsctl/ptt_values.hpp"
+#include "tools/imsctl/verbs.hpp"
 
 namespace imsctl {
 

@@ -1,11 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
 // Taking the floor for as long as the command, or a key, lasts; and showing who has it.
-#include "ptt_talk.hpp"
+#include "tools/imsctl/ptt_talk.hpp"
 
-#include "ptt_parties.hpp"
-#include "push_key.hpp"
-#include "requests.hpp"
-#include "watching.hpp"
+#include "tools/imsctl/ptt_parties.hpp"
+#include "tools/imsctl/push_key.hpp"
+#include "tools/imsctl/requests.hpp"
+#include "tools/imsctl/watching.hpp"
 
 #include <fmt/format.h>
 

@@ -2,7 +2,7 @@
 // Names for push-to-talk values: those of the stand-in service.
 #pragma once
 
-#include "service_values.hpp"
+#include "tools/imsctl/service_values.hpp"
 
 #include <ims.h>
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "push_key.hpp"
+#include "tools/imsctl/push_key.hpp"
 
-#include "failure.hpp"
+#include "tools/imsctl/failure.hpp"
 
 #include <algorithm>
 #include <array>

@@ -2,8 +2,8 @@
 // What an incoming TPDU means: a message, once all its parts are there, or a status report.
 #pragma once
 
-#include "output.hpp"
-#include "short_message.hpp"
+#include "tools/imsctl/output.hpp"
+#include "tools/imsctl/short_message.hpp"
 
 namespace imsctl {
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // What tells of the registration with the network.
-#include "event_fields.hpp"
-#include "summaries.hpp"
+#include "tools/imsctl/event_fields.hpp"
+#include "tools/imsctl/summaries.hpp"
 
 namespace imsctl {
 namespace {

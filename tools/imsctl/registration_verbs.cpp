@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Registration with the network, and flight mode.
-#include "requests.hpp"
-#include "watching.hpp"
+#include "tools/imsctl/requests.hpp"
+#include "tools/imsctl/watching.hpp"
 
 namespace imsctl {
 namespace {

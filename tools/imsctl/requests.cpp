@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "requests.hpp"
+#include "tools/imsctl/requests.hpp"
 
 #include <cstdlib>
 

@@ -2,7 +2,7 @@
 // The shapes that most requests have, as actions; and what their replies carry.
 #pragma once
 
-#include "verbs.hpp"
+#include "tools/imsctl/verbs.hpp"
 
 namespace imsctl {
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "service_values.hpp"
+#include "tools/imsctl/service_values.hpp"
 
 #include <algorithm>
 #include <charconv>

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "session_choice.hpp"
+#include "tools/imsctl/session_choice.hpp"
 
-#include "service_values.hpp"
+#include "tools/imsctl/service_values.hpp"
 
 #include <fmt/format.h>
 #include <fmt/ranges.h>

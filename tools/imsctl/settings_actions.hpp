@@ -2,8 +2,8 @@
 // What the verbs about settings sets and those about profiles share.
 #pragma once
 
-#include "requests.hpp"
-#include "settings_record.hpp"
+#include "tools/imsctl/requests.hpp"
+#include "tools/imsctl/settings_record.hpp"
 
 #include <span>
 

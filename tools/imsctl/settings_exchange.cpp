@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "settings_exchange.hpp"
+#include "tools/imsctl/settings_exchange.hpp"
 
-#include "files.hpp"
-#include "settings_actions.hpp"
-#include "settings_file.hpp"
+#include "tools/imsctl/files.hpp"
+#include "tools/imsctl/settings_actions.hpp"
+#include "tools/imsctl/settings_file.hpp"
 
 #include <algorithm>
 #include <fmt/format.h>

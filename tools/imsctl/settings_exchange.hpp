@@ -2,7 +2,7 @@
 // Settings sets to and from files.
 #pragma once
 
-#include "verbs.hpp"
+#include "tools/imsctl/verbs.hpp"
 
 namespace imsctl {
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "settings_file.hpp"
+#include "tools/imsctl/settings_file.hpp"
 
-#include "failure.hpp"
+#include "tools/imsctl/failure.hpp"
 
 #include <algorithm>
 #include <fmt/format.h>

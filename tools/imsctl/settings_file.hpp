@@ -2,7 +2,7 @@
 // Settings sets in JSON files.
 #pragma once
 
-#include "settings_record.hpp"
+#include "tools/imsctl/settings_record.hpp"
 
 #include <string>
 

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "settings_record.hpp"
+#include "tools/imsctl/settings_record.hpp"
 
-#include "failure.hpp"
-#include "service_values.hpp"
-#include "suggestions.hpp"
+#include "tools/imsctl/failure.hpp"
+#include "tools/imsctl/service_values.hpp"
+#include "tools/imsctl/suggestions.hpp"
 
 #include <algorithm>
 #include <cstdlib>

@@ -2,7 +2,7 @@
 // Settings sets and profiles, key by key.
 #pragma once
 
-#include "settings_values.hpp"
+#include "tools/imsctl/settings_values.hpp"
 
 #include <memory>
 #include <string>

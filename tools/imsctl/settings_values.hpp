@@ -2,8 +2,8 @@
 // The values of keys: what may be given for them, and how they are shown.
 #pragma once
 
-#include "fields.hpp"
-#include "settings_keys.hpp"
+#include "tools/imsctl/fields.hpp"
+#include "tools/imsctl/settings_keys.hpp"
 
 #include <stdexcept>
 #include <string>

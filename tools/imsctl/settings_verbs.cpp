@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Settings sets and the network environment.
-#include "settings_actions.hpp"
-#include "settings_exchange.hpp"
+#include "tools/imsctl/settings_actions.hpp"
+#include "tools/imsctl/settings_exchange.hpp"
 
 #include <fmt/format.h>
 #include <nlohmann/json.hpp>

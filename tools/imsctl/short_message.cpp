@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "short_message.hpp"
+#include "tools/imsctl/short_message.hpp"
 
 #include <algorithm>
 #include <chrono>

@@ -2,10 +2,10 @@
 // What is between a text and the TPDUs that the library takes and brings.
 #pragma once
 
-#include "fields.hpp"
-#include "service_values.hpp"
+#include "tools/imsctl/fields.hpp"
+#include "tools/imsctl/service_values.hpp"
 
-#include "tpdu/tpdu.hpp"
+#include "tools/tpdu/tpdu.hpp"
 
 #include <optional>
 #include <string>

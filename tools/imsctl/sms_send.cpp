@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 // Sending a text as one short message or as many as it takes.
-#include "sms_send.hpp"
+#include "tools/imsctl/sms_send.hpp"
 
-#include "requests.hpp"
-#include "short_message.hpp"
+#include "tools/imsctl/requests.hpp"
+#include "tools/imsctl/short_message.hpp"
 
 #include <algorithm>
 #include <fmt/format.h>

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 // Short messages.
-#include "delivery_report.hpp"
-#include "requests.hpp"
-#include "sms_send.hpp"
-#include "sms_watch.hpp"
+#include "tools/imsctl/delivery_report.hpp"
+#include "tools/imsctl/requests.hpp"
+#include "tools/imsctl/sms_send.hpp"
+#include "tools/imsctl/sms_watch.hpp"
 
 #include <fmt/format.h>
 #include <limits>

@@ -1,11 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
 // Showing what arrives as short messages, put together and in words.
-#include "sms_watch.hpp"
+#include "tools/imsctl/sms_watch.hpp"
 
-#include "delivery_report.hpp"
-#include "received_message.hpp"
-#include "requests.hpp"
-#include "watching.hpp"
+#include "tools/imsctl/delivery_report.hpp"
+#include "tools/imsctl/received_message.hpp"
+#include "tools/imsctl/requests.hpp"
+#include "tools/imsctl/watching.hpp"
 
 #include <fmt/format.h>
 #include <nlohmann/json.hpp>

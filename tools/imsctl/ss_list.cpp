@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "ss_list.hpp"
+#include "tools/imsctl/ss_list.hpp"
 
 #include <algorithm>
 #include <fmt/format.h>

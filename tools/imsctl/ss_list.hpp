@@ -2,7 +2,7 @@
 // What the get requests of the supplementary services bring: lists of entries.
 #pragma once
 
-#include "requests.hpp"
+#include "tools/imsctl/requests.hpp"
 
 #include <vector>
 

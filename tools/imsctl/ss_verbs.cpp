@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Supplementary services: call waiting, forwarding and barring.
-#include "requests.hpp"
-#include "ss_list.hpp"
+#include "tools/imsctl/requests.hpp"
+#include "tools/imsctl/ss_list.hpp"
 
 namespace imsctl {
 namespace {

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "suggestions.hpp"
+#include "tools/imsctl/suggestions.hpp"
 
 #include <algorithm>
 #include <fmt/format.h>

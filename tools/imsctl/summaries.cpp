@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "summaries.hpp"
+#include "tools/imsctl/summaries.hpp"
 
-#include "short_message.hpp"
+#include "tools/imsctl/short_message.hpp"
 
 #include <fmt/format.h>
 #include <fmt/ranges.h>

@@ -2,7 +2,7 @@
 // What the fields of some events come to, in words.
 #pragma once
 
-#include "fields.hpp"
+#include "tools/imsctl/fields.hpp"
 
 namespace imsctl {
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "verbs.hpp"
+#include "tools/imsctl/verbs.hpp"
 
 #include <algorithm>
 #include <iterator>

@@ -2,8 +2,8 @@
 // The commands: which there are, and how each is made ready to run.
 #pragma once
 
-#include "arguments.hpp"
-#include "invocation.hpp"
+#include "tools/imsctl/arguments.hpp"
+#include "tools/imsctl/invocation.hpp"
 
 #include <span>
 #include <string_view>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "watching.hpp"
+#include "tools/imsctl/watching.hpp"
 
 #include <fmt/format.h>
 #include <limits>

@@ -2,8 +2,8 @@
 // Following events until somebody ends it: what monitor and the verbs called "watch" share.
 #pragma once
 
-#include "arguments.hpp"
-#include "invocation.hpp"
+#include "tools/imsctl/arguments.hpp"
+#include "tools/imsctl/invocation.hpp"
 
 #include <functional>
 #include <string_view>

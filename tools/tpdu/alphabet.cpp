@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "tpdu/alphabet.hpp"
+#include "tools/tpdu/alphabet.hpp"
 
-#include "tpdu/cursor.hpp"
-#include "tpdu/unicode.hpp"
+#include "tools/tpdu/cursor.hpp"
+#include "tools/tpdu/unicode.hpp"
 
 #include <algorithm>
 #include <array>

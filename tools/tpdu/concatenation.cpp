@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "tpdu/concatenation.hpp"
+#include "tools/tpdu/concatenation.hpp"
 
-#include "tpdu/unicode.hpp"
+#include "tools/tpdu/unicode.hpp"
 
 #include <algorithm>
 

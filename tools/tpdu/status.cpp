@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "tpdu/status.hpp"
+#include "tools/tpdu/status.hpp"
 
 #include <span>
 

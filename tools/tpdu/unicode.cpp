@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "tpdu/unicode.hpp"
+#include "tools/tpdu/unicode.hpp"
 
 #include <cstdint>
 
