@@ -229,12 +229,4 @@ Variant write_dictionary(FieldsView fields, std::span<const WriteStep> plan,
     return dictionary.finish();
 }
 
-std::uint32_t checked_count(const char *subject, std::uint32_t count, GVariant *list,
-                            std::uint32_t capacity, Site site) noexcept {
-    const bool is_true = count != 0 && count == g_variant_n_children(list);
-    if (!is_true || count > capacity)
-        log_warning(site, "%s list count is NOT valid - Count: [%d]", subject, count);
-    return is_true ? std::min(count, capacity) : 0;
-}
-
 } // namespace ims

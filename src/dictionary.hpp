@@ -9,7 +9,6 @@
 // loaded.
 #pragma once
 
-#include "log.hpp"
 #include "wire.hpp"
 
 #include <algorithm>
@@ -206,10 +205,5 @@ consteval std::array<WriteStep, Count> write_plan(const FieldTable<Count> &field
 // is too large to cross the bus.
 Variant write_dictionary(FieldsView fields, std::span<const WriteStep> plan,
                          const void *record) noexcept;
-
-// The number of entries that a list of dictionaries really has, when the service's count says the
-// same: at most the capacity. Otherwise none; both are worth a line.
-std::uint32_t checked_count(const char *subject, std::uint32_t count, GVariant *list,
-                            std::uint32_t capacity, Site site) noexcept;
 
 } // namespace ims

@@ -85,6 +85,14 @@ int query(ims_h handle, const char *interface, const char *method, const Variant
     return IMS_ERROR_NONE;
 }
 
+std::uint32_t checked_count(const char *subject, std::uint32_t count, GVariant *list,
+                            std::uint32_t capacity, Site site) noexcept {
+    const bool is_true = count != 0 && count == g_variant_n_children(list);
+    if (!is_true || count > capacity)
+        log_warning(site, "%s list count is NOT valid - Count: [%d]", subject, count);
+    return is_true ? std::min(count, capacity) : 0;
+}
+
 Variant finish(GObject *source, GAsyncResult *outcome, const Completion &done, Site site) noexcept {
     GError *failure = nullptr;
     Variant reply{g_dbus_connection_call_finish(G_DBUS_CONNECTION(source), outcome, &failure)};

@@ -47,6 +47,11 @@ int request(ims_h handle, const char *interface, const char *method, const Varia
 int query(ims_h handle, const char *interface, const char *method, const Variant &tuple,
           Variant &reply, int timeout_ms = kRequestTimeoutMs, Site site = here()) noexcept;
 
+// The number of entries that a list of dictionaries really has, when the service's count says the
+// same: at most the capacity. Otherwise none; both are worth a line.
+std::uint32_t checked_count(const char *subject, std::uint32_t count, GVariant *list,
+                            std::uint32_t capacity, Site site) noexcept;
+
 // The application's side of a finished request.
 class Completion {
   public:
