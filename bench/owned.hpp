@@ -2,7 +2,7 @@
 // Owners for what GLib hands out.
 #pragma once
 
-#include "src/glib.hpp"
+#include "src/wire/glib.hpp"
 
 namespace bench {
 

@@ -3,7 +3,7 @@
 #include "bench/settings_side.hpp"
 
 #include "src/settings_fields.hpp"
-#include "src/wire.hpp"
+#include "src/wire/wire.hpp"
 
 namespace bench {
 namespace {

@@ -3,8 +3,8 @@
 // as the sides without the library make them.
 #pragma once
 
-#include "src/field_at.hpp"
 #include "src/settings_fields.hpp"
+#include "src/wire/field_at.hpp"
 
 namespace bench {
 

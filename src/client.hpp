@@ -2,8 +2,8 @@
 // What a handle is.
 #pragma once
 
-#include "glib.hpp"
 #include "ims_types.h"
+#include "wire/glib.hpp"
 
 #include <cstdint>
 

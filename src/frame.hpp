@@ -16,7 +16,7 @@
 
 #include "client.hpp"
 #include "log.hpp"
-#include "wire.hpp"
+#include "wire/wire.hpp"
 
 #include <initializer_list>
 

@@ -2,9 +2,9 @@
 // Calls: requests, the call list, the decoder of the call signals.
 #include "ims_call.h"
 
-#include "dictionary.hpp"
 #include "frame.hpp"
 #include "notifications.hpp"
+#include "wire/dictionary.hpp"
 
 #include <algorithm>
 #include <cstring>

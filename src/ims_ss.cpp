@@ -2,8 +2,8 @@
 // Supplementary services: call waiting, call forwarding, call barring.
 #include "ims_ss.h"
 
-#include "dictionary.hpp"
 #include "frame.hpp"
+#include "wire/dictionary.hpp"
 
 #include <vector>
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "log.hpp"
 
-#include "glib.hpp"
+#include "wire/glib.hpp"
 
 #include <cstdarg>
 #include <string_view>

@@ -4,7 +4,7 @@
 
 #include "client.hpp"
 #include "log.hpp"
-#include "wire.hpp"
+#include "wire/wire.hpp"
 
 #include <span>
 

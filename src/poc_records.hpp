@@ -3,7 +3,7 @@
 #pragma once
 
 #include "ims_poc.h"
-#include "record_tree.hpp"
+#include "wire/record_tree.hpp"
 
 namespace ims::poc {
 

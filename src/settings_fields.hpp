@@ -2,8 +2,8 @@
 // The keys of the settings and profile dictionaries, each stated once, in wire order.
 #pragma once
 
-#include "dictionary.hpp"
 #include "ims_settings.h"
+#include "wire/dictionary.hpp"
 
 namespace ims {
 

@@ -4,8 +4,8 @@
 #pragma once
 
 #include "ims_xdm.h"
-#include "record_tree.hpp"
-#include "signature.hpp"
+#include "wire/record_tree.hpp"
+#include "wire/signature.hpp"
 
 namespace ims {
 

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // The bytes of a written dictionary beside those that GLib makes of the same entries. No bus.
-#include "src/dictionary.hpp"
+#include "src/wire/dictionary.hpp"
 #include "tests/support/variant.hpp"
 
 #include <gtest/gtest.h>

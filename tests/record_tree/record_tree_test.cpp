@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Each kind of row in both directions, and what does not fit. No bus: values in and out.
-#include "src/record_tree.hpp"
+#include "src/wire/record_tree.hpp"
 #include "tests/support/variant.hpp"
 
 #include <gtest/gtest.h>
