@@ -7,7 +7,7 @@
 #include "sim/number_plan.hpp"
 #include "sim/registrations.hpp"
 #include "sim/result.hpp"
-#include "tools/tpdu/tpdu.hpp"
+#include "tpdu/tpdu.hpp"
 
 #include <cstdint>
 #include <deque>

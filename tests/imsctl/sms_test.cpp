@@ -4,7 +4,7 @@
 #include "tests/support/private_bus.hpp"
 #include "tests/support/scripted_peer.hpp"
 
-#include "tools/tpdu/tpdu.hpp"
+#include "tpdu/tpdu.hpp"
 
 #include <csignal>
 #include <gmock/gmock.h>

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "tools/tpdu/tpdu.hpp"
+#include "tpdu/tpdu.hpp"
 
 #include <stdexcept>
 #include <string>

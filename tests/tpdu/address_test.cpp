@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "tests/tpdu/support.hpp"
 
-#include "tools/tpdu/address.hpp"
+#include "tpdu/address.hpp"
 
 #include <gtest/gtest.h>
 

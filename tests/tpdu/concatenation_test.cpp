@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "tests/tpdu/support.hpp"
 
-#include "tools/tpdu/concatenation.hpp"
+#include "tpdu/concatenation.hpp"
 
 #include <gtest/gtest.h>
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "tests/tpdu/support.hpp"
 
-#include "tools/tpdu/data_coding.hpp"
+#include "tpdu/data_coding.hpp"
 
 #include <gtest/gtest.h>
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "tests/tpdu/support.hpp"
 
-#include "tools/tpdu/timestamp.hpp"
+#include "tpdu/timestamp.hpp"
 
 #include <gtest/gtest.h>
 

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "tests/tpdu/support.hpp"
 
-#include "tools/tpdu/pdu.hpp"
-#include "tools/tpdu/user_data.hpp"
+#include "tpdu/pdu.hpp"
+#include "tpdu/user_data.hpp"
 
 #include <gtest/gtest.h>
 

@@ -4,7 +4,7 @@
 
 #include "tools/imsctl/service_values.hpp"
 
-#include "tools/tpdu/tpdu.hpp"
+#include "tpdu/tpdu.hpp"
 
 #include <ims.h>
 #include <optional>

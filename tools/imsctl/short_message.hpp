@@ -5,7 +5,7 @@
 #include "tools/imsctl/fields.hpp"
 #include "tools/imsctl/service_values.hpp"
 
-#include "tools/tpdu/tpdu.hpp"
+#include "tpdu/tpdu.hpp"
 
 #include <optional>
 #include <string>

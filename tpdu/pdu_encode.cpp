@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "tools/tpdu/cursor.hpp"
-#include "tools/tpdu/pdu.hpp"
-#include "tools/tpdu/pdu_layout.hpp"
+#include "tpdu/cursor.hpp"
+#include "tpdu/pdu.hpp"
+#include "tpdu/pdu_layout.hpp"
 
 namespace tpdu {
 

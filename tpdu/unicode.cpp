@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "tools/tpdu/unicode.hpp"
+#include "tpdu/unicode.hpp"
 
 #include <cstdint>
 

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "tools/tpdu/alphabet.hpp"
+#include "tpdu/alphabet.hpp"
 
-#include "tools/tpdu/cursor.hpp"
-#include "tools/tpdu/unicode.hpp"
+#include "tpdu/cursor.hpp"
+#include "tpdu/unicode.hpp"
 
 #include <algorithm>
 #include <array>

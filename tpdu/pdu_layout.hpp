@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "tools/tpdu/user_data.hpp"
+#include "tpdu/user_data.hpp"
 
 #include <cstdint>
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "tools/tpdu/octets.hpp"
+#include "tpdu/octets.hpp"
 
 #include <optional>
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "tools/tpdu/concatenation.hpp"
+#include "tpdu/concatenation.hpp"
 
-#include "tools/tpdu/unicode.hpp"
+#include "tpdu/unicode.hpp"
 
 #include <algorithm>
 

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "tools/tpdu/octets.hpp"
-#include "tools/tpdu/result.hpp"
+#include "tpdu/octets.hpp"
+#include "tpdu/result.hpp"
 
 #include <cstdint>
 #include <optional>

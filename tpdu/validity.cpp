@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "tools/tpdu/validity.hpp"
+#include "tpdu/validity.hpp"
 
-#include "tools/tpdu/cursor.hpp"
+#include "tpdu/cursor.hpp"
 
 #include <array>
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "tools/tpdu/timestamp.hpp"
+#include "tpdu/timestamp.hpp"
 
-#include "tools/tpdu/cursor.hpp"
+#include "tpdu/cursor.hpp"
 
 #include <chrono>
 #include <cstdlib>

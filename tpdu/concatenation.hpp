@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "tools/tpdu/address.hpp"
-#include "tools/tpdu/pdu.hpp"
-#include "tools/tpdu/result.hpp"
-#include "tools/tpdu/user_data.hpp"
+#include "tpdu/address.hpp"
+#include "tpdu/pdu.hpp"
+#include "tpdu/result.hpp"
+#include "tpdu/user_data.hpp"
 
 #include <cstdint>
 #include <optional>

@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "tools/tpdu/alphabet.hpp"
-#include "tools/tpdu/data_coding.hpp"
-#include "tools/tpdu/octets.hpp"
-#include "tools/tpdu/result.hpp"
+#include "tpdu/alphabet.hpp"
+#include "tpdu/data_coding.hpp"
+#include "tpdu/octets.hpp"
+#include "tpdu/result.hpp"
 
 #include <cstdint>
 #include <optional>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "tools/tpdu/status.hpp"
+#include "tpdu/status.hpp"
 
 #include <span>
 

@@ -1,12 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "tools/tpdu/address.hpp"
-#include "tools/tpdu/octets.hpp"
-#include "tools/tpdu/result.hpp"
-#include "tools/tpdu/timestamp.hpp"
-#include "tools/tpdu/user_data.hpp"
-#include "tools/tpdu/validity.hpp"
+#include "tpdu/address.hpp"
+#include "tpdu/octets.hpp"
+#include "tpdu/result.hpp"
+#include "tpdu/timestamp.hpp"
+#include "tpdu/user_data.hpp"
+#include "tpdu/validity.hpp"
 
 #include <cstdint>
 #include <optional>

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "tools/tpdu/result.hpp"
+#include "tpdu/result.hpp"
 
 #include <cstdint>
 #include <span>

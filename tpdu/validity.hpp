@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "tools/tpdu/octets.hpp"
-#include "tools/tpdu/result.hpp"
-#include "tools/tpdu/timestamp.hpp"
+#include "tpdu/octets.hpp"
+#include "tpdu/result.hpp"
+#include "tpdu/timestamp.hpp"
 
 #include <chrono>
 #include <cstdint>

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "tools/tpdu/address.hpp"
+#include "tpdu/address.hpp"
 
-#include "tools/tpdu/alphabet.hpp"
-#include "tools/tpdu/cursor.hpp"
+#include "tpdu/alphabet.hpp"
+#include "tpdu/cursor.hpp"
 
 namespace tpdu {
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "tools/tpdu/data_coding.hpp"
+#include "tpdu/data_coding.hpp"
 
 namespace tpdu {
 
