@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // What happens before anything is asked of the service: help, and output that nobody takes.
+#include "imsctl/command_line.hpp"
+#include "imsctl/verbs.hpp"
 #include "tests/imsctl/in_process.hpp"
-#include "tools/imsctl/command_line.hpp"
-#include "tools/imsctl/verbs.hpp"
 
 #include <csignal>
 #include <gmock/gmock.h>

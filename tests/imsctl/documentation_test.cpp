@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 // That docs/imsctl.md tells of everything there is.
-#include "tools/imsctl/events.hpp"
-#include "tools/imsctl/failure.hpp"
-#include "tools/imsctl/short_message.hpp"
-#include "tools/imsctl/verbs.hpp"
+#include "imsctl/events.hpp"
+#include "imsctl/failure.hpp"
+#include "imsctl/short_message.hpp"
+#include "imsctl/verbs.hpp"
 
 #include <fmt/format.h>
 #include <fstream>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "tools/imsctl/events.hpp"
+#include "imsctl/events.hpp"
 
 #include <algorithm>
 #include <cstdlib>

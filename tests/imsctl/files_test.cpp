@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "tools/imsctl/files.hpp"
+#include "imsctl/files.hpp"
 
-#include "tools/imsctl/failure.hpp"
+#include "imsctl/failure.hpp"
 
 #include <cstdlib>
 #include <fcntl.h>

@@ -1,11 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
 // Group documents as far as no service is needed: what is wrong with a file, and the schema.
+#include "imsctl/failure.hpp"
+#include "imsctl/group_document.hpp"
+#include "imsctl/group_json.hpp"
+#include "imsctl/group_schema.hpp"
 #include "tests/imsctl/group_documents.hpp"
 #include "tests/imsctl/temporary_file.hpp"
-#include "tools/imsctl/failure.hpp"
-#include "tools/imsctl/group_document.hpp"
-#include "tools/imsctl/group_json.hpp"
-#include "tools/imsctl/group_schema.hpp"
 
 #include <fstream>
 #include <gmock/gmock.h>

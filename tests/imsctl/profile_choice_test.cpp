@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "tools/imsctl/profile_choice.hpp"
+#include "imsctl/profile_choice.hpp"
 
-#include "tools/imsctl/failure.hpp"
+#include "imsctl/failure.hpp"
 
 #include <gtest/gtest.h>
 #include <vector>

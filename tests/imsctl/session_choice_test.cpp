@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "tools/imsctl/service_values.hpp"
-#include "tools/imsctl/session_choice.hpp"
+#include "imsctl/service_values.hpp"
+#include "imsctl/session_choice.hpp"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

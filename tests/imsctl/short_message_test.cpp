@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // From a text to TPDUs and back, without a bus.
-#include "tools/imsctl/received_message.hpp"
-#include "tools/imsctl/short_message.hpp"
+#include "imsctl/received_message.hpp"
+#include "imsctl/short_message.hpp"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Command lines that are wrong: nothing is asked of the service, and the message says what to type.
+#include "imsctl/fields.hpp"
 #include "tests/imsctl/in_process.hpp"
-#include "tools/imsctl/fields.hpp"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

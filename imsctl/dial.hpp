@@ -1,0 +1,10 @@
+// SPDX-License-Identifier: Apache-2.0
+#pragma once
+
+#include "imsctl/verbs.hpp"
+
+namespace imsctl {
+
+Action prepare_dial(Arguments &arguments);
+
+} // namespace imsctl

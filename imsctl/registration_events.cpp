@@ -1,0 +1,37 @@
+// SPDX-License-Identifier: Apache-2.0
+// What tells of the registration with the network.
+#include "imsctl/event_fields.hpp"
+#include "imsctl/summaries.hpp"
+
+namespace imsctl {
+namespace {
+
+constexpr FieldRow kRegistration[] = {
+    flag<&ims_registration_info_s::registered>("registered"),
+    field<&ims_registration_info_s::value_1>("value_1"),
+    field<&ims_registration_info_s::value_2>("value_2"),
+    field<&ims_registration_info_s::value_3>("value_3"),
+    field<&ims_registration_info_s::value_4>("value_4"),
+    field<&ims_registration_info_s::value_5>("value_5"),
+};
+
+constexpr FieldRow kEmergencyRegistration[] = {
+    flag<&ims_emergency_registration_info_s::registered>("registered"),
+    field<&ims_emergency_registration_info_s::value_1>("value_1"),
+    field<&ims_emergency_registration_info_s::value_2>("value_2"),
+};
+
+constexpr EventRow kEvents[] = {
+    {IMS_NOTI_REG_REGISTRATION_STATUS, "reg-registration-status", "reg", kRegistration,
+     summarise_registration},
+    {IMS_NOTI_REG_EMERGENCY_REGISTRATION_STATUS, "reg-emergency-registration-status", "reg",
+     kEmergencyRegistration, summarise_emergency_registration},
+};
+
+} // namespace
+
+std::span<const EventRow> registration_events() {
+    return kEvents;
+}
+
+} // namespace imsctl
