@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "imsctl/arguments.hpp"
 
-#include "imsctl/failure.hpp"
+#include "imsctl/output/failure.hpp"
 #include "imsctl/suggestions.hpp"
 
 #include <CLI/CLI.hpp>

@@ -2,7 +2,7 @@
 // The arguments of one verb. What is returned holds its value once the command line is parsed.
 #pragma once
 
-#include "imsctl/service_values.hpp"
+#include "imsctl/output/values.hpp"
 #include "imsctl/session_choice.hpp"
 
 #include <array>

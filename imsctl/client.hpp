@@ -3,7 +3,7 @@
 #pragma once
 
 #include "imsctl/main_loop.hpp"
-#include "imsctl/output.hpp"
+#include "imsctl/output/output.hpp"
 
 #include <deque>
 #include <functional>

@@ -2,7 +2,7 @@
 // The answer to a received message.
 #pragma once
 
-#include "imsctl/service_values.hpp"
+#include "imsctl/output/values.hpp"
 
 #include "tpdu/tpdu.hpp"
 

@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "imsctl/group_document.hpp"
 
-#include "imsctl/failure.hpp"
-#include "imsctl/files.hpp"
 #include "imsctl/group_records.hpp"
-#include "imsctl/json_text.hpp"
+#include "imsctl/output/failure.hpp"
+#include "imsctl/output/files.hpp"
+#include "imsctl/output/json_text.hpp"
 #include "imsctl/suggestions.hpp"
 
 #include <algorithm>

@@ -2,7 +2,7 @@
 // Group documents and parts of them from JSON.
 #pragma once
 
-#include "imsctl/fields.hpp"
+#include "imsctl/output/fields.hpp"
 
 #include <deque>
 #include <ims.h>

@@ -3,7 +3,7 @@
 // own length, and is null when the service's count was wrong.
 #pragma once
 
-#include "imsctl/fields.hpp"
+#include "imsctl/output/fields.hpp"
 
 #include <ims.h>
 

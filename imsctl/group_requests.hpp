@@ -2,8 +2,8 @@
 // What the verbs about groups share.
 #pragma once
 
-#include "imsctl/failure.hpp"
 #include "imsctl/group_json.hpp"
+#include "imsctl/output/failure.hpp"
 #include "imsctl/requests.hpp"
 
 #include <fmt/format.h>

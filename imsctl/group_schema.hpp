@@ -2,7 +2,7 @@
 // The JSON schema of the group documents that imsctl takes and shows.
 #pragma once
 
-#include "imsctl/fields.hpp"
+#include "imsctl/output/fields.hpp"
 
 namespace imsctl {
 

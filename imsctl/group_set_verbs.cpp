@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // The properties of a group, one at a time.
-#include "imsctl/failure.hpp"
 #include "imsctl/group_document.hpp"
 #include "imsctl/group_requests.hpp"
+#include "imsctl/output/failure.hpp"
 
 #include <algorithm>
 #include <fmt/format.h>

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 // Group documents: as a whole, their members and rules, and what the service tells of groups.
-#include "imsctl/failure.hpp"
 #include "imsctl/group_document.hpp"
 #include "imsctl/group_requests.hpp"
 #include "imsctl/group_schema.hpp"
+#include "imsctl/output/failure.hpp"
 
 #include <algorithm>
 #include <fmt/format.h>

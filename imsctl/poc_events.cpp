@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // What tells of push-to-talk.
-#include "imsctl/event_fields.hpp"
+#include "imsctl/output/event_fields.hpp"
 #include "imsctl/poc_summaries.hpp"
 
 namespace imsctl {

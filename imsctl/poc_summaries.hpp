@@ -2,7 +2,7 @@
 // What the fields of the push-to-talk events come to, in words: those of the stand-in service.
 #pragma once
 
-#include "imsctl/fields.hpp"
+#include "imsctl/output/fields.hpp"
 
 namespace imsctl {
 

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "imsctl/profile_choice.hpp"
 
-#include "imsctl/failure.hpp"
-#include "imsctl/service_values.hpp"
+#include "imsctl/output/failure.hpp"
+#include "imsctl/output/values.hpp"
 
 #include <fmt/format.h>
 #include <vector>

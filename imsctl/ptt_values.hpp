@@ -2,7 +2,7 @@
 // Names for push-to-talk values: those of the stand-in service.
 #pragma once
 
-#include "imsctl/service_values.hpp"
+#include "imsctl/output/values.hpp"
 
 #include <ims.h>
 

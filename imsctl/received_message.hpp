@@ -2,7 +2,7 @@
 // What an incoming TPDU means: a message, once all its parts are there, or a status report.
 #pragma once
 
-#include "imsctl/output.hpp"
+#include "imsctl/output/output.hpp"
 #include "imsctl/short_message.hpp"
 
 namespace imsctl {

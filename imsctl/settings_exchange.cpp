@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "imsctl/settings_exchange.hpp"
 
-#include "imsctl/files.hpp"
+#include "imsctl/output/files.hpp"
 #include "imsctl/settings_actions.hpp"
 #include "imsctl/settings_file.hpp"
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "imsctl/settings_file.hpp"
 
-#include "imsctl/failure.hpp"
+#include "imsctl/output/failure.hpp"
 
 #include <algorithm>
 #include <fmt/format.h>

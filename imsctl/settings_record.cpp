@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "imsctl/settings_record.hpp"
 
-#include "imsctl/failure.hpp"
-#include "imsctl/service_values.hpp"
+#include "imsctl/output/failure.hpp"
+#include "imsctl/output/values.hpp"
 #include "imsctl/suggestions.hpp"
 
 #include <algorithm>

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "imsctl/settings_values.hpp"
 
-#include "imsctl/service_values.hpp"
+#include "imsctl/output/values.hpp"
 
 #include <fmt/format.h>
 #include <fmt/ranges.h>

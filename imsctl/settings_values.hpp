@@ -2,7 +2,7 @@
 // The values of keys: what may be given for them, and how they are shown.
 #pragma once
 
-#include "imsctl/fields.hpp"
+#include "imsctl/output/fields.hpp"
 #include "imsctl/settings_keys.hpp"
 
 #include <stdexcept>

@@ -2,8 +2,8 @@
 // What is between a text and the TPDUs that the library takes and brings.
 #pragma once
 
-#include "imsctl/fields.hpp"
-#include "imsctl/service_values.hpp"
+#include "imsctl/output/fields.hpp"
+#include "imsctl/output/values.hpp"
 
 #include "tpdu/tpdu.hpp"
 

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // What tells of short messages.
-#include "imsctl/event_fields.hpp"
+#include "imsctl/output/event_fields.hpp"
 #include "imsctl/summaries.hpp"
 
 namespace imsctl {

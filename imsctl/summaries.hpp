@@ -2,7 +2,7 @@
 // What the fields of some events come to, in words.
 #pragma once
 
-#include "imsctl/fields.hpp"
+#include "imsctl/output/fields.hpp"
 
 namespace imsctl {
 

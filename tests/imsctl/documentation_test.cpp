@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // That docs/imsctl.md tells of everything there is.
-#include "imsctl/events.hpp"
-#include "imsctl/failure.hpp"
+#include "imsctl/output/events.hpp"
+#include "imsctl/output/failure.hpp"
 #include "imsctl/short_message.hpp"
 #include "imsctl/verbs.hpp"
 

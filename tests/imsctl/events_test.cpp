@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/events.hpp"
+#include "imsctl/output/events.hpp"
 
 #include <algorithm>
 #include <cstdlib>

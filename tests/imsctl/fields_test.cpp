@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/fields.hpp"
-#include "imsctl/output.hpp"
+#include "imsctl/output/fields.hpp"
+#include "imsctl/output/output.hpp"
 
 #include <gtest/gtest.h>
 #include <nlohmann/json.hpp>

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/files.hpp"
+#include "imsctl/output/files.hpp"
 
-#include "imsctl/failure.hpp"
+#include "imsctl/output/failure.hpp"
 
 #include <cstdlib>
 #include <fcntl.h>

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 // Group documents as far as no service is needed: what is wrong with a file, and the schema.
-#include "imsctl/failure.hpp"
 #include "imsctl/group_document.hpp"
 #include "imsctl/group_json.hpp"
 #include "imsctl/group_schema.hpp"
+#include "imsctl/output/failure.hpp"
 #include "tests/imsctl/group_documents.hpp"
 #include "tests/imsctl/temporary_file.hpp"
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "imsctl/profile_choice.hpp"
 
-#include "imsctl/failure.hpp"
+#include "imsctl/output/failure.hpp"
 
 #include <gtest/gtest.h>
 #include <vector>

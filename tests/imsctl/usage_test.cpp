@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Command lines that are wrong: nothing is asked of the service, and the message says what to type.
-#include "imsctl/fields.hpp"
+#include "imsctl/output/fields.hpp"
 #include "tests/imsctl/in_process.hpp"
 
 #include <gmock/gmock.h>

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Numbers, named values and suggestions.
-#include "imsctl/service_values.hpp"
+#include "imsctl/output/values.hpp"
 #include "imsctl/suggestions.hpp"
 
 #include <gmock/gmock.h>

@@ -2,7 +2,7 @@
 // Text as JSON, for files that people write.
 #pragma once
 
-#include "imsctl/fields.hpp"
+#include "imsctl/output/fields.hpp"
 
 #include <nlohmann/json.hpp>
 #include <string>

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/failure.hpp"
+#include "imsctl/output/failure.hpp"
 
-#include "imsctl/service_values.hpp"
+#include "imsctl/output/values.hpp"
 
 #include <fmt/format.h>
 #include <ims.h>

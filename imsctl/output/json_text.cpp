@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/json_text.hpp"
+#include "imsctl/output/json_text.hpp"
 
 #include <algorithm>
 #include <fmt/format.h>

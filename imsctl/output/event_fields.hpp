@@ -2,7 +2,7 @@
 // How the fields of an event's record become values: what the tables of events are made of.
 #pragma once
 
-#include "imsctl/events.hpp"
+#include "imsctl/output/events.hpp"
 
 #include <cstdlib>
 #include <ims.h>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/fields.hpp"
+#include "imsctl/output/fields.hpp"
 
 #include <fmt/format.h>
 #include <fmt/ranges.h>

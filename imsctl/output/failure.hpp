@@ -2,7 +2,7 @@
 // What can go wrong, and the words for it.
 #pragma once
 
-#include "imsctl/fields.hpp"
+#include "imsctl/output/fields.hpp"
 
 #include <stdexcept>
 #include <string>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/service_values.hpp"
+#include "imsctl/output/values.hpp"
 
 #include <algorithm>
 #include <charconv>

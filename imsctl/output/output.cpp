@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/output.hpp"
+#include "imsctl/output/output.hpp"
 
 #include <algorithm>
 #include <cerrno>

@@ -2,7 +2,7 @@
 // Every event that imsctl knows: its name, its id and the fields of its record.
 #pragma once
 
-#include "imsctl/fields.hpp"
+#include "imsctl/output/fields.hpp"
 
 #include <span>
 #include <string_view>

@@ -2,9 +2,9 @@
 // The two forms of everything that imsctl says: lines for people, JSON objects for programs.
 #pragma once
 
-#include "imsctl/events.hpp"
-#include "imsctl/failure.hpp"
 #include "imsctl/last_words.hpp"
+#include "imsctl/output/events.hpp"
+#include "imsctl/output/failure.hpp"
 
 #include <cstdio>
 #include <string>
