@@ -2,8 +2,8 @@
 // The arguments of one verb. What is returned holds its value once the command line is parsed.
 #pragma once
 
+#include "imsctl/client/session_choice.hpp"
 #include "imsctl/output/values.hpp"
-#include "imsctl/session_choice.hpp"
 
 #include <array>
 #include <functional>

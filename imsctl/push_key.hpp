@@ -3,7 +3,7 @@
 // repeats itself, and one that has not come for a while is not held any more.
 #pragma once
 
-#include "imsctl/main_loop.hpp"
+#include "imsctl/client/main_loop.hpp"
 
 #include <functional>
 #include <optional>

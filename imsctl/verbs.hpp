@@ -3,7 +3,7 @@
 #pragma once
 
 #include "imsctl/arguments.hpp"
-#include "imsctl/invocation.hpp"
+#include "imsctl/client/invocation.hpp"
 
 #include <span>
 #include <string_view>

@@ -2,7 +2,7 @@
 // The two forms of everything that imsctl says: lines for people, JSON objects for programs.
 #pragma once
 
-#include "imsctl/last_words.hpp"
+#include "imsctl/client/last_words.hpp"
 #include "imsctl/output/events.hpp"
 #include "imsctl/output/failure.hpp"
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/main_loop.hpp"
+#include "imsctl/client/main_loop.hpp"
 
 #include <algorithm>
 #include <cmath>

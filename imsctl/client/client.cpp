@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/client.hpp"
+#include "imsctl/client/client.hpp"
 
-#include "imsctl/last_words.hpp"
+#include "imsctl/client/last_words.hpp"
 
 #include <fmt/format.h>
 

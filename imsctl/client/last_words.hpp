@@ -2,7 +2,7 @@
 // What is said when the process ends from within a signal handler.
 #pragma once
 
-#include "imsctl/main_loop.hpp"
+#include "imsctl/client/main_loop.hpp"
 
 #include <string>
 

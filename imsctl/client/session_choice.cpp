@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/session_choice.hpp"
+#include "imsctl/client/session_choice.hpp"
 
 #include "imsctl/output/values.hpp"
 

@@ -2,7 +2,7 @@
 // Which call a verb is about, when the user does not say so.
 #pragma once
 
-#include "imsctl/invocation.hpp"
+#include "imsctl/client/invocation.hpp"
 
 #include <cstdint>
 #include <memory>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/invocation.hpp"
+#include "imsctl/client/invocation.hpp"
 
 #include <utility>
 

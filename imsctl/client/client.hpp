@@ -2,7 +2,7 @@
 // One handle of the library, with its asynchronous requests turned into waiting for the outcome.
 #pragma once
 
-#include "imsctl/main_loop.hpp"
+#include "imsctl/client/main_loop.hpp"
 #include "imsctl/output/output.hpp"
 
 #include <deque>

@@ -2,7 +2,7 @@
 // One run of one verb.
 #pragma once
 
-#include "imsctl/client.hpp"
+#include "imsctl/client/client.hpp"
 
 #include <functional>
 #include <optional>

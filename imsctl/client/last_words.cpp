@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/last_words.hpp"
+#include "imsctl/client/last_words.hpp"
 
 #include <algorithm>
 #include <cmath>
