@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // How calls are responded to and what the radio side reports: not about one call's sound or
 // parties.
-#include "imsctl/requests.hpp"
+#include "imsctl/line/requests.hpp"
 
 namespace imsctl {
 namespace {

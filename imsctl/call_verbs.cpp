@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Placing, answering, ending and changing calls.
 #include "imsctl/dial.hpp"
-#include "imsctl/requests.hpp"
+#include "imsctl/line/requests.hpp"
 
 #include <fmt/format.h>
 #include <nlohmann/json.hpp>

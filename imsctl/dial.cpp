@@ -2,7 +2,7 @@
 // Placing a call, and following it until it is established or over.
 #include "imsctl/dial.hpp"
 
-#include "imsctl/requests.hpp"
+#include "imsctl/line/requests.hpp"
 
 #include <array>
 #include <fmt/format.h>

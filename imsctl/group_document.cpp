@@ -2,10 +2,10 @@
 #include "imsctl/group_document.hpp"
 
 #include "imsctl/group_records.hpp"
+#include "imsctl/line/suggestions.hpp"
 #include "imsctl/output/failure.hpp"
 #include "imsctl/output/files.hpp"
 #include "imsctl/output/json_text.hpp"
-#include "imsctl/suggestions.hpp"
 
 #include <algorithm>
 #include <fmt/format.h>

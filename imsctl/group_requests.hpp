@@ -3,8 +3,8 @@
 #pragma once
 
 #include "imsctl/group_json.hpp"
+#include "imsctl/line/requests.hpp"
 #include "imsctl/output/failure.hpp"
-#include "imsctl/requests.hpp"
 
 #include <fmt/format.h>
 #include <nlohmann/json.hpp>

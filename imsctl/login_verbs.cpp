@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Logging a user in and out.
-#include "imsctl/requests.hpp"
+#include "imsctl/line/requests.hpp"
 
 namespace imsctl {
 namespace {

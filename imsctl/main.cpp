@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/command_line.hpp"
+#include "imsctl/line/command_line.hpp"
 
 #include <clocale>
 #include <csignal>

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Sound, tones, recording and text telephony inside a call.
-#include "imsctl/requests.hpp"
+#include "imsctl/line/requests.hpp"
 
 namespace imsctl {
 namespace {

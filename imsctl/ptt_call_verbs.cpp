@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // Push-to-talk calls: placing, answering, changing and ending them; channels.
+#include "imsctl/line/requests.hpp"
+#include "imsctl/line/watching.hpp"
 #include "imsctl/ptt_parties.hpp"
-#include "imsctl/requests.hpp"
-#include "imsctl/watching.hpp"
 
 #include <fmt/format.h>
 #include <limits>

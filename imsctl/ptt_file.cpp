@@ -2,8 +2,8 @@
 // Offering a file of this machine. The service sends it: the library tells what it is.
 #include "imsctl/ptt_file.hpp"
 
+#include "imsctl/line/requests.hpp"
 #include "imsctl/ptt_parties.hpp"
-#include "imsctl/requests.hpp"
 
 #include <filesystem>
 #include <fmt/format.h>

@@ -2,8 +2,8 @@
 // Push-to-talk parties, sets and terms from a command line to the library's records.
 #pragma once
 
+#include "imsctl/line/verbs.hpp"
 #include "imsctl/ptt_values.hpp"
-#include "imsctl/verbs.hpp"
 
 namespace imsctl {
 

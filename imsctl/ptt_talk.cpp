@@ -2,10 +2,10 @@
 // Taking the floor for as long as the command, or a key, lasts; and showing who has it.
 #include "imsctl/ptt_talk.hpp"
 
+#include "imsctl/line/requests.hpp"
+#include "imsctl/line/watching.hpp"
 #include "imsctl/ptt_parties.hpp"
 #include "imsctl/push_key.hpp"
-#include "imsctl/requests.hpp"
-#include "imsctl/watching.hpp"
 
 #include <fmt/format.h>
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "imsctl/verbs.hpp"
+#include "imsctl/line/verbs.hpp"
 
 namespace imsctl {
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Registration with the network, and flight mode.
-#include "imsctl/requests.hpp"
-#include "imsctl/watching.hpp"
+#include "imsctl/line/requests.hpp"
+#include "imsctl/line/watching.hpp"
 
 namespace imsctl {
 namespace {

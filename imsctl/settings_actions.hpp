@@ -2,7 +2,7 @@
 // What the verbs about settings sets and those about profiles share.
 #pragma once
 
-#include "imsctl/requests.hpp"
+#include "imsctl/line/requests.hpp"
 #include "imsctl/settings_record.hpp"
 
 #include <span>

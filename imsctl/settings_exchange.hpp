@@ -2,7 +2,7 @@
 // Settings sets to and from files.
 #pragma once
 
-#include "imsctl/verbs.hpp"
+#include "imsctl/line/verbs.hpp"
 
 namespace imsctl {
 

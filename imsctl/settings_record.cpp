@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "imsctl/settings_record.hpp"
 
+#include "imsctl/line/suggestions.hpp"
 #include "imsctl/output/failure.hpp"
 #include "imsctl/output/values.hpp"
-#include "imsctl/suggestions.hpp"
 
 #include <algorithm>
 #include <cstdlib>

@@ -2,7 +2,7 @@
 // Sending a text as one short message or as many as it takes.
 #include "imsctl/sms_send.hpp"
 
-#include "imsctl/requests.hpp"
+#include "imsctl/line/requests.hpp"
 #include "imsctl/short_message.hpp"
 
 #include <algorithm>

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Short messages.
 #include "imsctl/delivery_report.hpp"
-#include "imsctl/requests.hpp"
+#include "imsctl/line/requests.hpp"
 #include "imsctl/sms_send.hpp"
 #include "imsctl/sms_watch.hpp"
 

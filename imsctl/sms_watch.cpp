@@ -3,9 +3,9 @@
 #include "imsctl/sms_watch.hpp"
 
 #include "imsctl/delivery_report.hpp"
+#include "imsctl/line/requests.hpp"
+#include "imsctl/line/watching.hpp"
 #include "imsctl/received_message.hpp"
-#include "imsctl/requests.hpp"
-#include "imsctl/watching.hpp"
 
 #include <fmt/format.h>
 #include <nlohmann/json.hpp>

@@ -2,7 +2,7 @@
 // What the get requests of the supplementary services bring: lists of entries.
 #pragma once
 
-#include "imsctl/requests.hpp"
+#include "imsctl/line/requests.hpp"
 
 #include <vector>
 

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Supplementary services: call waiting, forwarding and barring.
-#include "imsctl/requests.hpp"
+#include "imsctl/line/requests.hpp"
 #include "imsctl/ss_list.hpp"
 
 namespace imsctl {

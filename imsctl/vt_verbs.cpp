@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Video telephony: the picture of a video call.
-#include "imsctl/requests.hpp"
+#include "imsctl/line/requests.hpp"
 
 namespace imsctl {
 namespace {

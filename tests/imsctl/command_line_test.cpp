@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // What happens before anything is asked of the service: help, and output that nobody takes.
-#include "imsctl/command_line.hpp"
-#include "imsctl/verbs.hpp"
+#include "imsctl/line/command_line.hpp"
+#include "imsctl/line/verbs.hpp"
 #include "tests/imsctl/in_process.hpp"
 
 #include <csignal>

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 // That docs/imsctl.md tells of everything there is.
+#include "imsctl/line/verbs.hpp"
 #include "imsctl/output/events.hpp"
 #include "imsctl/output/failure.hpp"
 #include "imsctl/short_message.hpp"
-#include "imsctl/verbs.hpp"
 
 #include <fmt/format.h>
 #include <fstream>

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "tests/imsctl/in_process.hpp"
 
-#include "imsctl/command_line.hpp"
+#include "imsctl/line/command_line.hpp"
 
 #include <cstdlib>
 

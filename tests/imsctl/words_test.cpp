@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Numbers, named values and suggestions.
+#include "imsctl/line/suggestions.hpp"
 #include "imsctl/output/values.hpp"
-#include "imsctl/suggestions.hpp"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

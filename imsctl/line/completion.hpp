@@ -2,7 +2,7 @@
 // Shell completion: the shell asks the program itself.
 #pragma once
 
-#include "imsctl/arguments.hpp"
+#include "imsctl/line/arguments.hpp"
 
 #include <span>
 #include <string>

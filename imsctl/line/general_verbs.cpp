@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // What is not a request: watching, and shell completion.
-#include "imsctl/completion.hpp"
-#include "imsctl/requests.hpp"
-#include "imsctl/watching.hpp"
+#include "imsctl/line/completion.hpp"
+#include "imsctl/line/requests.hpp"
+#include "imsctl/line/watching.hpp"
 
 #include <algorithm>
 

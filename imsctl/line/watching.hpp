@@ -2,8 +2,8 @@
 // Following events until somebody ends it: what monitor and the verbs called "watch" share.
 #pragma once
 
-#include "imsctl/arguments.hpp"
 #include "imsctl/client/invocation.hpp"
+#include "imsctl/line/arguments.hpp"
 
 #include <functional>
 #include <string_view>

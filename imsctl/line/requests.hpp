@@ -2,7 +2,7 @@
 // The shapes that most requests have, as actions; and what their replies carry.
 #pragma once
 
-#include "imsctl/verbs.hpp"
+#include "imsctl/line/verbs.hpp"
 
 namespace imsctl {
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/suggestions.hpp"
+#include "imsctl/line/suggestions.hpp"
 
 #include <algorithm>
 #include <fmt/format.h>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/verbs.hpp"
+#include "imsctl/line/verbs.hpp"
 
 #include <algorithm>
 #include <iterator>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/completion.hpp"
+#include "imsctl/line/completion.hpp"
 
 #include <CLI/CLI.hpp>
 #include <algorithm>

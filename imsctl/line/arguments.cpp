@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/arguments.hpp"
+#include "imsctl/line/arguments.hpp"
 
+#include "imsctl/line/suggestions.hpp"
 #include "imsctl/output/failure.hpp"
-#include "imsctl/suggestions.hpp"
 
 #include <CLI/CLI.hpp>
 #include <algorithm>

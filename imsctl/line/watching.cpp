@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/watching.hpp"
+#include "imsctl/line/watching.hpp"
 
 #include <fmt/format.h>
 #include <limits>

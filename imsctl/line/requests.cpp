@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/requests.hpp"
+#include "imsctl/line/requests.hpp"
 
 #include <cstdlib>
 

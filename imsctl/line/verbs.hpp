@@ -2,8 +2,8 @@
 // The commands: which there are, and how each is made ready to run.
 #pragma once
 
-#include "imsctl/arguments.hpp"
 #include "imsctl/client/invocation.hpp"
+#include "imsctl/line/arguments.hpp"
 
 #include <span>
 #include <string_view>

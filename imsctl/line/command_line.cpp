@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/command_line.hpp"
+#include "imsctl/line/command_line.hpp"
 
-#include "imsctl/completion.hpp"
-#include "imsctl/suggestions.hpp"
-#include "imsctl/verbs.hpp"
+#include "imsctl/line/completion.hpp"
+#include "imsctl/line/suggestions.hpp"
+#include "imsctl/line/verbs.hpp"
 
 #include <CLI/CLI.hpp>
 #include <algorithm>
