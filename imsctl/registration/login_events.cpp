@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // What tells of logins.
 #include "imsctl/output/event_fields.hpp"
-#include "imsctl/summaries.hpp"
+#include "imsctl/registration/summaries.hpp"
 
 namespace imsctl {
 namespace {

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/summaries.hpp"
+#include "imsctl/registration/summaries.hpp"
 
 #include "imsctl/short_message.hpp"
 
