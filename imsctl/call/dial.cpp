@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Placing a call, and following it until it is established or over.
-#include "imsctl/dial.hpp"
+#include "imsctl/call/dial.hpp"
 
 #include "imsctl/line/requests.hpp"
 

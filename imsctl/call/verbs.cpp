@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Placing, answering, ending and changing calls.
-#include "imsctl/dial.hpp"
+#include "imsctl/call/dial.hpp"
 #include "imsctl/line/requests.hpp"
 
 #include <fmt/format.h>
