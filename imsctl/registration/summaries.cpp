@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "imsctl/registration/summaries.hpp"
 
-#include "imsctl/short_message.hpp"
+#include "imsctl/sms/short_message.hpp"
 
 #include <fmt/format.h>
 #include <fmt/ranges.h>

@@ -3,7 +3,7 @@
 #include "imsctl/line/verbs.hpp"
 #include "imsctl/output/events.hpp"
 #include "imsctl/output/failure.hpp"
-#include "imsctl/short_message.hpp"
+#include "imsctl/sms/short_message.hpp"
 
 #include <fmt/format.h>
 #include <fstream>

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // From a text to TPDUs and back, without a bus.
-#include "imsctl/received_message.hpp"
-#include "imsctl/short_message.hpp"
+#include "imsctl/sms/received_message.hpp"
+#include "imsctl/sms/short_message.hpp"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

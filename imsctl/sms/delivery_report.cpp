@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/delivery_report.hpp"
+#include "imsctl/sms/delivery_report.hpp"
 
 namespace imsctl {
 

@@ -1,11 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
 // Showing what arrives as short messages, put together and in words.
-#include "imsctl/sms_watch.hpp"
+#include "imsctl/sms/watch.hpp"
 
-#include "imsctl/delivery_report.hpp"
 #include "imsctl/line/requests.hpp"
 #include "imsctl/line/watching.hpp"
-#include "imsctl/received_message.hpp"
+#include "imsctl/sms/delivery_report.hpp"
+#include "imsctl/sms/received_message.hpp"
 
 #include <fmt/format.h>
 #include <nlohmann/json.hpp>

@@ -3,7 +3,7 @@
 #pragma once
 
 #include "imsctl/output/output.hpp"
-#include "imsctl/short_message.hpp"
+#include "imsctl/sms/short_message.hpp"
 
 namespace imsctl {
 

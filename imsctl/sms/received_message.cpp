@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/received_message.hpp"
+#include "imsctl/sms/received_message.hpp"
 
 #include <fmt/format.h>
 #include <nlohmann/json.hpp>

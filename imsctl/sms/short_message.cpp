@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/short_message.hpp"
+#include "imsctl/sms/short_message.hpp"
 
 #include <algorithm>
 #include <chrono>

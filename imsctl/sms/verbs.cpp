@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 // Short messages.
-#include "imsctl/delivery_report.hpp"
 #include "imsctl/line/requests.hpp"
-#include "imsctl/sms_send.hpp"
-#include "imsctl/sms_watch.hpp"
+#include "imsctl/sms/delivery_report.hpp"
+#include "imsctl/sms/send.hpp"
+#include "imsctl/sms/watch.hpp"
 
 #include <fmt/format.h>
 #include <limits>

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 // Sending a text as one short message or as many as it takes.
-#include "imsctl/sms_send.hpp"
+#include "imsctl/sms/send.hpp"
 
 #include "imsctl/line/requests.hpp"
-#include "imsctl/short_message.hpp"
+#include "imsctl/sms/short_message.hpp"
 
 #include <algorithm>
 #include <fmt/format.h>
