@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Supplementary services: call waiting, forwarding and barring.
 #include "imsctl/line/requests.hpp"
-#include "imsctl/ss_list.hpp"
+#include "imsctl/ss/list.hpp"
 
 namespace imsctl {
 namespace {

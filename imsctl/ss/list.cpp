@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/ss_list.hpp"
+#include "imsctl/ss/list.hpp"
 
 #include <algorithm>
 #include <fmt/format.h>
