@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/profile_choice.hpp"
+#include "imsctl/settings/profile_choice.hpp"
 
 #include "imsctl/output/failure.hpp"
 

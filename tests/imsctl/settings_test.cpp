@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // Settings and profiles as far as no service is needed: keys, values and files.
 #include "imsctl/output/failure.hpp"
-#include "imsctl/settings_file.hpp"
-#include "imsctl/settings_record.hpp"
+#include "imsctl/settings/file.hpp"
+#include "imsctl/settings/record.hpp"
 #include "tests/imsctl/in_process.hpp"
 
 #include <algorithm>

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/settings_exchange.hpp"
+#include "imsctl/settings/exchange.hpp"
 
 #include "imsctl/output/files.hpp"
-#include "imsctl/settings_actions.hpp"
-#include "imsctl/settings_file.hpp"
+#include "imsctl/settings/actions.hpp"
+#include "imsctl/settings/file.hpp"
 
 #include <algorithm>
 #include <fmt/format.h>

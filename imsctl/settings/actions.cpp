@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/settings_actions.hpp"
+#include "imsctl/settings/actions.hpp"
 
 #include <fmt/format.h>
 #include <fmt/ranges.h>

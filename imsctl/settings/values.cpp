@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/settings_values.hpp"
+#include "imsctl/settings/values.hpp"
 
 #include "imsctl/output/values.hpp"
 

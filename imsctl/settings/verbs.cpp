@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Settings sets and the network environment.
-#include "imsctl/settings_actions.hpp"
-#include "imsctl/settings_exchange.hpp"
+#include "imsctl/settings/actions.hpp"
+#include "imsctl/settings/exchange.hpp"
 
 #include <fmt/format.h>
 #include <nlohmann/json.hpp>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/settings_file.hpp"
+#include "imsctl/settings/file.hpp"
 
 #include "imsctl/output/failure.hpp"
 

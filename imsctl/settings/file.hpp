@@ -2,7 +2,7 @@
 // Settings sets in JSON files.
 #pragma once
 
-#include "imsctl/settings_record.hpp"
+#include "imsctl/settings/record.hpp"
 
 #include <string>
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/settings_record.hpp"
+#include "imsctl/settings/record.hpp"
 
 #include "imsctl/line/suggestions.hpp"
 #include "imsctl/output/failure.hpp"

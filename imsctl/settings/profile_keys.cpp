@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/settings_keys.hpp"
+#include "imsctl/settings/keys.hpp"
 
 #include <iterator>
 

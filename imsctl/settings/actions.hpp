@@ -3,7 +3,7 @@
 #pragma once
 
 #include "imsctl/line/requests.hpp"
-#include "imsctl/settings_record.hpp"
+#include "imsctl/settings/record.hpp"
 
 #include <span>
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Registration profiles.
-#include "imsctl/profile_choice.hpp"
-#include "imsctl/settings_actions.hpp"
+#include "imsctl/settings/actions.hpp"
+#include "imsctl/settings/profile_choice.hpp"
 
 #include <algorithm>
 #include <fmt/format.h>

@@ -2,7 +2,7 @@
 // Which profile a verb is about.
 #pragma once
 
-#include "imsctl/settings_keys.hpp"
+#include "imsctl/settings/keys.hpp"
 
 #include <cstdint>
 #include <optional>

@@ -2,7 +2,7 @@
 // Settings sets and profiles, key by key.
 #pragma once
 
-#include "imsctl/settings_values.hpp"
+#include "imsctl/settings/values.hpp"
 
 #include <memory>
 #include <string>

@@ -3,7 +3,7 @@
 #pragma once
 
 #include "imsctl/output/fields.hpp"
-#include "imsctl/settings_keys.hpp"
+#include "imsctl/settings/keys.hpp"
 
 #include <stdexcept>
 #include <string>
