@@ -1,11 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
 // Taking the floor for as long as the command, or a key, lasts; and showing who has it.
-#include "imsctl/ptt_talk.hpp"
+#include "imsctl/ptt/talk.hpp"
 
 #include "imsctl/line/requests.hpp"
 #include "imsctl/line/watching.hpp"
-#include "imsctl/ptt_parties.hpp"
-#include "imsctl/push_key.hpp"
+#include "imsctl/ptt/parties.hpp"
+#include "imsctl/ptt/push_key.hpp"
 
 #include <fmt/format.h>
 

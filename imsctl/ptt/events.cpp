@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // What tells of push-to-talk.
 #include "imsctl/output/event_fields.hpp"
-#include "imsctl/poc_summaries.hpp"
+#include "imsctl/ptt/summaries.hpp"
 
 namespace imsctl {
 namespace {

@@ -3,7 +3,7 @@
 #pragma once
 
 #include "imsctl/line/verbs.hpp"
-#include "imsctl/ptt_values.hpp"
+#include "imsctl/ptt/values.hpp"
 
 namespace imsctl {
 

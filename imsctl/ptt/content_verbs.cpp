@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // What is sent and kept: messages, files, recordings.
 #include "imsctl/line/requests.hpp"
-#include "imsctl/ptt_file.hpp"
-#include "imsctl/ptt_parties.hpp"
+#include "imsctl/ptt/file.hpp"
+#include "imsctl/ptt/parties.hpp"
 
 namespace imsctl {
 namespace {

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/push_key.hpp"
+#include "imsctl/ptt/push_key.hpp"
 
 #include "imsctl/output/failure.hpp"
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/ptt_parties.hpp"
+#include "imsctl/ptt/parties.hpp"
 
 #include <algorithm>
 

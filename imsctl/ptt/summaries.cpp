@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/poc_summaries.hpp"
+#include "imsctl/ptt/summaries.hpp"
 
-#include "imsctl/ptt_values.hpp"
+#include "imsctl/ptt/values.hpp"
 
 #include <fmt/format.h>
 #include <fmt/ranges.h>

@@ -2,7 +2,7 @@
 // Push-to-talk calls: placing, answering, changing and ending them; channels.
 #include "imsctl/line/requests.hpp"
 #include "imsctl/line/watching.hpp"
-#include "imsctl/ptt_parties.hpp"
+#include "imsctl/ptt/parties.hpp"
 
 #include <fmt/format.h>
 #include <limits>

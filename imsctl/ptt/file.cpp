@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 // Offering a file of this machine. The service sends it: the library tells what it is.
-#include "imsctl/ptt_file.hpp"
+#include "imsctl/ptt/file.hpp"
 
 #include "imsctl/line/requests.hpp"
-#include "imsctl/ptt_parties.hpp"
+#include "imsctl/ptt/parties.hpp"
 
 #include <filesystem>
 #include <fmt/format.h>

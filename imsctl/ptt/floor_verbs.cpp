@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // The floor: asking for it, giving it back, and who has it.
 #include "imsctl/line/requests.hpp"
-#include "imsctl/ptt_parties.hpp"
-#include "imsctl/ptt_talk.hpp"
+#include "imsctl/ptt/parties.hpp"
+#include "imsctl/ptt/talk.hpp"
 
 #include <algorithm>
 #include <fmt/format.h>
