@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // Group documents as far as no service is needed: what is wrong with a file, and the schema.
-#include "imsctl/group_document.hpp"
-#include "imsctl/group_json.hpp"
-#include "imsctl/group_schema.hpp"
+#include "imsctl/group/document.hpp"
+#include "imsctl/group/json.hpp"
+#include "imsctl/group/schema.hpp"
 #include "imsctl/output/failure.hpp"
 #include "tests/imsctl/group_documents.hpp"
 #include "tests/imsctl/temporary_file.hpp"

@@ -2,7 +2,7 @@
 // The fields of what the service tells beside group documents, as in group_records.hpp.
 #pragma once
 
-#include "imsctl/group_records.hpp"
+#include "imsctl/group/records.hpp"
 
 namespace imsctl {
 

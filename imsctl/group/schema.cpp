@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/group_schema.hpp"
+#include "imsctl/group/schema.hpp"
 
-#include "imsctl/group_records.hpp"
+#include "imsctl/group/records.hpp"
 
 #include <limits>
 #include <nlohmann/json.hpp>

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/group_json.hpp"
+#include "imsctl/group/json.hpp"
 
-#include "imsctl/group_reply_records.hpp"
+#include "imsctl/group/reply_records.hpp"
 
 #include <fmt/format.h>
 #include <nlohmann/json.hpp>

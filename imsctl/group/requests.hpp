@@ -2,7 +2,7 @@
 // What the verbs about groups share.
 #pragma once
 
-#include "imsctl/group_json.hpp"
+#include "imsctl/group/json.hpp"
 #include "imsctl/line/requests.hpp"
 #include "imsctl/output/failure.hpp"
 

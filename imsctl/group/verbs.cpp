@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // Group documents: as a whole, their members and rules, and what the service tells of groups.
-#include "imsctl/group_document.hpp"
-#include "imsctl/group_requests.hpp"
-#include "imsctl/group_schema.hpp"
+#include "imsctl/group/document.hpp"
+#include "imsctl/group/requests.hpp"
+#include "imsctl/group/schema.hpp"
 #include "imsctl/output/failure.hpp"
 
 #include <algorithm>

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "imsctl/group_document.hpp"
+#include "imsctl/group/document.hpp"
 
-#include "imsctl/group_records.hpp"
+#include "imsctl/group/records.hpp"
 #include "imsctl/line/suggestions.hpp"
 #include "imsctl/output/failure.hpp"
 #include "imsctl/output/files.hpp"

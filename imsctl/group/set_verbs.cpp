@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // The properties of a group, one at a time.
-#include "imsctl/group_document.hpp"
-#include "imsctl/group_requests.hpp"
+#include "imsctl/group/document.hpp"
+#include "imsctl/group/requests.hpp"
 #include "imsctl/output/failure.hpp"
 
 #include <algorithm>
