@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/glib_ref.hpp"
+#include "sim/base/glib_ref.hpp"
 
 #include <functional>
 #include <optional>

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/enum_format.hpp"
+#include "sim/base/enum_format.hpp"
 
 #include <cstdint>
 

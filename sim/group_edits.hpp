@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
+#include "sim/base/result.hpp"
 #include "sim/group_records.hpp"
-#include "sim/result.hpp"
 
 // What requests do to one document. After a refusal the document is of no use.
 namespace sim {

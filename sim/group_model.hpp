@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
+#include "sim/base/result.hpp"
 #include "sim/group_answers.hpp"
-#include "sim/result.hpp"
 
 #include <functional>
 #include <optional>

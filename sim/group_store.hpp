@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
+#include "sim/base/store.hpp"
 #include "sim/group_model.hpp"
-#include "sim/store.hpp"
 
 namespace sim {
 

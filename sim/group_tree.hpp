@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/foreign_value.hpp"
+#include "sim/base/foreign_value.hpp"
 
 #include <cstdint>
 #include <string>

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/glib_ref.hpp"
+#include "sim/base/glib_ref.hpp"
+#include "sim/base/result.hpp"
 #include "sim/group_tree.hpp"
-#include "sim/result.hpp"
 
 // Between the dictionaries of documents and those of the bus.
 namespace sim::wire {

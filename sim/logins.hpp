@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/clock.hpp"
+#include "sim/base/clock.hpp"
+#include "sim/base/result.hpp"
 #include "sim/registrations.hpp"
-#include "sim/result.hpp"
 
 #include <array>
 #include <cstdint>

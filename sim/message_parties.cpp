@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "sim/message_parties.hpp"
 
-#include "sim/number_plan.hpp"
+#include "sim/base/number_plan.hpp"
 
 #include <algorithm>
 

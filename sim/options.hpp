@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/log.hpp"
+#include "sim/base/log.hpp"
 
 #include <chrono>
 #include <string>

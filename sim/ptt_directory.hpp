@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/number_plan.hpp"
+#include "sim/base/number_plan.hpp"
+#include "sim/base/result.hpp"
 #include "sim/ptt_types.hpp"
-#include "sim/result.hpp"
 
 #include <cstdint>
 #include <functional>

@@ -1,12 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/errands.hpp"
+#include "sim/base/errands.hpp"
+#include "sim/base/result.hpp"
 #include "sim/ptt_calls.hpp"
 #include "sim/ptt_directory.hpp"
 #include "sim/ptt_events.hpp"
 #include "sim/registrations.hpp"
-#include "sim/result.hpp"
 
 #include <cstdint>
 #include <functional>

@@ -1,11 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/glib_ref.hpp"
+#include "sim/base/glib_ref.hpp"
+#include "sim/base/result.hpp"
 #include "sim/ptt_calls.hpp"
 #include "sim/ptt_events.hpp"
 #include "sim/ptt_recorder.hpp"
-#include "sim/result.hpp"
 
 #include <cstdint>
 #include <vector>

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/clock.hpp"
-#include "sim/result.hpp"
+#include "sim/base/clock.hpp"
+#include "sim/base/result.hpp"
 
 #include <cstdint>
 #include <functional>

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/result.hpp"
+#include "sim/base/result.hpp"
 #include "sim/wire.hpp"
 
 #include <vector>

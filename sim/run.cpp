@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/child.hpp"
-#include "sim/main_loop.hpp"
-#include "sim/private_bus.hpp"
+#include "sim/base/child.hpp"
+#include "sim/base/main_loop.hpp"
+#include "sim/base/private_bus.hpp"
 #include "sim/program.hpp"
 #include "sim/stand_in.hpp"
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/main_loop.hpp"
+#include "sim/base/main_loop.hpp"
 #include "sim/program.hpp"
 #include "sim/stand_in.hpp"
 

@@ -2,10 +2,10 @@
 #pragma once
 
 #include "sim/applications.hpp"
+#include "sim/base/glib_ref.hpp"
+#include "sim/base/log.hpp"
+#include "sim/base/result.hpp"
 #include "sim/bus.hpp"
-#include "sim/glib_ref.hpp"
-#include "sim/log.hpp"
-#include "sim/result.hpp"
 #include "sim/wire.hpp"
 
 #include <functional>

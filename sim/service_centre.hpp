@@ -1,12 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/clock.hpp"
-#include "sim/errands.hpp"
+#include "sim/base/clock.hpp"
+#include "sim/base/errands.hpp"
+#include "sim/base/number_plan.hpp"
+#include "sim/base/result.hpp"
 #include "sim/message_parties.hpp"
-#include "sim/number_plan.hpp"
 #include "sim/registrations.hpp"
-#include "sim/result.hpp"
 #include "tpdu/tpdu.hpp"
 
 #include <cstdint>

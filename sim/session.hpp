@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
+#include "sim/base/clock.hpp"
+#include "sim/base/number_plan.hpp"
 #include "sim/call_events.hpp"
 #include "sim/call_types.hpp"
-#include "sim/clock.hpp"
-#include "sim/number_plan.hpp"
 
 #include <cstdint>
 #include <map>

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/foreign_value.hpp"
-#include "sim/result.hpp"
+#include "sim/base/foreign_value.hpp"
+#include "sim/base/result.hpp"
 #include "sim/settings_fields.hpp"
 
 #include <functional>

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "sim/settings_store.hpp"
 
-#include "sim/kept_file.hpp"
+#include "sim/base/kept_file.hpp"
 #include "sim/settings_json.hpp"
 
 namespace sim {

@@ -2,14 +2,14 @@
 #pragma once
 
 #include "sim/applications.hpp"
+#include "sim/base/clock.hpp"
+#include "sim/base/log.hpp"
+#include "sim/base/main_loop.hpp"
+#include "sim/base/number_plan.hpp"
 #include "sim/bus.hpp"
 #include "sim/call_interface.hpp"
 #include "sim/call_model.hpp"
-#include "sim/clock.hpp"
-#include "sim/log.hpp"
 #include "sim/login_interface.hpp"
-#include "sim/main_loop.hpp"
-#include "sim/number_plan.hpp"
 #include "sim/options.hpp"
 #include "sim/ptt_interface.hpp"
 #include "sim/registration_interface.hpp"

@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
+#include "sim/base/number_plan.hpp"
+#include "sim/base/result.hpp"
 #include "sim/call_types.hpp"
-#include "sim/number_plan.hpp"
 #include "sim/registrations.hpp"
-#include "sim/result.hpp"
 
 #include <array>
 #include <chrono>

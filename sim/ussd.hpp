@@ -1,11 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
+#include "sim/base/clock.hpp"
+#include "sim/base/number_plan.hpp"
+#include "sim/base/result.hpp"
 #include "sim/call_events.hpp"
-#include "sim/clock.hpp"
-#include "sim/number_plan.hpp"
 #include "sim/registrations.hpp"
-#include "sim/result.hpp"
 
 #include <functional>
 #include <string>

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
+#include "sim/base/result.hpp"
 #include "sim/call_events.hpp"
 #include "sim/call_model.hpp"
-#include "sim/result.hpp"
 
 #include <array>
 #include <cstdint>

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/glib_ref.hpp"
-#include "sim/result.hpp"
+#include "sim/base/glib_ref.hpp"
+#include "sim/base/result.hpp"
 
 #include <concepts>
 #include <cstdint>

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
+#include "sim/base/number_plan.hpp"
 #include "sim/group_model.hpp"
-#include "sim/number_plan.hpp"
 #include "sim/registrations.hpp"
 #include "sim/service.hpp"
 

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/glib_ref.hpp"
-#include "sim/private_bus.hpp"
+#include "sim/base/glib_ref.hpp"
+#include "sim/base/private_bus.hpp"
 
 #include <array>
 #include <deque>

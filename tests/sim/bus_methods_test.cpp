@@ -3,7 +3,7 @@
 // answers and where it learns who asks.
 #include "tests/sim/bus_client.hpp"
 
-#include "sim/result.hpp"
+#include "sim/base/result.hpp"
 
 #include <limits>
 #include <ostream>

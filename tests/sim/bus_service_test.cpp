@@ -2,7 +2,7 @@
 // Objects, interfaces and errors; who may ask.
 #include "tests/sim/bus_client.hpp"
 
-#include "sim/result.hpp"
+#include "sim/base/result.hpp"
 
 #include <gio/gio.h>
 #include <set>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/clock.hpp"
+#include "sim/base/clock.hpp"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/number_plan.hpp"
+#include "sim/base/number_plan.hpp"
 
 #include "tests/sim/network.hpp"
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/store.hpp"
+#include "sim/base/store.hpp"
 
-#include "sim/descriptor.hpp"
+#include "sim/base/descriptor.hpp"
 
 #include <cerrno>
 #include <cstring>

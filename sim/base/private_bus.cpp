@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/private_bus.hpp"
+#include "sim/base/private_bus.hpp"
 
-#include "sim/child.hpp"
-#include "sim/descriptor.hpp"
-#include "sim/glib_ref.hpp"
+#include "sim/base/child.hpp"
+#include "sim/base/descriptor.hpp"
+#include "sim/base/glib_ref.hpp"
 
 #include <array>
 #include <csignal>

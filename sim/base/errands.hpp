@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/clock.hpp"
+#include "sim/base/clock.hpp"
 
 #include <cstdint>
 #include <functional>

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/child.hpp"
+#include "sim/base/child.hpp"
 
-#include "sim/glib_ref.hpp"
-#include "sim/main_loop.hpp"
+#include "sim/base/glib_ref.hpp"
+#include "sim/base/main_loop.hpp"
 
 #include <algorithm>
 #include <chrono>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/log.hpp"
+#include "sim/base/log.hpp"
 
 #include <algorithm>
 #include <cstdio>

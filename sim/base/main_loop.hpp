@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/clock.hpp"
-#include "sim/glib_ref.hpp"
+#include "sim/base/clock.hpp"
+#include "sim/base/glib_ref.hpp"
 
 #include <functional>
 #include <vector>

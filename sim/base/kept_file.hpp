@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/store.hpp"
+#include "sim/base/store.hpp"
 
 namespace sim {
 
