@@ -20,7 +20,7 @@ foreach(at RANGE ${last})
   string(APPEND rows "    {\"${CMAKE_MATCH_1}\",\n     R\"xml(${content})xml\"},\n")
 endforeach()
 file(WRITE ${OUTPUT} "// Made of dbus/interfaces.
-#include \"sim/introspection.hpp\"
+#include \"sim/bus/introspection.hpp\"
 
 namespace sim::introspection {
 

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
+#include "sim/bus/service.hpp"
 #include "sim/call_model.hpp"
-#include "sim/service.hpp"
 #include "sim/ussd.hpp"
 
 namespace sim {

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "sim/group_wire.hpp"
 
-#include "sim/wire.hpp"
+#include "sim/bus/wire.hpp"
 
 #include <optional>
 

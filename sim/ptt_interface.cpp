@@ -2,9 +2,9 @@
 // The table, and the requests about calls and the floor.
 #include "sim/ptt_interface.hpp"
 
+#include "sim/bus/replies.hpp"
 #include "sim/ptt_signals.hpp"
 #include "sim/ptt_wire.hpp"
-#include "sim/replies.hpp"
 
 namespace sim {
 

@@ -1,11 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
+#include "sim/bus/service.hpp"
 #include "sim/ptt_calls.hpp"
 #include "sim/ptt_files.hpp"
 #include "sim/ptt_messages.hpp"
 #include "sim/ptt_recorder.hpp"
-#include "sim/service.hpp"
 
 namespace sim {
 

@@ -2,8 +2,8 @@
 // The requests about what is kept and sent: recordings, messages, files.
 #include "sim/ptt_interface.hpp"
 
+#include "sim/bus/replies.hpp"
 #include "sim/ptt_wire.hpp"
-#include "sim/replies.hpp"
 
 namespace sim {
 

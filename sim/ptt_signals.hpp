@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
+#include "sim/bus/service.hpp"
 #include "sim/ptt_events.hpp"
-#include "sim/service.hpp"
 
 #include <span>
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "sim/registration_interface.hpp"
 
-#include "sim/replies.hpp"
+#include "sim/bus/replies.hpp"
 
 namespace sim {
 

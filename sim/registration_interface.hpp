@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/applications.hpp"
+#include "sim/bus/applications.hpp"
+#include "sim/bus/service.hpp"
 #include "sim/registrations.hpp"
-#include "sim/service.hpp"
 
 namespace sim {
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/service.hpp"
+#include "sim/bus/service.hpp"
 #include "sim/settings_model.hpp"
 
 namespace sim {

@@ -1,19 +1,19 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/applications.hpp"
 #include "sim/base/clock.hpp"
 #include "sim/base/log.hpp"
 #include "sim/base/main_loop.hpp"
 #include "sim/base/number_plan.hpp"
-#include "sim/bus.hpp"
+#include "sim/bus/applications.hpp"
+#include "sim/bus/bus.hpp"
+#include "sim/bus/service.hpp"
 #include "sim/call_interface.hpp"
 #include "sim/call_model.hpp"
 #include "sim/login_interface.hpp"
 #include "sim/options.hpp"
 #include "sim/ptt_interface.hpp"
 #include "sim/registration_interface.hpp"
-#include "sim/service.hpp"
 #include "sim/settings_interface.hpp"
 #include "sim/sms_interface.hpp"
 #include "sim/ss_interface.hpp"

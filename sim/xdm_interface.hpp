@@ -2,9 +2,9 @@
 #pragma once
 
 #include "sim/base/number_plan.hpp"
+#include "sim/bus/service.hpp"
 #include "sim/group_model.hpp"
 #include "sim/registrations.hpp"
-#include "sim/service.hpp"
 
 namespace sim {
 

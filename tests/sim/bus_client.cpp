@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "tests/sim/bus_client.hpp"
 
-#include "sim/service.hpp"
+#include "sim/bus/service.hpp"
 #include "tests/programs/programs.hpp"
 
 #include <algorithm>

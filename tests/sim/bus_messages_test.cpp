@@ -3,7 +3,7 @@
 #include "tests/sim/bus_client.hpp"
 #include "tests/sim/messages.hpp"
 
-#include "sim/wire.hpp"
+#include "sim/bus/wire.hpp"
 
 namespace sim::test {
 namespace {

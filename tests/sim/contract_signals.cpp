@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "tests/sim/contract_signals.hpp"
 
-#include "sim/introspection.hpp"
+#include "sim/bus/introspection.hpp"
 
 #include <gtest/gtest.h>
 #include <map>

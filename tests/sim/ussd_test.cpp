@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "tests/sim/network.hpp"
 
-#include "sim/wire.hpp"
+#include "sim/bus/wire.hpp"
 
 namespace sim::test {
 namespace {

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/wire.hpp"
+#include "sim/bus/wire.hpp"
 
 #include "sim/call_signals.hpp"
 

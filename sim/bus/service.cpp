@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/service.hpp"
+#include "sim/bus/service.hpp"
 
-#include "sim/introspection.hpp"
+#include "sim/bus/introspection.hpp"
 
 #include <algorithm>
 #include <fstream>

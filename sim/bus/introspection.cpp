@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/introspection.hpp"
+#include "sim/bus/introspection.hpp"
 
 #include <algorithm>
 

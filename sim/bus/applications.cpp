@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/applications.hpp"
+#include "sim/bus/applications.hpp"
 
 #include <algorithm>
 

@@ -1,12 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/applications.hpp"
 #include "sim/base/glib_ref.hpp"
 #include "sim/base/log.hpp"
 #include "sim/base/result.hpp"
-#include "sim/bus.hpp"
-#include "sim/wire.hpp"
+#include "sim/bus/applications.hpp"
+#include "sim/bus/bus.hpp"
+#include "sim/bus/wire.hpp"
 
 #include <functional>
 #include <map>

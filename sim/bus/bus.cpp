@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/bus.hpp"
+#include "sim/bus/bus.hpp"
 
 #include <deque>
 #include <fmt/format.h>

@@ -2,7 +2,7 @@
 #pragma once
 
 #include "sim/base/result.hpp"
-#include "sim/wire.hpp"
+#include "sim/bus/wire.hpp"
 
 #include <vector>
 
