@@ -5,7 +5,7 @@
 #include "sim/base/number_plan.hpp"
 #include "sim/base/result.hpp"
 #include "sim/call_events.hpp"
-#include "sim/registrations.hpp"
+#include "sim/registration/registrations.hpp"
 #include "sim/session.hpp"
 #include "sim/supplementary.hpp"
 

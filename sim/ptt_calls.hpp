@@ -6,7 +6,7 @@
 #include "sim/ptt_call.hpp"
 #include "sim/ptt_directory.hpp"
 #include "sim/ptt_events.hpp"
-#include "sim/registrations.hpp"
+#include "sim/registration/registrations.hpp"
 
 #include <chrono>
 #include <cstdint>

@@ -6,7 +6,7 @@
 #include "sim/base/number_plan.hpp"
 #include "sim/base/result.hpp"
 #include "sim/message_parties.hpp"
-#include "sim/registrations.hpp"
+#include "sim/registration/registrations.hpp"
 #include "tpdu/tpdu.hpp"
 
 #include <cstdint>

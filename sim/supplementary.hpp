@@ -4,7 +4,7 @@
 #include "sim/base/number_plan.hpp"
 #include "sim/base/result.hpp"
 #include "sim/call_types.hpp"
-#include "sim/registrations.hpp"
+#include "sim/registration/registrations.hpp"
 
 #include <array>
 #include <chrono>

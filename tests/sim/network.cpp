@@ -4,8 +4,8 @@
 #include "tests/sim/contract_signals.hpp"
 
 #include "sim/call_signals.hpp"
-#include "sim/login_interface.hpp"
-#include "sim/registration_interface.hpp"
+#include "sim/registration/interface.hpp"
+#include "sim/registration/login_interface.hpp"
 #include "sim/sms_interface.hpp"
 
 #include <utility>

@@ -2,7 +2,7 @@
 #pragma once
 
 #include "sim/call_model.hpp"
-#include "sim/logins.hpp"
+#include "sim/registration/logins.hpp"
 #include "sim/service_centre.hpp"
 #include "sim/ussd.hpp"
 #include "sim/vt_model.hpp"

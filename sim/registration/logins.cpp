@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/logins.hpp"
+#include "sim/registration/logins.hpp"
 
 namespace sim {
 

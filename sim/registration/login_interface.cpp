@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/login_interface.hpp"
+#include "sim/registration/login_interface.hpp"
 
 #include "sim/bus/replies.hpp"
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/registration_interface.hpp"
+#include "sim/registration/interface.hpp"
 
 #include "sim/bus/replies.hpp"
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/registrations.hpp"
+#include "sim/registration/registrations.hpp"
 
 namespace sim {
 

@@ -2,7 +2,7 @@
 #pragma once
 
 #include "sim/bus/service.hpp"
-#include "sim/logins.hpp"
+#include "sim/registration/logins.hpp"
 
 namespace sim {
 

@@ -3,7 +3,7 @@
 
 #include "sim/base/clock.hpp"
 #include "sim/base/result.hpp"
-#include "sim/registrations.hpp"
+#include "sim/registration/registrations.hpp"
 
 #include <array>
 #include <cstdint>

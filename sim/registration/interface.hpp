@@ -3,7 +3,7 @@
 
 #include "sim/bus/applications.hpp"
 #include "sim/bus/service.hpp"
-#include "sim/registrations.hpp"
+#include "sim/registration/registrations.hpp"
 
 namespace sim {
 
