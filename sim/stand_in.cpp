@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "sim/stand_in.hpp"
 
-#include "sim/call_signals.hpp"
+#include "sim/call/signals.hpp"
 #include "sim/group_store.hpp"
 #include "sim/ptt_participants.hpp"
 #include "sim/ptt_signals.hpp"

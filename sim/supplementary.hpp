@@ -3,7 +3,7 @@
 
 #include "sim/base/number_plan.hpp"
 #include "sim/base/result.hpp"
-#include "sim/call_types.hpp"
+#include "sim/call/values.hpp"
 #include "sim/registration/registrations.hpp"
 
 #include <array>

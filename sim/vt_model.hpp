@@ -2,8 +2,8 @@
 #pragma once
 
 #include "sim/base/result.hpp"
-#include "sim/call_events.hpp"
-#include "sim/call_model.hpp"
+#include "sim/call/events.hpp"
+#include "sim/call/model.hpp"
 
 #include <array>
 #include <cstdint>

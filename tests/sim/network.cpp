@@ -3,7 +3,7 @@
 
 #include "tests/sim/contract_signals.hpp"
 
-#include "sim/call_signals.hpp"
+#include "sim/call/signals.hpp"
 #include "sim/registration/interface.hpp"
 #include "sim/registration/login_interface.hpp"
 #include "sim/sms_interface.hpp"

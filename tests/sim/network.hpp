@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/call_model.hpp"
+#include "sim/call/model.hpp"
+#include "sim/call/ussd.hpp"
 #include "sim/registration/logins.hpp"
 #include "sim/service_centre.hpp"
-#include "sim/ussd.hpp"
 #include "sim/vt_model.hpp"
 
 #include <chrono>

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "sim/bus/wire.hpp"
 
-#include "sim/call_signals.hpp"
+#include "sim/call/signals.hpp"
 
 #include <algorithm>
 #include <gmock/gmock.h>

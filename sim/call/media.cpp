@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // What is done inside a call: sound, tones, text telephony, recording.
-#include "sim/call_model.hpp"
+#include "sim/call/model.hpp"
 
 #include <algorithm>
 

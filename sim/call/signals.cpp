@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/call_signals.hpp"
+#include "sim/call/signals.hpp"
 
 namespace sim {
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/call_types.hpp"
+#include "sim/call/values.hpp"
 
 #include <array>
 #include <cstdint>

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // What the radio side tells the service, and the bearer for emergency calls.
-#include "sim/call_model.hpp"
+#include "sim/call/model.hpp"
 
 #include <arpa/inet.h>
 #include <array>

@@ -4,9 +4,9 @@
 #include "sim/base/clock.hpp"
 #include "sim/base/number_plan.hpp"
 #include "sim/base/result.hpp"
-#include "sim/call_events.hpp"
+#include "sim/call/events.hpp"
+#include "sim/call/session.hpp"
 #include "sim/registration/registrations.hpp"
-#include "sim/session.hpp"
 #include "sim/supplementary.hpp"
 
 #include <cstdint>

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/call_interface.hpp"
+#include "sim/call/interface.hpp"
 
 #include "sim/bus/replies.hpp"
-#include "sim/call_signals.hpp"
+#include "sim/call/signals.hpp"
 
 namespace sim {
 

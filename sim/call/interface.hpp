@@ -2,8 +2,8 @@
 #pragma once
 
 #include "sim/bus/service.hpp"
-#include "sim/call_model.hpp"
-#include "sim/ussd.hpp"
+#include "sim/call/model.hpp"
+#include "sim/call/ussd.hpp"
 
 namespace sim {
 

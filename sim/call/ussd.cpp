@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/ussd.hpp"
+#include "sim/call/ussd.hpp"
 
 #include <algorithm>
 

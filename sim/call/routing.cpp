@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Where a call to a slot goes: it rings there, goes on to another number, or comes back.
-#include "sim/call_model.hpp"
+#include "sim/call/model.hpp"
 
 #include <algorithm>
 

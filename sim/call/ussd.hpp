@@ -4,7 +4,7 @@
 #include "sim/base/clock.hpp"
 #include "sim/base/number_plan.hpp"
 #include "sim/base/result.hpp"
-#include "sim/call_events.hpp"
+#include "sim/call/events.hpp"
 #include "sim/registration/registrations.hpp"
 
 #include <functional>

@@ -2,7 +2,7 @@
 #pragma once
 
 #include "sim/bus/service.hpp"
-#include "sim/call_events.hpp"
+#include "sim/call/events.hpp"
 
 #include <span>
 

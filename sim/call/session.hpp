@@ -3,8 +3,8 @@
 
 #include "sim/base/clock.hpp"
 #include "sim/base/number_plan.hpp"
-#include "sim/call_events.hpp"
-#include "sim/call_types.hpp"
+#include "sim/call/events.hpp"
+#include "sim/call/values.hpp"
 
 #include <cstdint>
 #include <map>

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Voice to video and back.
-#include "sim/call_model.hpp"
+#include "sim/call/model.hpp"
 
 namespace sim {
 

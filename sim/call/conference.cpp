@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Conferences: a session of their own over member sessions that are ordinary calls.
-#include "sim/call_model.hpp"
+#include "sim/call/model.hpp"
 
 #include <algorithm>
 

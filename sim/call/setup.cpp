@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Calls from their first number to their end.
-#include "sim/call_model.hpp"
+#include "sim/call/model.hpp"
 
 #include <algorithm>
 #include <utility>

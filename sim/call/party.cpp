@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // What the far end does by itself.
-#include "sim/call_model.hpp"
+#include "sim/call/model.hpp"
 
 namespace sim {
 

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Holding, resuming and swapping calls.
-#include "sim/call_model.hpp"
+#include "sim/call/model.hpp"
 
 namespace sim {
 
