@@ -16,7 +16,7 @@
 #include "sim/registration/interface.hpp"
 #include "sim/registration/login_interface.hpp"
 #include "sim/settings_interface.hpp"
-#include "sim/sms_interface.hpp"
+#include "sim/sms/interface.hpp"
 #include "sim/ss_interface.hpp"
 #include "sim/vt_interface.hpp"
 #include "sim/vt_model.hpp"

@@ -6,7 +6,7 @@
 #include "sim/call/signals.hpp"
 #include "sim/registration/interface.hpp"
 #include "sim/registration/login_interface.hpp"
-#include "sim/sms_interface.hpp"
+#include "sim/sms/interface.hpp"
 
 #include <utility>
 

@@ -4,7 +4,7 @@
 #include "sim/call/model.hpp"
 #include "sim/call/ussd.hpp"
 #include "sim/registration/logins.hpp"
-#include "sim/service_centre.hpp"
+#include "sim/sms/service_centre.hpp"
 #include "sim/vt_model.hpp"
 
 #include <chrono>

@@ -2,7 +2,7 @@
 // Short messages on their way: what is refused, acknowledged, delivered and reported.
 #include "tests/sim/message_network.hpp"
 
-#include "sim/sms_interface.hpp"
+#include "sim/sms/interface.hpp"
 
 namespace sim::test {
 namespace {

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // What slots ask of the service centre, and what becomes of the messages that they send.
-#include "sim/service_centre.hpp"
+#include "sim/sms/service_centre.hpp"
 
 #include <algorithm>
 

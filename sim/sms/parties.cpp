@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/message_parties.hpp"
+#include "sim/sms/parties.hpp"
 
 #include "sim/base/number_plan.hpp"
 

@@ -5,8 +5,8 @@
 #include "sim/base/errands.hpp"
 #include "sim/base/number_plan.hpp"
 #include "sim/base/result.hpp"
-#include "sim/message_parties.hpp"
 #include "sim/registration/registrations.hpp"
+#include "sim/sms/parties.hpp"
 #include "tpdu/tpdu.hpp"
 
 #include <cstdint>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/sms_interface.hpp"
+#include "sim/sms/interface.hpp"
 
 namespace sim {
 

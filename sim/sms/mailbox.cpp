@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // What slots receive: at once, or once they are there again.
-#include "sim/service_centre.hpp"
+#include "sim/sms/service_centre.hpp"
 
 #include <iterator>
 

@@ -2,7 +2,7 @@
 #pragma once
 
 #include "sim/bus/service.hpp"
-#include "sim/service_centre.hpp"
+#include "sim/sms/service_centre.hpp"
 
 namespace sim {
 
