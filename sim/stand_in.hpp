@@ -17,7 +17,7 @@
 #include "sim/registration/login_interface.hpp"
 #include "sim/settings_interface.hpp"
 #include "sim/sms/interface.hpp"
-#include "sim/ss_interface.hpp"
+#include "sim/ss/interface.hpp"
 #include "sim/vt_interface.hpp"
 #include "sim/vt_model.hpp"
 #include "sim/xdm_interface.hpp"

@@ -7,7 +7,7 @@
 #include "sim/call/events.hpp"
 #include "sim/call/session.hpp"
 #include "sim/registration/registrations.hpp"
-#include "sim/supplementary.hpp"
+#include "sim/ss/model.hpp"
 
 #include <cstdint>
 #include <functional>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/supplementary.hpp"
+#include "sim/ss/model.hpp"
 
 #include <algorithm>
 #include <numeric>

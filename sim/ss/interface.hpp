@@ -2,7 +2,7 @@
 #pragma once
 
 #include "sim/bus/service.hpp"
-#include "sim/supplementary.hpp"
+#include "sim/ss/model.hpp"
 
 namespace sim {
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/ss_interface.hpp"
+#include "sim/ss/interface.hpp"
 
 #include "sim/bus/replies.hpp"
 
