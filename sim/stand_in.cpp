@@ -5,7 +5,7 @@
 #include "sim/group_store.hpp"
 #include "sim/ptt_participants.hpp"
 #include "sim/ptt_signals.hpp"
-#include "sim/settings_store.hpp"
+#include "sim/settings/store.hpp"
 
 #include <ctime>
 

@@ -15,7 +15,7 @@
 #include "sim/ptt_interface.hpp"
 #include "sim/registration/interface.hpp"
 #include "sim/registration/login_interface.hpp"
-#include "sim/settings_interface.hpp"
+#include "sim/settings/interface.hpp"
 #include "sim/sms/interface.hpp"
 #include "sim/ss/interface.hpp"
 #include "sim/vt_interface.hpp"

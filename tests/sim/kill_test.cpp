@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "sim/group_json.hpp"
-#include "sim/settings_json.hpp"
+#include "sim/settings/json.hpp"
 #include "tests/sim/kill_rounds.hpp"
 
 #include <csignal>

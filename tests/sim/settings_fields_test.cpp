@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/settings_fields.hpp"
+#include "sim/settings/fields.hpp"
 
 #include <algorithm>
 #include <gtest/gtest.h>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/settings_json.hpp"
+#include "sim/settings/json.hpp"
 
 #include "tests/sim/settings_samples.hpp"
 

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/settings_entries.hpp"
-#include "sim/settings_model.hpp"
+#include "sim/settings/entries.hpp"
+#include "sim/settings/model.hpp"
 
 #include "tests/sim/settings_samples.hpp"
 

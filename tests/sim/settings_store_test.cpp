@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "sim/base/store.hpp"
-#include "sim/settings_json.hpp"
-#include "sim/settings_store.hpp"
+#include "sim/settings/json.hpp"
+#include "sim/settings/store.hpp"
 
 #include "tests/sim/settings_directory.hpp"
 

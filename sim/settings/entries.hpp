@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/settings_model.hpp"
+#include "sim/settings/model.hpp"
 
 namespace sim {
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/settings_interface.hpp"
+#include "sim/settings/interface.hpp"
 
 #include "sim/bus/replies.hpp"
 

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/settings_store.hpp"
+#include "sim/settings/store.hpp"
 
 #include "sim/base/kept_file.hpp"
-#include "sim/settings_json.hpp"
+#include "sim/settings/json.hpp"
 
 namespace sim {
 

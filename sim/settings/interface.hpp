@@ -2,7 +2,7 @@
 #pragma once
 
 #include "sim/bus/service.hpp"
-#include "sim/settings_model.hpp"
+#include "sim/settings/model.hpp"
 
 namespace sim {
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/settings_fields.hpp"
+#include "sim/settings/fields.hpp"
 
 namespace sim {
 

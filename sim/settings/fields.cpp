@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/settings_fields.hpp"
+#include "sim/settings/fields.hpp"
 
-#include "sim/settings_rows.hpp"
+#include "sim/settings/rows.hpp"
 
 #include <algorithm>
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Operator, device management, logging and push-to-talk timers. Most of these are texts, even
 // where they spell a number or a switch.
-#include "sim/settings_rows.hpp"
+#include "sim/settings/rows.hpp"
 
 namespace sim {
 

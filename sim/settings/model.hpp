@@ -3,7 +3,7 @@
 
 #include "sim/base/foreign_value.hpp"
 #include "sim/base/result.hpp"
-#include "sim/settings_fields.hpp"
+#include "sim/settings/fields.hpp"
 
 #include <functional>
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/settings_entries.hpp"
+#include "sim/settings/entries.hpp"
 
 #include <algorithm>
 #include <charconv>

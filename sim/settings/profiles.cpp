@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/settings_rows.hpp"
+#include "sim/settings/rows.hpp"
 
 namespace sim {
 

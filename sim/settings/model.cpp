@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/settings_model.hpp"
+#include "sim/settings/model.hpp"
 
-#include "sim/settings_entries.hpp"
+#include "sim/settings/entries.hpp"
 
 #include <algorithm>
 
