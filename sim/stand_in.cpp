@@ -3,8 +3,8 @@
 
 #include "sim/call/signals.hpp"
 #include "sim/group_store.hpp"
-#include "sim/ptt_participants.hpp"
-#include "sim/ptt_signals.hpp"
+#include "sim/ptt/participants.hpp"
+#include "sim/ptt/signals.hpp"
 #include "sim/settings/store.hpp"
 
 #include <ctime>

@@ -12,7 +12,7 @@
 #include "sim/call/model.hpp"
 #include "sim/call/ussd.hpp"
 #include "sim/options.hpp"
-#include "sim/ptt_interface.hpp"
+#include "sim/ptt/interface.hpp"
 #include "sim/registration/interface.hpp"
 #include "sim/registration/login_interface.hpp"
 #include "sim/settings/interface.hpp"

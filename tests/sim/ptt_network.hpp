@@ -5,12 +5,12 @@
 
 #include "tests/sim/contract_signals.hpp"
 
-#include "sim/ptt_calls.hpp"
-#include "sim/ptt_directory.hpp"
-#include "sim/ptt_files.hpp"
-#include "sim/ptt_messages.hpp"
-#include "sim/ptt_recorder.hpp"
-#include "sim/ptt_signals.hpp"
+#include "sim/ptt/directory.hpp"
+#include "sim/ptt/files.hpp"
+#include "sim/ptt/messages.hpp"
+#include "sim/ptt/model.hpp"
+#include "sim/ptt/recorder.hpp"
+#include "sim/ptt/signals.hpp"
 
 namespace sim::test {
 

@@ -2,9 +2,9 @@
 #pragma once
 
 #include "sim/base/clock.hpp"
-#include "sim/ptt_directory.hpp"
-#include "sim/ptt_events.hpp"
-#include "sim/ptt_floor.hpp"
+#include "sim/ptt/directory.hpp"
+#include "sim/ptt/events.hpp"
+#include "sim/ptt/floor.hpp"
 
 #include <chrono>
 #include <map>

@@ -2,7 +2,7 @@
 #pragma once
 
 #include "sim/bus/service.hpp"
-#include "sim/ptt_events.hpp"
+#include "sim/ptt/events.hpp"
 
 #include <span>
 

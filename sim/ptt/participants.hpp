@@ -2,7 +2,7 @@
 #pragma once
 
 #include "sim/group_answers.hpp"
-#include "sim/ptt_calls.hpp"
+#include "sim/ptt/model.hpp"
 
 namespace sim {
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/ptt_recorder.hpp"
+#include "sim/ptt/recorder.hpp"
 
-#include "sim/ptt_media.hpp"
+#include "sim/ptt/media.hpp"
 
 #include <cerrno>
 #include <fcntl.h>

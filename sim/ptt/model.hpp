@@ -3,9 +3,9 @@
 
 #include "sim/base/clock.hpp"
 #include "sim/base/result.hpp"
-#include "sim/ptt_call.hpp"
-#include "sim/ptt_directory.hpp"
-#include "sim/ptt_events.hpp"
+#include "sim/ptt/call.hpp"
+#include "sim/ptt/directory.hpp"
+#include "sim/ptt/events.hpp"
 #include "sim/registration/registrations.hpp"
 
 #include <chrono>

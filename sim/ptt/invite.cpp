@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Asking slots and parties of the network to take part.
-#include "sim/ptt_calls.hpp"
+#include "sim/ptt/model.hpp"
 
 namespace sim {
 

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // Other media and other terms for a call that goes on.
-#include "sim/ptt_calls.hpp"
+#include "sim/ptt/model.hpp"
 
-#include "sim/ptt_media.hpp"
+#include "sim/ptt/media.hpp"
 
 namespace sim {
 

@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 // The table, and the requests about calls and the floor.
-#include "sim/ptt_interface.hpp"
+#include "sim/ptt/interface.hpp"
 
 #include "sim/bus/replies.hpp"
-#include "sim/ptt_signals.hpp"
-#include "sim/ptt_wire.hpp"
+#include "sim/ptt/signals.hpp"
+#include "sim/ptt/wire.hpp"
 
 namespace sim {
 

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 // The requests about what is kept and sent: recordings, messages, files.
-#include "sim/ptt_interface.hpp"
+#include "sim/ptt/interface.hpp"
 
 #include "sim/bus/replies.hpp"
-#include "sim/ptt_wire.hpp"
+#include "sim/ptt/wire.hpp"
 
 namespace sim {
 

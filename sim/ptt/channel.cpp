@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Channels: whoever is tuned to one takes part in what goes on there.
-#include "sim/ptt_calls.hpp"
+#include "sim/ptt/model.hpp"
 
 namespace sim {
 

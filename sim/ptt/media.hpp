@@ -2,7 +2,7 @@
 #pragma once
 
 #include "sim/base/result.hpp"
-#include "sim/ptt_types.hpp"
+#include "sim/ptt/values.hpp"
 
 #include <algorithm>
 #include <chrono>

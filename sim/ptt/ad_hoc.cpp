@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // Calls to groups that are made for them.
-#include "sim/ptt_calls.hpp"
+#include "sim/ptt/model.hpp"
 
-#include "sim/ptt_media.hpp"
+#include "sim/ptt/media.hpp"
 
 #include <algorithm>
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/ptt_signals.hpp"
+#include "sim/ptt/signals.hpp"
 
-#include "sim/ptt_wire.hpp"
+#include "sim/ptt/wire.hpp"
 
 namespace sim {
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/ptt_participants.hpp"
+#include "sim/ptt/participants.hpp"
 
 #include <fmt/format.h>
 

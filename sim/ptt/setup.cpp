@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // Placing and answering: until a participant takes part. Inviting is in ptt_invite.cpp.
-#include "sim/ptt_calls.hpp"
+#include "sim/ptt/model.hpp"
 
-#include "sim/ptt_media.hpp"
+#include "sim/ptt/media.hpp"
 
 namespace sim {
 

@@ -4,8 +4,8 @@
 #include "sim/base/clock.hpp"
 #include "sim/base/descriptor.hpp"
 #include "sim/base/result.hpp"
-#include "sim/ptt_calls.hpp"
-#include "sim/ptt_events.hpp"
+#include "sim/ptt/events.hpp"
+#include "sim/ptt/model.hpp"
 
 #include <cstdint>
 #include <filesystem>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/ptt_files.hpp"
+#include "sim/ptt/files.hpp"
 
 #include <algorithm>
 

@@ -3,9 +3,9 @@
 
 #include "sim/base/glib_ref.hpp"
 #include "sim/base/result.hpp"
-#include "sim/ptt_calls.hpp"
-#include "sim/ptt_events.hpp"
-#include "sim/ptt_recorder.hpp"
+#include "sim/ptt/events.hpp"
+#include "sim/ptt/model.hpp"
+#include "sim/ptt/recorder.hpp"
 
 #include <cstdint>
 #include <vector>

@@ -2,10 +2,10 @@
 #pragma once
 
 #include "sim/bus/service.hpp"
-#include "sim/ptt_calls.hpp"
-#include "sim/ptt_files.hpp"
-#include "sim/ptt_messages.hpp"
-#include "sim/ptt_recorder.hpp"
+#include "sim/ptt/files.hpp"
+#include "sim/ptt/messages.hpp"
+#include "sim/ptt/model.hpp"
+#include "sim/ptt/recorder.hpp"
 
 namespace sim {
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/ptt_types.hpp"
+#include "sim/ptt/values.hpp"
 
 #include <cstdint>
 #include <string>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/ptt_directory.hpp"
+#include "sim/ptt/directory.hpp"
 
 #include <algorithm>
 

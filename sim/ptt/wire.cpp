@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/ptt_wire.hpp"
+#include "sim/ptt/wire.hpp"
 
 #include "sim/bus/wire.hpp"
 

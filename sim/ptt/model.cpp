@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // What the parts of the model stand on, and how calls and slots' parts in them end.
-#include "sim/ptt_calls.hpp"
+#include "sim/ptt/model.hpp"
 
-#include "sim/ptt_media.hpp"
+#include "sim/ptt/media.hpp"
 
 #include <algorithm>
 

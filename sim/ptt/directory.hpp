@@ -3,7 +3,7 @@
 
 #include "sim/base/number_plan.hpp"
 #include "sim/base/result.hpp"
-#include "sim/ptt_types.hpp"
+#include "sim/ptt/values.hpp"
 
 #include <cstdint>
 #include <functional>

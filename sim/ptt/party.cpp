@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // What parties of the network do by themselves once they take part.
-#include "sim/ptt_calls.hpp"
+#include "sim/ptt/model.hpp"
 
 namespace sim {
 

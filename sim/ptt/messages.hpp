@@ -3,9 +3,9 @@
 
 #include "sim/base/errands.hpp"
 #include "sim/base/result.hpp"
-#include "sim/ptt_calls.hpp"
-#include "sim/ptt_directory.hpp"
-#include "sim/ptt_events.hpp"
+#include "sim/ptt/directory.hpp"
+#include "sim/ptt/events.hpp"
+#include "sim/ptt/model.hpp"
 #include "sim/registration/registrations.hpp"
 
 #include <cstdint>

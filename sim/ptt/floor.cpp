@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/ptt_floor.hpp"
+#include "sim/ptt/floor.hpp"
 
 #include <algorithm>
 
