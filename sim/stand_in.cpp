@@ -2,7 +2,7 @@
 #include "sim/stand_in.hpp"
 
 #include "sim/call/signals.hpp"
-#include "sim/group_store.hpp"
+#include "sim/group/store.hpp"
 #include "sim/ptt/participants.hpp"
 #include "sim/ptt/signals.hpp"
 #include "sim/settings/store.hpp"

@@ -11,6 +11,7 @@
 #include "sim/call/interface.hpp"
 #include "sim/call/model.hpp"
 #include "sim/call/ussd.hpp"
+#include "sim/group/interface.hpp"
 #include "sim/options.hpp"
 #include "sim/ptt/interface.hpp"
 #include "sim/registration/interface.hpp"
@@ -20,7 +21,6 @@
 #include "sim/ss/interface.hpp"
 #include "sim/vt_interface.hpp"
 #include "sim/vt_model.hpp"
-#include "sim/xdm_interface.hpp"
 
 #include <functional>
 #include <optional>

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Documents that are read, and those that are refused.
-#include "sim/group_reader.hpp"
-#include "sim/group_writer.hpp"
+#include "sim/group/reader.hpp"
+#include "sim/group/writer.hpp"
 
 #include "tests/sim/group_samples.hpp"
 

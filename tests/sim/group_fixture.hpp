@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/group_edits.hpp"
-#include "sim/group_model.hpp"
+#include "sim/group/edits.hpp"
+#include "sim/group/model.hpp"
 #include "tests/sim/group_samples.hpp"
 
 #include <gmock/gmock.h>

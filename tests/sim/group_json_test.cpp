@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/group_json.hpp"
-#include "sim/group_store.hpp"
+#include "sim/group/json.hpp"
+#include "sim/group/store.hpp"
 
 #include "tests/sim/group_samples.hpp"
 #include "tests/sim/settings_directory.hpp"

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/group_records.hpp"
+#include "sim/group/records.hpp"
 
 namespace sim::test {
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/group_json.hpp"
+#include "sim/group/json.hpp"
 #include "sim/settings/json.hpp"
 #include "tests/sim/kill_rounds.hpp"
 

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/group_wire.hpp"
-#include "sim/group_writer.hpp"
+#include "sim/group/wire.hpp"
+#include "sim/group/writer.hpp"
 #include "tests/sim/group_samples.hpp"
 #include "tests/sim/served_with_state.hpp"
 

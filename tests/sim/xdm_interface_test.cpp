@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // What org.kelvo.ims.Xdm answers about push-to-talk sessions.
-#include "sim/xdm_interface.hpp"
+#include "sim/group/interface.hpp"
 
 #include <algorithm>
 #include <gmock/gmock.h>

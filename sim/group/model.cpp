@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/group_model.hpp"
+#include "sim/group/model.hpp"
 
 #include "sim/base/number_plan.hpp"
-#include "sim/group_edits.hpp"
-#include "sim/group_lists.hpp"
-#include "sim/group_writer.hpp"
+#include "sim/group/edits.hpp"
+#include "sim/group/lists.hpp"
+#include "sim/group/writer.hpp"
 
 #include <algorithm>
 #include <set>

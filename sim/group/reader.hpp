@@ -2,7 +2,7 @@
 #pragma once
 
 #include "sim/base/result.hpp"
-#include "sim/group_fields.hpp"
+#include "sim/group/fields.hpp"
 
 #include <functional>
 #include <optional>

@@ -3,7 +3,7 @@
 
 #include "sim/base/number_plan.hpp"
 #include "sim/bus/service.hpp"
-#include "sim/group_model.hpp"
+#include "sim/group/model.hpp"
 #include "sim/registration/registrations.hpp"
 
 namespace sim {

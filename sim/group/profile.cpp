@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/group_profile.hpp"
+#include "sim/group/profile.hpp"
 
 #include <fmt/format.h>
 

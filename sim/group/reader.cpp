@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/group_reader.hpp"
+#include "sim/group/reader.hpp"
 
 #include <limits>
 

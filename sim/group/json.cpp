@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/group_json.hpp"
+#include "sim/group/json.hpp"
 
-#include "sim/group_reader.hpp"
-#include "sim/group_writer.hpp"
+#include "sim/group/reader.hpp"
+#include "sim/group/writer.hpp"
 
 #include <limits>
 #include <nlohmann/json.hpp>

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/group_model.hpp"
+#include "sim/group/model.hpp"
 
 // The lists in which a user finds the groups that it is a member of.
 namespace sim {

@@ -2,7 +2,7 @@
 #pragma once
 
 #include "sim/base/result.hpp"
-#include "sim/group_answers.hpp"
+#include "sim/group/answers.hpp"
 
 #include <functional>
 #include <optional>

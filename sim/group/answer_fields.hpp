@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/group_answers.hpp"
-#include "sim/group_fields.hpp"
+#include "sim/group/answers.hpp"
+#include "sim/group/fields.hpp"
 
 // The keys of what is only ever answered.
 namespace sim {

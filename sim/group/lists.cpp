@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/group_lists.hpp"
+#include "sim/group/lists.hpp"
 
 #include <algorithm>
 

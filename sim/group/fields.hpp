@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/group_records.hpp"
-#include "sim/group_tree.hpp"
+#include "sim/group/records.hpp"
+#include "sim/group/tree.hpp"
 
 #include <concepts>
 #include <span>

@@ -3,7 +3,7 @@
 
 #include "sim/base/glib_ref.hpp"
 #include "sim/base/result.hpp"
-#include "sim/group_tree.hpp"
+#include "sim/group/tree.hpp"
 
 // Between the dictionaries of documents and those of the bus.
 namespace sim::wire {

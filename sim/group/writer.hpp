@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/group_fields.hpp"
+#include "sim/group/fields.hpp"
 
 #include <optional>
 #include <utility>

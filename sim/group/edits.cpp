@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/group_edits.hpp"
+#include "sim/group/edits.hpp"
 
 #include <algorithm>
 #include <functional>

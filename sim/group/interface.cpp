@@ -1,13 +1,13 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/xdm_interface.hpp"
+#include "sim/group/interface.hpp"
 
 #include "sim/bus/replies.hpp"
-#include "sim/group_answer_fields.hpp"
-#include "sim/group_edits.hpp"
-#include "sim/group_profile.hpp"
-#include "sim/group_reader.hpp"
-#include "sim/group_wire.hpp"
-#include "sim/group_writer.hpp"
+#include "sim/group/answer_fields.hpp"
+#include "sim/group/edits.hpp"
+#include "sim/group/profile.hpp"
+#include "sim/group/reader.hpp"
+#include "sim/group/wire.hpp"
+#include "sim/group/writer.hpp"
 
 #include <algorithm>
 

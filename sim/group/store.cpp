@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/group_store.hpp"
+#include "sim/group/store.hpp"
 
 #include "sim/base/kept_file.hpp"
-#include "sim/group_json.hpp"
+#include "sim/group/json.hpp"
 
 namespace sim {
 

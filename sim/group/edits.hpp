@@ -2,7 +2,7 @@
 #pragma once
 
 #include "sim/base/result.hpp"
-#include "sim/group_records.hpp"
+#include "sim/group/records.hpp"
 
 // What requests do to one document. After a refusal the document is of no use.
 namespace sim {

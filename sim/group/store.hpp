@@ -2,7 +2,7 @@
 #pragma once
 
 #include "sim/base/store.hpp"
-#include "sim/group_model.hpp"
+#include "sim/group/model.hpp"
 
 namespace sim {
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/group_answers.hpp"
+#include "sim/group/answers.hpp"
 
 namespace sim {
 

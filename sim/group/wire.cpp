@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/group_wire.hpp"
+#include "sim/group/wire.hpp"
 
 #include "sim/bus/wire.hpp"
 
