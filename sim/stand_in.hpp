@@ -19,8 +19,8 @@
 #include "sim/settings/interface.hpp"
 #include "sim/sms/interface.hpp"
 #include "sim/ss/interface.hpp"
-#include "sim/vt_interface.hpp"
-#include "sim/vt_model.hpp"
+#include "sim/vt/interface.hpp"
+#include "sim/vt/model.hpp"
 
 #include <functional>
 #include <optional>

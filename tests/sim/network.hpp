@@ -5,7 +5,7 @@
 #include "sim/call/ussd.hpp"
 #include "sim/registration/logins.hpp"
 #include "sim/sms/service_centre.hpp"
-#include "sim/vt_model.hpp"
+#include "sim/vt/model.hpp"
 
 #include <chrono>
 #include <gmock/gmock.h>

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Which calls have video, and until when.
-#include "sim/vt_model.hpp"
+#include "sim/vt/model.hpp"
 
 #include <algorithm>
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // The stream itself: hold, pictures, recordings, casting a file. State alone: there are no
 // pictures, no file is read or written.
-#include "sim/vt_model.hpp"
+#include "sim/vt/model.hpp"
 
 namespace sim {
 

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // The near end's picture: camera, preview, zoom, orientation.
-#include "sim/vt_model.hpp"
+#include "sim/vt/model.hpp"
 
 namespace sim {
 

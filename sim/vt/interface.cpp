@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-#include "sim/vt_interface.hpp"
+#include "sim/vt/interface.hpp"
 
 #include "sim/bus/replies.hpp"
 

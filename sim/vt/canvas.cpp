@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // What the video is drawn on: surfaces of pixmaps, windows, buffers.
-#include "sim/vt_model.hpp"
+#include "sim/vt/model.hpp"
 
 #include <algorithm>
 #include <set>

@@ -2,7 +2,7 @@
 #pragma once
 
 #include "sim/bus/service.hpp"
-#include "sim/vt_model.hpp"
+#include "sim/vt/model.hpp"
 
 namespace sim {
 
