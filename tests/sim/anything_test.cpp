@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Requests of every kind, with values good and bad, in whatever state the ones before have led to:
 // none brings the network down, and what it says of itself stays true.
-#include "tests/sim/message_network.hpp"
+#include "tests/sim/sms/network.hpp"
 
 #include <algorithm>
 #include <cstdio>

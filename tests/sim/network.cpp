@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "tests/sim/network.hpp"
 
-#include "tests/sim/contract_signals.hpp"
+#include "tests/sim/bus/contract_signals.hpp"
 
 #include "sim/call/signals.hpp"
 #include "sim/registration/interface.hpp"
