@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // The verbs about groups against a scripted service: what each sends, and what it shows.
-#include "tests/imsctl/group_documents.hpp"
+#include "tests/imsctl/group/documents.hpp"
 #include "tests/imsctl/program.hpp"
 #include "tests/imsctl/temporary_file.hpp"
 #include "tests/support/private_bus.hpp"

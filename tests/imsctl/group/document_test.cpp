@@ -4,7 +4,7 @@
 #include "imsctl/group/json.hpp"
 #include "imsctl/group/schema.hpp"
 #include "imsctl/output/failure.hpp"
-#include "tests/imsctl/group_documents.hpp"
+#include "tests/imsctl/group/documents.hpp"
 #include "tests/imsctl/temporary_file.hpp"
 
 #include <fstream>
