@@ -5,13 +5,61 @@
 #define KELVO_IMS_CALL_H
 
 /**
- * @file ims_call.h
- * @brief Voice and video calls: requests, the call list and the events.
+ * @file
+ * @brief Voice and video calls.
+ */
+
+/**
+ * @defgroup ims_call Calls
+ * @brief Voice and video calls, conferences, USSD: `org.kelvo.ims.Call`.
  *
- * All methods and signals are on the D-Bus interface `org.kelvo.ims.Call`.
+ * @section ims_call_life The life of a call
  *
- * The service defines what the values mean: call types, reasons, states, and every field with a
- * neutral name such as `value_1` or `text_1`. The library passes them through unchanged.
+ * A call is a session of the slot, known by an id that the service gives. A placed call's id comes
+ * with the callback of ims_call_make_call(); what becomes of the call comes as events:
+ * #IMS_NOTI_CALL_IN_PROGRESS, #IMS_NOTI_CALL_ALERTING, #IMS_NOTI_CALL_ESTABLISHED, and on the way
+ * perhaps #IMS_NOTI_CALL_EARLY_MEDIA_START, #IMS_NOTI_CALL_FORWARDED, #IMS_NOTI_CALL_BUSY or
+ * #IMS_NOTI_CALL_ERROR. A call that comes in begins with #IMS_NOTI_CALL_INCOMING_IND and waits for
+ * ims_call_answer_call() or ims_call_reject_call(). Both end with #IMS_NOTI_CALL_ENDED, whoever
+ * hangs up. When the callback of ims_call_make_call() has a result other than 0 there is no call,
+ * and no event will tell of one.
+ *
+ * So it is with all requests: the callback says whether the service has taken the request up, and
+ * events say what has come of it, also when the other side began it. A call on hold is
+ * #IMS_NOTI_CALL_HELD, another kind of call #IMS_NOTI_CALL_SWITCHED; when the peer asks for one,
+ * #IMS_NOTI_CALL_CHANGE_REQUEST waits for an answer. ims_call_get_call_list_info() tells what is
+ * there now. A conference is a session of its own.
+ *
+ * @code{.c}
+ * #include <ims.h>
+ * #include <stdio.h>
+ * #include <stdlib.h>
+ *
+ * void on_made(ims_h handle, int result, void *data, void *user_data) {
+ *     if (result == 0)
+ *         printf("session %d\n", (int)*(int32_t *)data);
+ *     else
+ *         printf("no call: %d\n", result);
+ * }
+ *
+ * void on_incoming(ims_h handle, int noti_id, void *event, void *user_data) {
+ *     ims_call_incoming_s *call = event;
+ *     char *texts[] = {call->number, call->text_1, call->text_2,
+ *                      call->text_3, call->text_4, call->text_5};
+ *     ims_call_id_info_s answer = {.session_id = call->session_id, .value_1 = call->call_type};
+ *     ims_call_answer_call(handle, &answer, NULL, NULL);
+ *     for (size_t i = 0; i < sizeof texts / sizeof *texts; ++i)
+ *         free(texts[i]); // the texts of an event are the application's
+ * }
+ *
+ * int begin(ims_h handle) {
+ *     const ims_call_make_info_s call = {.number = "+15550199"};
+ *     int error = ims_set_notification_cb(handle, IMS_NOTI_CALL_INCOMING_IND, on_incoming, NULL);
+ *     return error == IMS_ERROR_NONE ? ims_call_make_call(handle, &call, on_made, NULL) : error;
+ * }
+ * @endcode
+ *
+ * @{
  */
 
 #include "ims_types.h"
@@ -21,8 +69,8 @@ extern "C" {
 #endif
 
 /**
- * @name Request records
- * Owned by the caller and read during the call only. A NULL text is sent as an empty one.
+ * @defgroup ims_call_records Request records
+ * @brief Owned by the caller, read during the call only; a NULL text is sent as an empty one.
  * @{
  */
 
@@ -134,8 +182,8 @@ typedef struct ims_call_conference_modify_s {
 /** @} */
 
 /**
- * @name Response records
- * What the callbacks of some requests receive, valid while the callback runs.
+ * @defgroup ims_call_answers Response records
+ * @brief What the callbacks of some requests receive, valid while the callback runs.
  * @{
  */
 
@@ -156,10 +204,12 @@ typedef struct ims_call_tty_mode_s {
 /** @} */
 
 /**
- * @name Event records
- * What an #ims_notification_cb receives, by id. The record is valid while the callback runs. Every
- * `char *` in it is a copy that the application takes over and releases with free(), whether it
- * uses it or not.
+ * @defgroup ims_call_events Event records
+ * @brief What an #ims_notification_cb receives, by id.
+ *
+ * The record is valid while the callback runs. Every `char *` in it is a copy that the application
+ * takes over and releases with free(), whether it uses it or not. Decoded bytes are gone after the
+ * callback.
  * @{
  */
 
@@ -283,6 +333,12 @@ typedef struct ims_call_dtmf_event_s {
 
 /** @} */
 
+/**
+ * @defgroup ims_call_list The call list
+ * @brief What calls there are now: a query.
+ * @{
+ */
+
 /** How many calls an #ims_call_list_info_s holds. */
 #define IMS_CALL_LIST_CAPACITY 64
 
@@ -303,25 +359,23 @@ typedef struct ims_call_list_info_s {
 } ims_call_list_info_s;
 
 /**
- * @brief Reads the list of current calls.
+ * Reads the list of current calls.
  *
- * Blocks for at most 60 s. A list that is empty, or whose count is not the number of entries that
+ * A list that is empty, or whose count is not the number of entries that
  * came, is reported as success with @p list->count 0. Of more than #IMS_CALL_LIST_CAPACITY calls
  * the first ones are kept. An entry keeps the value that the caller had in a field which the
  * service left out; a text that a field held before is overwritten, not freed.
  *
- * D-Bus: `CallListInfo`, sends `(i)`: the application id; expects `(iu\@aa{sv})`: the result, the
+ * D-Bus: `CallListInfo`, sends `(i)`: the application id; expects `(iuaa{sv})`: the result, the
  * count and one dictionary a call.
  *
- * @param         handle  the handle
- * @param[in,out] list    receives the calls. On a failure of the service itself, its count is the
- *                        reply's and no entry was written; otherwise untouched on failure
- * @return see @ref requests
+ * @param[in,out] list  receives the calls. On a failure of the service itself, its count is the
+ *                      reply's and no entry was written; otherwise untouched on failure
  */
 IMS_API int ims_call_get_call_list_info(ims_h handle, ims_call_list_info_s *list);
 
 /**
- * @brief Frees the texts in the entries of a call list and zeroes the whole record.
+ * Frees the texts in the entries of a call list and zeroes the whole record.
  *
  * Frees the text of every entry, also behind @p list->count. Needs no handle and no IMS feature.
  *
@@ -329,503 +383,361 @@ IMS_API int ims_call_get_call_list_info(ims_h handle, ims_call_list_info_s *list
  */
 IMS_API void ims_call_list_info_clear(ims_call_list_info_s *list);
 
+/** @} */
+
 /**
- * @name Requests
- * All are asynchronous and return what @ref requests says. The callback may be NULL: the request is
- * sent all the same and its outcome dropped. Where nothing else is said the service's reply is
- * `(i)` and the callback's data NULL. No request checks what its record contains.
+ * @defgroup ims_call_requests Requests
+ * @brief To place, answer, end and change calls.
+ *
+ * What all requests share is said in @ref ims_requests and @ref ims_errors. Where nothing else is
+ * said here, what is sent is the application id and then the argument, or the record's fields in
+ * their order; the reply is `(i)`, the result, and the callback's data is NULL. No request checks
+ * what its record contains.
  * @{
  */
 
 /**
- * @brief Places a call.
+ * Places a call.
  *
- * D-Bus: `MakeCall`, sends `(isissss)`: the application id and the record's fields; expects
- * `(ii)`: the callback's data is an `int32_t *` to the second member, the new session.
+ * D-Bus: `MakeCall`, sends `(isissss)`; expects `(ii)`: the callback's data is an `int32_t *` to
+ * the second member, the new session.
  *
- * @param handle     the handle
- * @param info       the call
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the call
  */
 IMS_API int ims_call_make_call(ims_h handle, const ims_call_make_info_s *info,
                                ims_response_cb callback, void *user_data);
 
 /**
- * @brief Sends an unstructured supplementary service request.
+ * Sends an unstructured supplementary service request.
  *
  * D-Bus: `SendUssd`, sends `(iiis)`: the application id, the type, the value, and the text or an
  * empty one.
  *
- * @param handle     the handle
- * @param info       the request. Unless its type is #IMS_CALL_USSD_TYPE_WITHOUT_TEXT, a zero byte
- *                   is written into its text at index text_length (when that is not negative)
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the request. Unless its type is #IMS_CALL_USSD_TYPE_WITHOUT_TEXT, a zero byte is
+ *              written into its text at index text_length (when that is not negative)
  */
 IMS_API int ims_call_send_ussd(ims_h handle, const ims_call_ussd_info_s *info,
                                ims_response_cb callback, void *user_data);
 
 /**
- * @brief Answers an incoming call.
+ * Answers an incoming call.
  *
- * D-Bus: `AnswerCall`, sends `(iiii)`: the application id and the record's fields.
+ * D-Bus: `AnswerCall`, sends `(iiii)`.
  *
- * @param handle     the handle
- * @param info       the session and two values
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the session and two values
  */
 IMS_API int ims_call_answer_call(ims_h handle, const ims_call_id_info_s *info,
                                  ims_response_cb callback, void *user_data);
 
 /**
- * @brief Ends a call.
+ * Ends a call.
  *
- * D-Bus: `EndCall`, sends `(iiii)`: the application id and the record's fields.
+ * D-Bus: `EndCall`, sends `(iiii)`.
  *
- * @param handle     the handle
- * @param info       the session and two values
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the session and two values
  */
 IMS_API int ims_call_end_call(ims_h handle, const ims_call_id_info_s *info,
                               ims_response_cb callback, void *user_data);
 
 /**
- * @brief Rejects an incoming call.
+ * Rejects an incoming call.
  *
- * D-Bus: `RejectCall`, sends `(iii)`: the application id and the record's fields.
+ * D-Bus: `RejectCall`, sends `(iii)`.
  *
- * @param handle     the handle
- * @param info       the session and a value
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the session and a value
  */
 IMS_API int ims_call_reject_call(ims_h handle, const ims_call_pair_info_s *info,
                                  ims_response_cb callback, void *user_data);
 
 /**
- * @brief Puts a call on hold.
+ * Puts a call on hold.
  *
- * D-Bus: `HoldCall`, sends `(ii)`: the application id and the session.
+ * D-Bus: `HoldCall`, sends `(ii)`.
  *
- * @param handle     the handle
- * @param session_id the session
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param session_id  the session
  */
 IMS_API int ims_call_hold_call(ims_h handle, int32_t session_id, ims_response_cb callback,
                                void *user_data);
 
 /**
- * @brief Takes a call off hold.
+ * Takes a call off hold.
  *
- * D-Bus: `ResumeCall`, sends `(ii)`: the application id and the session.
+ * D-Bus: `ResumeCall`, sends `(ii)`.
  *
- * @param handle     the handle
- * @param session_id the session
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param session_id  the session
  */
 IMS_API int ims_call_resume_call(ims_h handle, int32_t session_id, ims_response_cb callback,
                                  void *user_data);
 
 /**
- * @brief Swaps the active and the held call.
+ * Swaps the active and the held call.
  *
- * D-Bus: `SwapCall`, sends `(i)`: the application id.
- *
- * @param handle     the handle
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * D-Bus: `SwapCall`, sends `(i)`.
  */
 IMS_API int ims_call_swap_call(ims_h handle, ims_response_cb callback, void *user_data);
 
 /**
- * @brief Asks for a richer kind of call.
+ * Asks for a richer kind of call.
  *
- * D-Bus: `UpgradeCall`, sends `(iii)`: the application id and the record's fields.
+ * D-Bus: `UpgradeCall`, sends `(iii)`.
  *
- * @param handle     the handle
- * @param info       the session and a value
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the session and a value
  */
 IMS_API int ims_call_upgrade_call(ims_h handle, const ims_call_pair_info_s *info,
                                   ims_response_cb callback, void *user_data);
 
 /**
- * @brief Asks for a plainer kind of call.
+ * Asks for a plainer kind of call.
  *
- * D-Bus: `DowngradeCall`, sends `(iii)`: the application id and the record's fields.
+ * D-Bus: `DowngradeCall`, sends `(iii)`.
  *
- * @param handle     the handle
- * @param info       the session and a value
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the session and a value
  */
 IMS_API int ims_call_downgrade_call(ims_h handle, const ims_call_pair_info_s *info,
                                     ims_response_cb callback, void *user_data);
 
 /**
- * @brief Asks for another kind of call.
+ * Asks for another kind of call.
  *
- * D-Bus: `ChangeCall`, sends `(iii)`: the application id and the record's fields; expects `(iis)`:
- * the callback's data is an #ims_call_change_result_s with the other two members.
+ * D-Bus: `ChangeCall`, sends `(iii)`; expects `(iis)`: the callback's data is an
+ * #ims_call_change_result_s with the other two members.
  *
- * @param handle     the handle
- * @param info       the session and a value
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the session and a value
  */
 IMS_API int ims_call_change_call(ims_h handle, const ims_call_pair_info_s *info,
                                  ims_response_cb callback, void *user_data);
 
 /**
- * @brief Accepts the peer's request for another kind of call.
+ * Accepts the peer's request for another kind of call.
  *
- * D-Bus: `AcceptChangeRequest`, sends `(ii)`: the application id and the session.
+ * D-Bus: `AcceptChangeRequest`, sends `(ii)`.
  *
- * @param handle     the handle
- * @param session_id the session
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param session_id  the session
  */
 IMS_API int ims_call_accept_change_request(ims_h handle, int32_t session_id,
                                            ims_response_cb callback, void *user_data);
 
 /**
- * @brief Rejects the peer's request for another kind of call.
+ * Rejects the peer's request for another kind of call.
  *
- * D-Bus: `RejectChangeRequest`, sends `(ii)`: the application id and the session.
+ * D-Bus: `RejectChangeRequest`, sends `(ii)`.
  *
- * @param handle     the handle
- * @param session_id the session
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param session_id  the session
  */
 IMS_API int ims_call_reject_change_request(ims_h handle, int32_t session_id,
                                            ims_response_cb callback, void *user_data);
 
 /**
- * @brief Sends DTMF digits.
+ * Sends DTMF digits.
  *
- * D-Bus: `SendDtmf`, sends `(iis)`: the application id and the record's fields.
+ * D-Bus: `SendDtmf`, sends `(iis)`.
  *
- * @param handle     the handle
- * @param info       the session and the digits
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the session and the digits
  */
 IMS_API int ims_call_send_dtmf(ims_h handle, const ims_call_dtmf_info_s *info,
                                ims_response_cb callback, void *user_data);
 
 /**
- * @brief Starts one DTMF tone.
+ * Starts one DTMF tone.
  *
- * D-Bus: `StartDtmf`, sends `(iiy)`: the application id and the record's fields.
+ * D-Bus: `StartDtmf`, sends `(iiy)`.
  *
- * @param handle     the handle
- * @param info       the session and the tone
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the session and the tone
  */
 IMS_API int ims_call_start_dtmf(ims_h handle, const ims_call_dtmf_tone_s *info,
                                 ims_response_cb callback, void *user_data);
 
 /**
- * @brief Stops the DTMF tone.
+ * Stops the DTMF tone.
  *
- * D-Bus: `StopDtmf`, sends `(ii)`: the application id and the session.
+ * D-Bus: `StopDtmf`, sends `(ii)`.
  *
- * @param handle     the handle
- * @param session_id the session
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param session_id  the session
  */
 IMS_API int ims_call_stop_dtmf(ims_h handle, int32_t session_id, ims_response_cb callback,
                                void *user_data);
 
 /**
- * @brief Starts or stops recording a call's voice.
+ * Starts or stops recording a call's voice.
  *
- * D-Bus: `VoiceRecord`, sends `(iiis)`: the application id and the record's fields.
+ * D-Bus: `VoiceRecord`, sends `(iiis)`.
  *
- * @param handle     the handle
- * @param info       the session and what to do
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the session and what to do
  */
 IMS_API int ims_call_voice_record(ims_h handle, const ims_call_record_info_s *info,
                                   ims_response_cb callback, void *user_data);
 
 /**
- * @brief Sends text telephony bytes.
+ * Sends text telephony bytes.
  *
  * D-Bus: `SendTtyData`, sends `(iis)`: the application id, the session and the bytes as base64.
  *
- * @param handle     the handle
- * @param info       the session and the bytes
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the session and the bytes
  */
 IMS_API int ims_call_send_tty_data(ims_h handle, const ims_call_tty_data_s *info,
                                    ims_response_cb callback, void *user_data);
 
 /**
- * @brief Sets the text telephony mode.
+ * Sets the text telephony mode.
  *
- * D-Bus: `SetTtyMode`, sends `(ii)`: the application id and the mode.
+ * D-Bus: `SetTtyMode`, sends `(ii)`.
  *
- * @param handle     the handle
- * @param mode       the mode, defined by the service
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param mode  the mode, defined by the service
  */
 IMS_API int ims_call_set_tty_mode(ims_h handle, int32_t mode, ims_response_cb callback,
                                   void *user_data);
 
 /**
- * @brief Asks for the text telephony mode.
+ * Asks for the text telephony mode.
  *
  * D-Bus: `GetTtyMode`, sends no parameters; expects `(iiis)`: the callback's data is an
  * #ims_call_tty_mode_s: the second and third member, and the bytes of the base64 text.
- *
- * @param handle     the handle
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
  */
 IMS_API int ims_call_get_tty_mode(ims_h handle, ims_response_cb callback, void *user_data);
 
 /**
- * @brief Asks whether a call is muted.
+ * Asks whether a call is muted.
  *
- * D-Bus: `IsMuted`, sends `(ii)`: the application id and the session; expects `(ib)`: the
- * callback's data is a `bool *`.
+ * D-Bus: `IsMuted`, sends `(ii)`; expects `(ib)`: the callback's data is a `bool *`.
  *
- * @param handle     the handle
- * @param session_id the session
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param session_id  the session
  */
 IMS_API int ims_call_is_muted(ims_h handle, int32_t session_id, ims_response_cb callback,
                               void *user_data);
 
 /**
- * @brief Mutes a call, or unmutes it.
+ * Mutes a call, or unmutes it.
  *
- * D-Bus: `ToggleMute`, sends `(ii)`: the application id and the session.
+ * D-Bus: `ToggleMute`, sends `(ii)`.
  *
- * @param handle     the handle
- * @param session_id the session
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param session_id  the session
  */
 IMS_API int ims_call_toggle_mute(ims_h handle, int32_t session_id, ims_response_cb callback,
                                  void *user_data);
 
 /**
- * @brief Sets a call's speaker mode.
+ * Sets a call's speaker mode.
  *
- * D-Bus: `SetSpeakerMode`, sends `(iii)`: the application id and the record's fields.
+ * D-Bus: `SetSpeakerMode`, sends `(iii)`.
  *
- * @param handle     the handle
- * @param info       the session and the mode
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the session and the mode
  */
 IMS_API int ims_call_set_speaker_mode(ims_h handle, const ims_call_pair_info_s *info,
                                       ims_response_cb callback, void *user_data);
 
 /**
- * @brief Sets a call's volume.
+ * Sets a call's volume.
  *
- * D-Bus: `SetVolume`, sends `(iii)`: the application id and the record's fields.
+ * D-Bus: `SetVolume`, sends `(iii)`.
  *
- * @param handle     the handle
- * @param info       the session and the volume
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the session and the volume
  */
 IMS_API int ims_call_set_volume(ims_h handle, const ims_call_pair_info_s *info,
                                 ims_response_cb callback, void *user_data);
 
 /**
- * @brief Asks for a call's greatest volume.
+ * Asks for a call's greatest volume.
  *
- * D-Bus: `GetMaxVolume`, sends `(ii)`: the application id and the session; expects `(ii)`: the
- * callback's data is an `int32_t *` to the second member, the volume.
+ * D-Bus: `GetMaxVolume`, sends `(ii)`; expects `(ii)`: the callback's data is an `int32_t *` to the
+ * second member, the volume.
  *
- * @param handle     the handle
- * @param session_id the session
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param session_id  the session
  */
 IMS_API int ims_call_get_max_volume(ims_h handle, int32_t session_id, ims_response_cb callback,
                                     void *user_data);
 
 /**
- * @brief Adds a party to a conference.
+ * Adds a party to a conference.
  *
- * D-Bus: `AddUserForConferenceCall`, sends `(iisi)`: the application id and the record's fields.
+ * D-Bus: `AddUserForConferenceCall`, sends `(iisi)`.
  *
- * @param handle     the handle
- * @param info       the session and the party
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the session and the party
  */
 IMS_API int ims_call_add_user_for_conference_call(ims_h handle, const ims_call_conf_user_s *info,
                                                   ims_response_cb callback, void *user_data);
 
 /**
- * @brief Tells that a handover to circuit-switched voice has started.
+ * Tells that a handover to circuit-switched voice has started.
  *
- * D-Bus: `IndicateSrvccHoStarted`, sends `(ii)`: the application id and the value.
+ * D-Bus: `IndicateSrvccHoStarted`, sends `(ii)`.
  *
- * @param handle     the handle
- * @param value      defined by the service
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param value  defined by the service
  */
 IMS_API int ims_call_indicate_srvcc_ho_started(ims_h handle, int32_t value,
                                                ims_response_cb callback, void *user_data);
 
 /**
- * @brief Tells that a handover to circuit-switched voice has failed.
+ * Tells that a handover to circuit-switched voice has failed.
  *
- * D-Bus: `IndicateSrvccHoFailed`, sends `(ii)`: the application id and the value.
+ * D-Bus: `IndicateSrvccHoFailed`, sends `(ii)`.
  *
- * @param handle     the handle
- * @param value      defined by the service
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param value  defined by the service
  */
 IMS_API int ims_call_indicate_srvcc_ho_failed(ims_h handle, int32_t value, ims_response_cb callback,
                                               void *user_data);
 
 /**
- * @brief Sets how incoming calls are responded to by themselves.
+ * Sets how incoming calls are responded to by themselves.
  *
- * D-Bus: `SetAutoResponse`, sends `(iii)`: the application id and the record's fields.
+ * D-Bus: `SetAutoResponse`, sends `(iii)`.
  *
- * @param handle     the handle
- * @param info       two values, defined by the service
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  two values, defined by the service
  */
 IMS_API int ims_call_set_auto_response(ims_h handle, const ims_call_pair_info_s *info,
                                        ims_response_cb callback, void *user_data);
 
 /**
- * @brief Describes the packet data network for emergency calls.
+ * Describes the packet data network for emergency calls.
  *
- * D-Bus: `SetEmergencyPdnInfo`, sends `(isi\@vs)`: the application id, the first text, the count,
- * a variant that holds the texts as `as`, and the last text.
+ * D-Bus: `SetEmergencyPdnInfo`, sends `(isivs)`: the application id, the first text, the count, a
+ * variant that holds the texts as `as`, and the last text.
  *
- * @param handle     the handle
- * @param info       the network
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the network
  */
 IMS_API int ims_call_set_emergency_pdn_info(ims_h handle, const ims_call_emergency_pdn_s *info,
                                             ims_response_cb callback, void *user_data);
 
 /**
- * @brief Registers the emergency packet data network.
+ * Registers the emergency packet data network.
  *
  * D-Bus: `RegisterEmergencyPdn`, sends no parameters.
- *
- * @param handle     the handle
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
  */
 IMS_API int ims_call_register_emergency_pdn(ims_h handle, ims_response_cb callback,
                                             void *user_data);
 
 /**
- * @brief Deregisters the emergency packet data network.
+ * Deregisters the emergency packet data network.
  *
  * D-Bus: `DeregisterEmergencyPdn`, sends no parameters.
- *
- * @param handle     the handle
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
  */
 IMS_API int ims_call_deregister_emergency_pdn(ims_h handle, ims_response_cb callback,
                                               void *user_data);
 
 /**
- * @brief Starts an n-way conference.
+ * Starts an n-way conference.
  *
- * D-Bus: `StartNwayConferenceCall`, sends `(iiii)`: the application id and the record's fields;
- * expects `(ii)`: the callback's data is an `int32_t *` to the second member.
+ * D-Bus: `StartNwayConferenceCall`, sends `(iiii)`; expects `(ii)`: the callback's data is an
+ * `int32_t *` to the second member.
  *
- * @param handle     the handle
- * @param info       the session and two values
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the session and two values
  */
 IMS_API int ims_call_start_nway_conference_call(ims_h handle, const ims_call_id_info_s *info,
                                                 ims_response_cb callback, void *user_data);
 
 /**
- * @brief Merges the active and the held call.
+ * Merges the active and the held call.
  *
- * D-Bus: `MergeCalls`, sends `(i)`: the application id; expects `(ii)`: the callback's data is an
- * `int32_t *` to the second member.
- *
- * @param handle     the handle
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * D-Bus: `MergeCalls`, sends `(i)`; expects `(ii)`: the callback's data is an `int32_t *` to the
+ * second member.
  */
 IMS_API int ims_call_merge_calls(ims_h handle, ims_response_cb callback, void *user_data);
 
 /**
- * @brief Adds a participant to an n-way conference.
+ * Adds a participant to an n-way conference.
  *
- * D-Bus: `AddParticipantToNwayConferenceCall`, sends `(iii)`: the application id and the record's
- * fields.
+ * D-Bus: `AddParticipantToNwayConferenceCall`, sends `(iii)`.
  *
- * @param handle     the handle
- * @param info       the session and a value
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the session and a value
  */
 IMS_API int ims_call_add_participant_to_nway_conference_call(ims_h handle,
                                                              const ims_call_pair_info_s *info,
@@ -833,16 +745,11 @@ IMS_API int ims_call_add_participant_to_nway_conference_call(ims_h handle,
                                                              void *user_data);
 
 /**
- * @brief Removes a participant from an n-way conference.
+ * Removes a participant from an n-way conference.
  *
- * D-Bus: `RemoveParticipantFromNwayConferenceCall`, sends `(iii)`: the application id and the
- * record's fields.
+ * D-Bus: `RemoveParticipantFromNwayConferenceCall`, sends `(iii)`.
  *
- * @param handle     the handle
- * @param info       the session and a value
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the session and a value
  */
 IMS_API int ims_call_remove_participant_from_nway_conference_call(ims_h handle,
                                                                   const ims_call_pair_info_s *info,
@@ -850,79 +757,58 @@ IMS_API int ims_call_remove_participant_from_nway_conference_call(ims_h handle,
                                                                   void *user_data);
 
 /**
- * @brief Asks whether a call runs over the evolved packet data gateway.
+ * Asks whether a call runs over the evolved packet data gateway.
  *
- * D-Bus: `IsInEpdgCall`, sends `(i)`: the application id; expects `(ib)`: the callback's data is a
- * `bool *`.
- *
- * @param handle     the handle
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * D-Bus: `IsInEpdgCall`, sends `(i)`; expects `(ib)`: the callback's data is a `bool *`.
  */
 IMS_API int ims_call_is_in_epdg_call(ims_h handle, ims_response_cb callback, void *user_data);
 
 /**
- * @brief Passes on the cell's service-specific access control values.
+ * Passes on the cell's service-specific access control values.
  *
- * D-Bus: `UpdateSsacInfo`, sends `(iiiiii)`: the application id and the record's fields.
+ * D-Bus: `UpdateSsacInfo`, sends `(iiiiii)`.
  *
- * @param handle     the handle
- * @param info       the values
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the values
  */
 IMS_API int ims_call_update_ssac_info(ims_h handle, const ims_call_ssac_info_s *info,
                                       ims_response_cb callback, void *user_data);
 
 /**
- * @brief Changes the audio path of a call over the evolved packet data gateway.
+ * Changes the audio path of a call over the evolved packet data gateway.
  *
- * D-Bus: `ChangeEpdgAudioPath`, sends `(ii)`: the application id and the value.
+ * D-Bus: `ChangeEpdgAudioPath`, sends `(ii)`.
  *
- * @param handle     the handle
- * @param value      defined by the service
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param value  defined by the service
  */
 IMS_API int ims_call_change_epdg_audio_path(ims_h handle, int32_t value, ims_response_cb callback,
                                             void *user_data);
 
 /**
- * @brief Starts a conference with a list of participants.
+ * Starts a conference with a list of participants.
  *
- * D-Bus: `StartConference`, sends `(ii\@v)`: the record's value, its count, and a variant that
+ * D-Bus: `StartConference`, sends `(iiv)`: the record's value, its count, and a variant that
  * holds the first count participants as `as`; no application id; expects `(ii)`: the callback's
  * data is the second member itself in the pointer's place: `(int)(intptr_t)data`.
  *
- * @param handle     the handle
- * @param info       the conference. Not checked: must not be NULL
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the conference. Not checked: must not be NULL
  */
 IMS_API int ims_call_start_conference(ims_h handle, const ims_call_conference_s *info,
                                       ims_response_cb callback, void *user_data);
 
 /**
- * @brief Changes the participants of a conference.
+ * Changes the participants of a conference.
  *
- * D-Bus: `ModifyParticipantsInConference`, sends `(iii\@v)`: the session, the value, the count,
- * and a variant that holds the first count participants as `as`; no application id; expects
- * `(ii)`: the callback's data is the second member itself in the pointer's place:
- * `(int)(intptr_t)data`.
+ * D-Bus: `ModifyParticipantsInConference`, sends `(iiiv)`: the session, the value, the count, and
+ * a variant that holds the first count participants as `as`; no application id; expects `(ii)`: the
+ * callback's data is the second member itself in the pointer's place: `(int)(intptr_t)data`.
  *
- * @param handle     the handle
- * @param info       the change. Not checked: must not be NULL
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the change. Not checked: must not be NULL
  */
 IMS_API int ims_call_modify_participants_in_conference(ims_h handle,
                                                        const ims_call_conference_modify_s *info,
                                                        ims_response_cb callback, void *user_data);
+
+/** @} */
 
 /** @} */
 

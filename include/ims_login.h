@@ -5,11 +5,40 @@
 #define KELVO_IMS_LOGIN_H
 
 /**
- * @file ims_login.h
+ * @file
  * @brief Logging a user in to the IMS service.
+ */
+
+/**
+ * @defgroup ims_login Login
+ * @brief Logging a user in to the service and out: `org.kelvo.ims.Login`.
  *
- * All methods and signals are on the D-Bus interface `org.kelvo.ims.Login`. The service defines
- * what the values mean; the library passes them through unchanged.
+ * @section ims_login_life The life of a login
+ *
+ * ims_login() asks for it, and its callback says whether the service has taken it up. The login
+ * then goes from state to state; #IMS_NOTI_LOGIN_STATE tells of each, ims_get_login_state() of the
+ * present one. ims_logout() ends it, and the service may. The texts that name and prove the user,
+ * and what the numbers of a state mean, are the service's, see @ref ims_values.
+ *
+ * @code{.c}
+ * #include <ims.h>
+ * #include <stdio.h>
+ *
+ * void on_state(ims_h handle, int noti_id, void *event, void *user_data) {
+ *     const ims_login_state_s *state = event;
+ *     printf("state %d\n", (int)state->value_1);
+ * }
+ *
+ * int log_in(ims_h handle, const char *user, const char *password) {
+ *     int error = ims_set_notification_cb(handle, IMS_NOTI_LOGIN_STATE, on_state, NULL);
+ *     return error == IMS_ERROR_NONE ? ims_login(handle, user, password, 0, NULL, NULL) : error;
+ * }
+ * @endcode
+ *
+ * What all functions share is said in @ref ims_requests and @ref ims_errors. The callbacks' data is
+ * NULL, and the replies are `(i)`, the result, where nothing else is said.
+ *
+ * @{
  */
 
 #include "ims_types.h"
@@ -26,51 +55,38 @@ typedef struct ims_login_state_s {
 } ims_login_state_s;
 
 /**
- * @brief Logs a user in.
+ * Logs a user in.
  *
- * D-Bus: `Login`, sends `(ssii)`: both texts, the value and, last, the application id; expects
- * `(i)`: the result.
+ * D-Bus: `Login`, sends `(ssii)`: both texts, the value and, last, the application id.
  *
- * @param handle     the handle
- * @param text_1     defined by the service; must not be NULL; the library sends an empty text
- * rather than crash
- * @param text_2     defined by the service; must not be NULL; the library sends an empty text
- * rather than crash
- * @param value_1    defined by the service
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param text_1   defined by the service; must not be NULL, for which the library sends an empty
+ *                 text rather than crash
+ * @param text_2   as text_1
+ * @param value_1  defined by the service
  */
 IMS_API int ims_login(ims_h handle, const char *text_1, const char *text_2, int32_t value_1,
                       ims_response_cb callback, void *user_data);
 
 /**
- * @brief Logs the user out.
+ * Logs the user out.
  *
- * D-Bus: `Logout`, sends `(i)`: the application id; expects `(i)`: the result.
- *
- * @param handle     the handle
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * D-Bus: `Logout`, sends `(i)`: the application id.
  */
 IMS_API int ims_logout(ims_h handle, ims_response_cb callback, void *user_data);
 
 /**
- * @brief Reads the login state.
- *
- * Blocks for at most 60 s.
+ * Reads the login state.
  *
  * D-Bus: `GetLoginState`, sends `(ii)`: the value and, second, the application id; expects
  * `(iiui)`: the result and the record's fields.
  *
- * @param      handle   the handle
  * @param      value_1  defined by the service
  * @param[out] state    receives the state. Also written when the service reports a failure;
  *                      otherwise untouched on failure
- * @return see @ref requests
  */
 IMS_API int ims_get_login_state(ims_h handle, int32_t value_1, ims_login_state_s *state);
+
+/** @} */
 
 #ifdef __cplusplus
 }

@@ -460,42 +460,37 @@ typedef struct ims_poc_file_terminated_s {
 /** @} */
 
 /**
- * @brief Places a call.
+ * Places a call.
  *
- * D-Bus: `PocMakeCall`, sends `(bbbsisvvi)`: the record's fields; expects `(ii)`: the result and an
- * integer defined by the service.
+ * The callback's data is a pointer to the second integer of the reply (`int32_t`).
  *
- * @param handle     the handle
- * @param info       the call
- * @param callback   receives the outcome with a pointer to the second integer of the reply
- *                   (`int32_t`) as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * D-Bus: `PocMakeCall`, sends `(bbbsisvvi)`; expects `(ii)`: the result and an integer defined by
+ * the service.
+ *
+ * @param info  the call
  */
 IMS_API int ims_poc_call_make_call(ims_h handle, const ims_poc_make_call_s *info,
                                    ims_response_cb callback, void *user_data);
 
 /**
- * @brief Starts a conference of users who are no group yet.
+ * Starts a conference of users who are no group yet.
  *
  * A count below 1 is refused, whatever the list holds. Of a longer list the first users are sent; a
  * shorter one is sent as it is.
  *
+ * The callback's data is a pointer to the second integer of the reply (`int32_t`).
+ *
  * D-Bus: `PocMakeAdHocConfCall`, sends `(vbvssbibivi)`: the record's fields, the users as an
  * `aa{sv}` inside a `v`; expects `(ii)`: the result and an integer defined by the service.
  *
- * @param handle     the handle
- * @param info       the conference
- * @param callback   receives the outcome with a pointer to the second integer of the reply
- *                   (`int32_t`) as data, or NULL
- * @param user_data  handed to the callback
+ * @param info  the conference
  * @return see @ref requests; #IMS_ERROR_INVALID_PARAMETER also when the count is below 1
  */
 IMS_API int ims_poc_make_ad_hoc_call(ims_h handle, const ims_poc_ad_hoc_call_s *info,
                                      ims_response_cb callback, void *user_data);
 
 /**
- * @brief Adds users to an ad hoc conference.
+ * Adds users to an ad hoc conference.
  *
  * A count below 1 is refused, whatever the list holds. Of a longer list the first users are sent; a
  * shorter one is sent as it is.
@@ -503,17 +498,14 @@ IMS_API int ims_poc_make_ad_hoc_call(ims_h handle, const ims_poc_ad_hoc_call_s *
  * D-Bus: `PocAddUsersToAdHocConfCall`, sends `(iiiviv)`: the record's fields, the users as an
  * `aa{sv}` and the content as an `a{sv}`, each inside a `v`; expects `(i)`: the result.
  *
- * @param handle     the handle
- * @param info       the users
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
+ * @param info  the users
  * @return see @ref requests; #IMS_ERROR_INVALID_PARAMETER also when the count is below 1
  */
 IMS_API int ims_poc_add_users_to_ad_hoc_call(ims_h handle, const ims_poc_users_s *info,
                                              ims_response_cb callback, void *user_data);
 
 /**
- * @brief Removes users from an ad hoc conference.
+ * Removes users from an ad hoc conference.
  *
  * A count below 1 is refused, whatever the list holds. Of a longer list the first users are sent; a
  * shorter one is sent as it is.
@@ -521,353 +513,272 @@ IMS_API int ims_poc_add_users_to_ad_hoc_call(ims_h handle, const ims_poc_users_s
  * D-Bus: `PocRemoveUsersFromAdHocConfCall`, sends `(iiiviv)`: the record's fields, the users as an
  * `aa{sv}` and the content as an `a{sv}`, each inside a `v`; expects `(i)`: the result.
  *
- * @param handle     the handle
- * @param info       the users
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
+ * @param info  the users
  * @return see @ref requests; #IMS_ERROR_INVALID_PARAMETER also when the count is below 1
  */
 IMS_API int ims_poc_remove_users_from_ad_hoc_call(ims_h handle, const ims_poc_users_s *info,
                                                   ims_response_cb callback, void *user_data);
 
 /**
- * @brief Makes a call a crisis call.
+ * Makes a call a crisis call.
  *
- * D-Bus: `PocCallConvertToCrisisCall`, sends `(i)`: the value; expects `(i)`: the result.
+ * D-Bus: `PocCallConvertToCrisisCall`, sends `(i)`.
  *
- * @param handle     the handle
- * @param value      defined by the service; read during the call only
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param value  defined by the service; read during the call only
  */
 IMS_API int ims_poc_call_convert_normal_call_to_crisis_call(ims_h handle, const int32_t *value,
                                                             ims_response_cb callback,
                                                             void *user_data);
 
 /**
- * @brief Answers an incoming call.
+ * Answers an incoming call.
  *
- * D-Bus: `PocAnswerCall`, sends `(bbiivv)`: the record's fields; expects `(i)`: the result.
+ * D-Bus: `PocAnswerCall`, sends `(bbiivv)`.
  *
- * @param handle     the handle
- * @param info       the call and its media
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the call and its media
  */
 IMS_API int ims_poc_call_answer_call(ims_h handle, const ims_poc_call_media_s *info,
                                      ims_response_cb callback, void *user_data);
 
 /**
- * @brief Rejects an incoming call.
+ * Rejects an incoming call.
  *
- * D-Bus: `PocRejectCall`, sends `(ii)`: the record's fields; expects `(i)`: the result.
+ * D-Bus: `PocRejectCall`, sends `(ii)`.
  *
- * @param handle     the handle
- * @param info       defined by the service
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  defined by the service
  */
 IMS_API int ims_poc_call_reject_call(ims_h handle, const ims_poc_value_pair_s *info,
                                      ims_response_cb callback, void *user_data);
 
 /**
- * @brief Ends a call.
+ * Ends a call.
  *
- * D-Bus: `PocEndCall`, sends `(ii)`: the record's fields; expects `(i)`: the result.
+ * D-Bus: `PocEndCall`, sends `(ii)`.
  *
- * @param handle     the handle
- * @param info       defined by the service
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  defined by the service
  */
 IMS_API int ims_poc_call_end_call(ims_h handle, const ims_poc_value_pair_s *info,
                                   ims_response_cb callback, void *user_data);
 
 /**
- * @brief Requests the floor: the right to talk.
+ * Requests the floor: the right to talk.
  *
  * What becomes of the request arrives as an #ims_poc_floor_event_s.
  *
- * D-Bus: `PocRequestFloor`, sends `(iviis)`: the record's fields; expects `(i)`: the result.
+ * D-Bus: `PocRequestFloor`, sends `(iviis)`.
  *
- * @param handle     the handle
- * @param info       the session and the request
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the session and the request
  */
 IMS_API int ims_poc_call_request_floor(ims_h handle, const ims_poc_floor_s *info,
                                        ims_response_cb callback, void *user_data);
 
 /**
- * @brief Releases the floor.
+ * Releases the floor.
  *
  * D-Bus: `PocReleaseFloor`, sends `(iv)`: the session and the set; expects `(i)`: the result.
  *
- * @param handle     the handle
- * @param info       the session and its set; the other fields are not looked at
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the session and its set; the other fields are not looked at
  */
 IMS_API int ims_poc_call_release_floor(ims_h handle, const ims_poc_floor_s *info,
                                        ims_response_cb callback, void *user_data);
 
 /**
- * @brief Asks who has the floor.
+ * Asks who has the floor.
  *
  * A count above #IMS_POC_FLOOR_QUERY_CAPACITY is refused, and so is one so far below 0 that the
  * request would be larger than 16 MiB.
+ *
+ * The callback's data is the first #ims_poc_floor_status_s, NULL when there is none, whatever the
+ * result.
  *
  * D-Bus: `PocRequestFloorStatus`, sends `(v)`: the values as an `ai`; expects `(i\@aa{sv})`: the
  * result and one dictionary a session, of `session_id`, `status`, `participant_count` and
  * `floor_taken_uri`.
  *
- * @param handle     the handle
- * @param query      what to ask for
- * @param callback   receives the outcome with the first #ims_poc_floor_status_s as data, NULL when
- *                   there is none, whatever the result; or NULL
- * @param user_data  handed to the callback
+ * @param query  what to ask for
  * @return see @ref requests; #IMS_ERROR_INVALID_PARAMETER also for a count out of range
  */
 IMS_API int ims_poc_call_request_floor_status(ims_h handle, const ims_poc_floor_query_s *query,
                                               ims_response_cb callback, void *user_data);
 
 /**
- * @brief Asks for other media in a call.
+ * Asks for other media in a call.
  *
- * D-Bus: `PocModifyCall`, sends `(bbiivv)`: the record's fields; expects `(i)`: the result.
+ * D-Bus: `PocModifyCall`, sends `(bbiivv)`.
  *
- * @param handle     the handle
- * @param info       the call and its media
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the call and its media
  */
 IMS_API int ims_poc_modify_call(ims_h handle, const ims_poc_call_media_s *info,
                                 ims_response_cb callback, void *user_data);
 
 /**
- * @brief Accepts the other media that a party asked for.
+ * Accepts the other media that a party asked for.
  *
- * D-Bus: `PocAcceptModifyCall`, sends `(bbiivv)`: the record's fields; expects `(i)`: the result.
+ * D-Bus: `PocAcceptModifyCall`, sends `(bbiivv)`.
  *
- * @param handle     the handle
- * @param info       the call and its media
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the call and its media
  */
 IMS_API int ims_poc_accept_call_modify(ims_h handle, const ims_poc_call_media_s *info,
                                        ims_response_cb callback, void *user_data);
 
 /**
- * @brief Rejects the other media that a party asked for.
+ * Rejects the other media that a party asked for.
  *
- * D-Bus: `PocRejectModifyCall`, sends `(i)`: the value; expects `(i)`: the result.
+ * D-Bus: `PocRejectModifyCall`, sends `(i)`.
  *
- * @param handle     the handle
- * @param value      defined by the service
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param value  defined by the service
  */
 IMS_API int ims_poc_reject_call_modify(ims_h handle, int32_t value, ims_response_cb callback,
                                        void *user_data);
 
 /**
- * @brief Selects a channel.
+ * Selects a channel.
  *
- * D-Bus: `PocSetChannel`, sends `(ii)`: the record's fields; expects `(i)`: the result.
+ * D-Bus: `PocSetChannel`, sends `(ii)`.
  *
- * @param handle     the handle
- * @param info       defined by the service
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  defined by the service
  */
 IMS_API int ims_poc_set_channel(ims_h handle, const ims_poc_value_pair_s *info,
                                 ims_response_cb callback, void *user_data);
 
 /**
- * @brief Starts to record a call.
+ * Starts to record a call.
  *
- * D-Bus: `PocStartCallRecording`, sends `(iiis)`: the record's fields; expects `(i\@a{sv})`: the
- * result and a dictionary of `session_id`, `record_state`, `record_error` and `record_file_path`.
+ * The callback's data is an #ims_poc_recording_info_s, whatever the result.
  *
- * @param handle     the handle
- * @param info       what to record
- * @param callback   receives the outcome with an #ims_poc_recording_info_s as data, whatever the
- *                   result; or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * D-Bus: `PocStartCallRecording`, sends `(iiis)`; expects `(i\@a{sv})`: the result and a dictionary
+ * of `session_id`, `record_state`, `record_error` and `record_file_path`.
+ *
+ * @param info  what to record
  */
 IMS_API int ims_poc_start_call_recording(ims_h handle, const ims_poc_record_request_s *info,
                                          ims_response_cb callback, void *user_data);
 
 /**
- * @brief Pauses a recording.
+ * Pauses a recording.
  *
- * D-Bus: `PocPauseCallRecording`, sends `(i)`: the value; expects `(i)`: the result.
+ * D-Bus: `PocPauseCallRecording`, sends `(i)`.
  *
- * @param handle     the handle
- * @param value      defined by the service
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param value  defined by the service
  */
 IMS_API int ims_poc_pause_call_recording(ims_h handle, int32_t value, ims_response_cb callback,
                                          void *user_data);
 
 /**
- * @brief Resumes a paused recording.
+ * Resumes a paused recording.
  *
- * D-Bus: `PocResumeCallRecording`, sends `(i)`: the value; expects `(i)`: the result.
+ * D-Bus: `PocResumeCallRecording`, sends `(i)`.
  *
- * @param handle     the handle
- * @param value      defined by the service
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param value  defined by the service
  */
 IMS_API int ims_poc_resume_call_recording(ims_h handle, int32_t value, ims_response_cb callback,
                                           void *user_data);
 
 /**
- * @brief Ends a recording.
+ * Ends a recording.
  *
- * D-Bus: `PocStopCallRecording`, sends `(i)`: the value; expects `(i)`: the result.
+ * D-Bus: `PocStopCallRecording`, sends `(i)`.
  *
- * @param handle     the handle
- * @param value      defined by the service
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param value  defined by the service
  */
 IMS_API int ims_poc_stop_call_recording(ims_h handle, int32_t value, ims_response_cb callback,
                                         void *user_data);
 
 /**
- * @brief Ends a recording of which nothing is to stay.
+ * Ends a recording of which nothing is to stay.
  *
- * D-Bus: `PocCancelCallRecording`, sends `(i)`: the value; expects `(i)`: the result.
+ * D-Bus: `PocCancelCallRecording`, sends `(i)`.
  *
- * @param handle     the handle
- * @param value      defined by the service
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param value  defined by the service
  */
 IMS_API int ims_poc_cancel_call_recording(ims_h handle, int32_t value, ims_response_cb callback,
                                           void *user_data);
 
 /**
- * @brief Sends a message.
+ * Sends a message.
+ *
+ * The callback's data is an #ims_poc_msg_result_s.
  *
  * D-Bus: `PocSendMsg`, sends `(isvissivi)`: the record's fields, the targets as an `aa{sv}` and the
  * originator as an `a{sv}`, each inside a `v`; expects `(iiii)`: the result and three integers.
  *
- * @param handle     the handle
- * @param message    the message
- * @param callback   receives the outcome with an #ims_poc_msg_result_s as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param message  the message
  */
 IMS_API int ims_poc_send_msg(ims_h handle, const ims_poc_message_s *message,
                              ims_response_cb callback, void *user_data);
 
 /**
- * @brief Tells that a received message was delivered or read.
+ * Tells that a received message was delivered or read.
+ *
+ * The callback's data is an #ims_poc_msg_result_s.
  *
  * D-Bus: `PocSendReceivedMsgNoti`, sends `(isvvsi)`: the record's fields, the originator as an
  * `a{sv}` and the parties as an `aa{sv}`, each inside a `v`; expects `(iiii)`: the result and three
  * integers.
  *
- * @param handle        the handle
  * @param notification  the notice
- * @param callback      receives the outcome with an #ims_poc_msg_result_s as data, or NULL
- * @param user_data     handed to the callback
- * @return see @ref requests
  */
 IMS_API int ims_poc_send_received_msg_notification(ims_h handle,
                                                    const ims_poc_msg_notification_s *notification,
                                                    ims_response_cb callback, void *user_data);
 
 /**
- * @brief Offers a file.
+ * Offers a file.
+ *
+ * The callback's data is an #ims_poc_transfer_result_s.
  *
  * D-Bus: `PocTransferFile`, sends `(ivvv)`: the record's fields, the targets as an `aa{sv}`, the
  * attributes and the originator as an `a{sv}`, each inside a `v`; expects `(iii)`: the result and
  * two integers.
  *
- * @param handle     the handle
- * @param transfer   the file
- * @param callback   receives the outcome with an #ims_poc_transfer_result_s as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param transfer  the file
  */
 IMS_API int ims_poc_transfer_file(ims_h handle, const ims_poc_file_transfer_s *transfer,
                                   ims_response_cb callback, void *user_data);
 
 /**
- * @brief Accepts a file that is offered.
+ * Accepts a file that is offered.
  *
- * D-Bus: `PocAcceptFileTransfer`, sends `(is)`: the record's fields; expects `(iii)`: the result
- * and two integers.
+ * The callback's data is an #ims_poc_transfer_result_s.
  *
- * @param handle     the handle
- * @param answer     the transfer
- * @param callback   receives the outcome with an #ims_poc_transfer_result_s as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * D-Bus: `PocAcceptFileTransfer`, sends `(is)`; expects `(iii)`: the result and two integers.
+ *
+ * @param answer  the transfer
  */
 IMS_API int ims_poc_accept_file_transfer(ims_h handle, const ims_poc_transfer_answer_s *answer,
                                          ims_response_cb callback, void *user_data);
 
 /**
- * @brief Rejects a file that is offered.
+ * Rejects a file that is offered.
  *
- * D-Bus: `PocARejectFileTransfer`, spelled so, sends `(is)`: the record's fields; expects `(iii)`:
- * the result and two integers.
+ * The callback's data is an #ims_poc_transfer_result_s.
  *
- * @param handle     the handle
- * @param answer     the transfer
- * @param callback   receives the outcome with an #ims_poc_transfer_result_s as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * D-Bus: `PocARejectFileTransfer`, spelled so, sends `(is)`; expects `(iii)`: the result and two
+ * integers.
+ *
+ * @param answer  the transfer
  */
 IMS_API int ims_poc_reject_file_transfer(ims_h handle, const ims_poc_transfer_answer_s *answer,
                                          ims_response_cb callback, void *user_data);
 
 /**
- * @brief Ends a file transfer before its time.
+ * Ends a file transfer before its time.
  *
- * D-Bus: `PocCancelFileTransfer`, sends `(i)`: the value; expects `(iii)`: the result and two
- * integers.
+ * The callback's data is an #ims_poc_transfer_result_s.
  *
- * @param handle     the handle
- * @param value      defined by the service
- * @param callback   receives the outcome with an #ims_poc_transfer_result_s as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * D-Bus: `PocCancelFileTransfer`, sends `(i)`; expects `(iii)`: the result and two integers.
+ *
+ * @param value  defined by the service
  */
 IMS_API int ims_poc_cancel_file_transfer(ims_h handle, int32_t value, ims_response_cb callback,
                                          void *user_data);
 
 /**
- * @brief Keeps a session alive.
+ * Keeps a session alive.
  *
- * D-Bus: `PocSendKeepAlive`, sends `(i)`: the value; expects `(i)`: the result.
+ * D-Bus: `PocSendKeepAlive`, sends `(i)`.
  *
- * @param handle     the handle
- * @param value      defined by the service
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param value  defined by the service
  */
 IMS_API int ims_poc_send_keep_alive(ims_h handle, int32_t value, ims_response_cb callback,
                                     void *user_data);

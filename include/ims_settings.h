@@ -5,15 +5,62 @@
 #define KELVO_IMS_SETTINGS_H
 
 /**
- * @file ims_settings.h
+ * @file
  * @brief The service's global settings sets, its registration profiles and its network environment.
+ */
+
+/**
+ * @defgroup ims_settings Settings and profiles
+ * @brief Global settings sets, registration profiles, network environment:
+ * `org.kelvo.ims.Settings`.
  *
- * All methods are on the D-Bus interface `org.kelvo.ims.Settings`; none of them carries the
- * application id. The service defines what the values mean, their units and ranges; the library
- * passes them through unchanged.
+ * @section ims_settings_life The life of a set and of a profile
+ *
+ * The service keeps sets of global settings, each known by its name, and registration profiles,
+ * each known by its id; a profile names the set that goes with it in `globalSettings`. They outlive
+ * applications. To change one, read it, change fields and write it back; all fields are written.
+ * There are no events: who wants to know, asks again.
+ *
+ * @code{.c}
+ * #include <ims.h>
+ * #include <stdlib.h>
+ *
+ * int let_it_ring(ims_h handle, const char *name, int32_t ringing_timer) {
+ *     ims_global_settings_s *set = calloc(1, sizeof *set); // zeroed before its first use
+ *     if (set == NULL)
+ *         return IMS_ERROR_OPERATION_FAILED;
+ *     int error = ims_get_global_settings_info(handle, name, set);
+ *     if (error == IMS_ERROR_NONE) {
+ *         set->ringing_timer = ringing_timer;
+ *         error = ims_update_global_settings(handle, set, NULL, NULL); // read now, not later
+ *     }
+ *     ims_global_settings_clear(set);
+ *     free(set);
+ *     return error;
+ * }
+ * @endcode
  *
  * A set or a profile crosses the bus as one dictionary `a{sv}`, whose keys are the names of the
- * fields: `int32_t` as `i`, `bool` as `b`, `char *` as `s`.
+ * fields: `int32_t` as `i`, `bool` as `b`, `char *` as `s`. The service defines what the values
+ * mean, their units and ranges, see @ref ims_values.
+ *
+ * What all functions share is said in @ref ims_requests and @ref ims_errors. None of the methods
+ * carries the application id. The reply to a request is `(i)`, the result, and its callback's data
+ * is NULL.
+ *
+ * @section ims_settings_records Records
+ *
+ * To be read: zero a record before its first use. A key that the service leaves out, or whose value
+ * has another type, leaves its field as the caller had it; a key that no field is named after is
+ * skipped. Every text that the service sends is a copy that the caller owns; a text that a field
+ * held before is overwritten, not freed. The clear functions free the texts of a record, those of a
+ * list also behind its count, and zero it whole; they need no handle and no IMS feature, and NULL
+ * does nothing.
+ *
+ * To be written: the record is the caller's and read during the call only. No text may be NULL:
+ * that is an invalid parameter.
+ *
+ * @{
  */
 
 #include "ims_types.h"
@@ -30,17 +77,16 @@ typedef struct ims_settings_timer_s {
 } ims_settings_timer_s;
 
 /**
- * One named set of global settings.
- *
- * To be read: zero it before its first use; every text that the service sends is a copy that the
- * caller owns, and ims_global_settings_clear() releases it. To be written: no text may be NULL;
- * the record is read during the call only.
+ * One named set of global settings; ims_global_settings_clear() releases it. See
+ * @ref ims_settings_records.
  *
  * Written and read back, a set keeps its values, with two exceptions that the service counts on:
  * `audio_port_end` and `is_enable_srtp` are read but never written.
  */
 typedef struct ims_global_settings_s {
-    /* Identity and presence */
+    /** @name Identity and presence
+     * @{ */
+    /** The key of this name. */
     int32_t id;
     char *name;
     char *network;
@@ -74,8 +120,11 @@ typedef struct ims_global_settings_s {
     int32_t publish_err_retry;
     int32_t poll_list_sub_expiry;
     int32_t subscribe_max_entry;
+    /** @} */
 
-    /* Access to the XDM document server */
+    /** @name Access to the XDM document server
+     * @{ */
+    /** The key of this name. */
     int32_t xdm_enable;
     char *http_user_name;
     char *http_password;
@@ -90,8 +139,11 @@ typedef struct ims_global_settings_s {
     char *bsf_ip;
     char *bsf_port;
     int32_t enable_gba;
+    /** @} */
 
-    /* Session, SIP and registration timers */
+    /** @name Session, SIP and registration timers
+     * @{ */
+    /** The key of this name. */
     char *conf_uri;
     char *conf_subscribe;
     char *conf_dialog_type;
@@ -116,8 +168,11 @@ typedef struct ims_global_settings_s {
     int32_t sip_mobility;
     int32_t session_refresh_method;
     char *smsc_psi;
+    /** @} */
 
-    /* Media */
+    /** @name Media
+     * @{ */
+    /** The key of this name. */
     int32_t rtp_timeout;
     int32_t rtcp_timeout;
     int32_t enable_cp_autio_path;
@@ -167,8 +222,11 @@ typedef struct ims_global_settings_s {
     char *enable_bwm;
     char *enable_bwm_default;
     int32_t rtp_keep_alive;
+    /** @} */
 
-    /* Media for B2B push-to-talk */
+    /** @name Media for B2B push-to-talk
+     * @{ */
+    /** The key of this name. */
     int32_t rtp_timeout_B2BPTT;
     int32_t rtcp_timeout_B2BPTT;
     int32_t enable_cp_autio_path_B2BPTT;
@@ -218,8 +276,11 @@ typedef struct ims_global_settings_s {
     char *enable_bwm_B2BPTT;
     char *enable_bwm_default_B2BPTT;
     int32_t rtp_keep_alive_B2BPTT;
+    /** @} */
 
-    /* Access to the XDM document server for B2B push-to-talk */
+    /** @name Access to the XDM document server for B2B push-to-talk
+     * @{ */
+    /** The key of this name. */
     int32_t xdm_enable_b2ptt;
     char *http_user_name_b2ptt;
     char *http_password_b2ptt;
@@ -234,8 +295,11 @@ typedef struct ims_global_settings_s {
     char *bsf_ip_b2ptt;
     char *bsf_port_b2ptt;
     int32_t enable_gba_b2ptt;
+    /** @} */
 
-    /* Access to the XDM document server for mission critical push-to-talk */
+    /** @name Access to the XDM document server for mission critical push-to-talk
+     * @{ */
+    /** The key of this name. */
     int32_t xdm_enable_mcptt;
     char *http_user_name_mcptt;
     char *http_password_mcptt;
@@ -250,8 +314,11 @@ typedef struct ims_global_settings_s {
     char *bsf_ip_mcptt;
     char *bsf_port_mcptt;
     int32_t enable_gba_mcptt;
+    /** @} */
 
-    /* Media for mission critical push-to-talk */
+    /** @name Media for mission critical push-to-talk
+     * @{ */
+    /** The key of this name. */
     int32_t rtp_timeout_MCPTT;
     int32_t rtcp_timeout_MCPTT;
     int32_t enable_cp_autio_path_MCPTT;
@@ -301,8 +368,11 @@ typedef struct ims_global_settings_s {
     char *enable_bwm_MCPTT;
     char *enable_bwm_default_MCPTT;
     int32_t rtp_keep_alive_MCPTT;
+    /** @} */
 
-    /* Operator, device management, logging and push-to-talk timers */
+    /** @name Operator, device management, logging and push-to-talk timers
+     * @{ */
+    /** The key of this name. */
     bool support_ims_in_roaming;
     bool is_volte_enabled;
     bool is_lvc_enabled;
@@ -391,13 +461,16 @@ typedef struct ims_global_settings_s {
     ims_settings_timer_s poc_ringing_timer;
     ims_settings_timer_s poc_invite_timeout;
     char *conference_factory_uri;
+    /** @} */
 } ims_global_settings_s;
 
 /**
- * One registration profile. Ownership as with #ims_global_settings_s; ims_profile_clear() releases
- * it.
+ * One registration profile; ims_profile_clear() releases it. See @ref ims_settings_records.
  */
 typedef struct ims_profile_s {
+    /** @name The keys
+     * @{ */
+    /** The key of this name. */
     int32_t id;
     int32_t enabled;
     char *name;
@@ -449,6 +522,7 @@ typedef struct ims_profile_s {
     int32_t vtSupported;
     int32_t volteSupported;
     int32_t network_environment_type;
+    /** @} */
 } ims_profile_s;
 
 /** How many profiles an #ims_profile_list_s holds. */
@@ -461,181 +535,139 @@ typedef struct ims_profile_list_s {
 } ims_profile_list_s;
 
 /**
- * @brief Reads a set of global settings.
+ * Reads a set of global settings.
  *
- * Blocks for at most 60 s. A key that the service leaves out, or whose value has another type,
- * leaves its field as the caller had it; a key that no field is named after is skipped.
+ * D-Bus: `GetGlobalSettings`, sends `(s)`: the name; expects `(ia{sv})`: the result and the set.
  *
- * D-Bus: `GetGlobalSettings`, sends `(s)`: the name; expects `(i\@a{sv})`: the result and the set.
- *
- * @param         handle    the handle
  * @param         name      the set's name; NULL is sent as an empty text
- * @param[in,out] settings  receives the set; untouched on failure. A text that a field held before
- *                          is overwritten, not freed
- * @return see @ref requests
+ * @param[in,out] settings  receives the set; untouched on failure
  */
 IMS_API int ims_get_global_settings_info(ims_h handle, const char *name,
                                          ims_global_settings_s *settings);
 
 /**
- * @brief Changes a set of global settings.
+ * Changes a set of global settings.
  *
- * D-Bus: `UpdateGlobalSettings`, sends `(\@a{sv})`: all fields in the order of their declaration,
+ * D-Bus: `UpdateGlobalSettings`, sends `(a{sv})`: all fields in the order of their declaration,
  * where `audio_port_start` and `is_avpf_enabled` are sent a second time in the place of
- * `audio_port_end` and `is_enable_srtp`; expects `(i)`: the result.
+ * `audio_port_end` and `is_enable_srtp`.
  *
- * @param handle     the handle
- * @param settings   the set, addressed by its name. A NULL text is an invalid parameter
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param settings  the set, addressed by its name
  */
 IMS_API int ims_update_global_settings(ims_h handle, const ims_global_settings_s *settings,
                                        ims_response_cb callback, void *user_data);
 
 /**
- * @brief Adds a set of global settings.
+ * Adds a set of global settings.
  *
- * D-Bus: `AddGlobalSettings`, sends `(\@a{sv})` as ims_update_global_settings() does, except that
- * `is_enable_emm_MCPTT` goes as `s`: its number as decimal text; expects `(i)`: the result.
+ * D-Bus: `AddGlobalSettings`, sends `(a{sv})` as ims_update_global_settings() does, except that
+ * `is_enable_emm_MCPTT` goes as `s`: its number as decimal text.
  *
- * @param handle     the handle
- * @param settings   the set. A NULL text is an invalid parameter
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param settings  the set
  */
 IMS_API int ims_add_global_settings(ims_h handle, const ims_global_settings_s *settings,
                                     ims_response_cb callback, void *user_data);
 
 /**
- * @brief Deletes a set of global settings.
+ * Deletes a set of global settings.
  *
- * D-Bus: `DeleteGlobalSettings`, sends `(s)`: the set's name; expects `(i)`: the result.
+ * D-Bus: `DeleteGlobalSettings`, sends `(s)`: the set's name.
  *
- * @param handle     the handle
- * @param settings   the set, of which the name is used; a NULL name is sent as an empty text. Not
- *                   checked: must not be NULL
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param settings  the set, of which the name is used; a NULL name is sent as an empty text. Not
+ *                  checked: must not be NULL
  */
 IMS_API int ims_delete_global_settings(ims_h handle, const ims_global_settings_s *settings,
                                        ims_response_cb callback, void *user_data);
 
 /**
- * @brief Frees the texts of a set and zeroes the whole record. Needs no handle and no IMS feature.
+ * Frees the texts of a set and zeroes it.
  *
- * @param settings  a set that was zeroed before its first use and whose texts free() may release;
- *                  NULL does nothing
+ * @param settings  a set that was zeroed before its first use and whose texts free() may release
  */
 IMS_API void ims_global_settings_clear(ims_global_settings_s *settings);
 
 /**
- * @brief Reads the list of profiles.
+ * Reads the list of profiles.
  *
- * Blocks for at most 60 s. A list that is empty, or whose count is not the number of entries that
+ * A list that is empty, or whose count is not the number of entries that
  * came, is reported as success with @p list->count 0. Of more than #IMS_PROFILE_LIST_CAPACITY
- * profiles the first ones are kept. Fields are filled as by ims_get_global_settings_info().
+ * profiles the first ones are kept.
  *
- * D-Bus: `GetProfileList`, sends no parameters; expects `(iu\@aa{sv})`: the result, the count and
+ * D-Bus: `GetProfileList`, sends no parameters; expects `(iuaa{sv})`: the result, the count and
  * one dictionary a profile.
  *
- * @param         handle  the handle
- * @param[in,out] list    receives the profiles. On a failure of the service itself, its count is
- *                        the reply's and no profile was written; otherwise untouched on failure
- * @return see @ref requests
+ * @param[in,out] list  receives the profiles. On a failure of the service itself, its count is the
+ *                      reply's and no profile was written; otherwise untouched on failure
  */
 IMS_API int ims_get_profile_list_info(ims_h handle, ims_profile_list_s *list);
 
 /**
- * @brief Changes a profile.
+ * Changes a profile.
  *
- * D-Bus: `UpdateProfile`, sends `(\@a{sv})`: all fields in the order of their declaration; expects
- * `(i)`: the result.
+ * D-Bus: `UpdateProfile`, sends `(a{sv})`: all fields in the order of their declaration.
  *
- * @param handle     the handle
- * @param profile    the profile. A NULL text is an invalid parameter
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param profile  the profile
  */
 IMS_API int ims_update_profile(ims_h handle, const ims_profile_s *profile, ims_response_cb callback,
                                void *user_data);
 
 /**
- * @brief Adds a profile.
+ * Adds a profile.
  *
- * D-Bus: `AddProfile`, sends `(\@a{sv})`: all fields in the order of their declaration; expects
- * `(i)`: the result.
+ * D-Bus: `AddProfile`, sends `(a{sv})`: all fields in the order of their declaration.
  *
- * @param handle     the handle
- * @param profile    the profile. A NULL text is an invalid parameter
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param profile  the profile
  */
 IMS_API int ims_add_profile(ims_h handle, const ims_profile_s *profile, ims_response_cb callback,
                             void *user_data);
 
 /**
- * @brief Deletes a profile.
+ * Deletes a profile.
  *
- * D-Bus: `DeleteProfile`, sends `(i)`: the profile's id; expects `(i)`: the result.
+ * D-Bus: `DeleteProfile`, sends `(i)`: the profile's id.
  *
- * @param handle     the handle
- * @param profile    the profile, of which the id is used. Not checked: must not be NULL
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param profile  the profile, of which the id is used. Not checked: must not be NULL
  */
 IMS_API int ims_delete_profile(ims_h handle, const ims_profile_s *profile, ims_response_cb callback,
                                void *user_data);
 
 /**
- * @brief Frees the texts of a profile and zeroes the whole record. Needs no handle and no IMS
- * feature.
+ * Frees the texts of a profile and zeroes it.
  *
- * @param profile  a profile that was zeroed before its first use and whose texts free() may
- *                 release; NULL does nothing
+ * @param profile  a profile that was zeroed before its first use and whose texts free() may release
  */
 IMS_API void ims_profile_clear(ims_profile_s *profile);
 
 /**
- * @brief Frees the texts of every profile in a list, also behind its count, and zeroes the whole
- * record. Needs no handle and no IMS feature.
+ * Frees the texts of every profile in a list and zeroes it.
  *
- * @param list  a list that was zeroed before its first use; NULL does nothing
+ * @param list  a list that was zeroed before its first use
  */
 IMS_API void ims_profile_list_clear(ims_profile_list_s *list);
 
 /**
- * @brief Sets the network environment.
+ * Sets the network environment.
  *
- * D-Bus: `SetNetworkEnvironment`, sends `(i)`: the type; expects `(i)`: the result.
+ * D-Bus: `SetNetworkEnvironment`, sends `(i)`: the type.
  *
- * @param handle            the handle
  * @param environment_type  the type
- * @param callback          receives the outcome with NULL as data, or NULL
- * @param user_data         handed to the callback
- * @return see @ref requests
  */
 IMS_API int ims_set_network_environment(ims_h handle, int32_t environment_type,
                                         ims_response_cb callback, void *user_data);
 
 /**
- * @brief Reads the network environment.
+ * Reads the network environment.
  *
- * Blocks for at most 60 s. The service's own result is not looked at: whatever it is, the type that
+ * The service's own result is not looked at: whatever it is, the type that
  * came with it is stored.
  *
  * D-Bus: `GetNetworkEnvironment`, sends no parameters; expects `(ii)`: the result and the type.
  *
- * @param      handle            the handle
  * @param[out] environment_type  receives the type; untouched on failure
- * @return see @ref requests
  */
 IMS_API int ims_get_network_environment(ims_h handle, int32_t *environment_type);
+
+/** @} */
 
 #ifdef __cplusplus
 }

@@ -5,12 +5,48 @@
 #define KELVO_IMS_SMS_H
 
 /**
- * @file ims_sms.h
+ * @file
  * @brief Short messages over IMS.
+ */
+
+/**
+ * @defgroup ims_sms Short messages
+ * @brief Messages as TPDUs, their acknowledgements and reports: `org.kelvo.ims.Sms`.
  *
- * All methods and signals are on the D-Bus interface `org.kelvo.ims.Sms`. The library encodes no
- * messages: an application hands over a ready TPDU (3GPP TS 23.040) and receives TPDUs. The service
- * defines what the other values mean; the library passes them through unchanged.
+ * The library encodes no messages: an application hands over a ready TPDU (3GPP TS 23.040) and
+ * receives TPDUs. On the bus they are base64.
+ *
+ * @section ims_sms_life The life of a message
+ *
+ * ims_sms_send_sms() hands an SMS-SUBMIT to the service, whose result comes with the callback. What
+ * the network makes of it comes later, as #IMS_NOTI_SMS_SEND_SMS_ACK.
+ *
+ * A message that comes in is an #IMS_NOTI_SMS_INCOMING_SMS. The application stores it and says so,
+ * or why not, with ims_sms_send_deliver_report(); #IMS_NOTI_SMS_DELIVERY_REPORT_ACK tells that the
+ * report has arrived. To the network, a message that is not reported on has not arrived; how long
+ * it waits is its own affair.
+ *
+ * @code{.c}
+ * #include <ims.h>
+ *
+ * // "Hi" to +15550199, as an SMS-SUBMIT without a validity period
+ * int send_hi(ims_h handle) {
+ *     const uint8_t tpdu[] = {0x01, 0x00, 8,    0x91, 0x51, 0x55, 0x10,
+ *                             0x99, 0x00, 0x00, 2,    0xC8, 0x34};
+ *     uint8_t centre[] = {8, 0x91, 0x51, 0x55, 0x00, 0x00}; // +15550000; its first byte changes
+ *     const ims_sms_send_info_s message = {
+ *         .tpdu = tpdu, .tpdu_length = sizeof tpdu, .sca = centre, .send_option = 0};
+ *     return ims_sms_send_sms(handle, &message, NULL, NULL);
+ * }
+ * @endcode
+ *
+ * What all requests share is said in @ref ims_requests and @ref ims_errors; the values in the
+ * records are the service's, see @ref ims_values. Request records are the caller's and read during
+ * the call only; event records are valid while the callback runs, with the bytes in them. The
+ * callbacks' data is NULL. Both methods reply `(iiii)`: the result, and three members that are not
+ * used.
+ *
+ * @{
  */
 
 #include "ims_types.h"
@@ -66,36 +102,28 @@ typedef struct ims_sms_delivery_report_ack_s {
 } ims_sms_delivery_report_ack_s;
 
 /**
- * @brief Sends a short message.
+ * Sends a short message.
  *
  * D-Bus: `SendSms`, sends `(isisi)`: the application id, the TPDU as base64, its length as stored,
- * the service centre's address as base64, and the option; expects `(iiii)`: the result, and three
- * members that are not used.
+ * the service centre's address as base64, and the option.
  *
- * @param handle     the handle
- * @param info       the message. The first byte of its sca is rewritten and stays so
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the message. The first byte of its sca is rewritten and stays so
  */
 IMS_API int ims_sms_send_sms(ims_h handle, const ims_sms_send_info_s *info,
                              ims_response_cb callback, void *user_data);
 
 /**
- * @brief Sends the report on a received message.
+ * Sends the report on a received message.
  *
  * D-Bus: `SendDeliverReport`, sends `(iisii)`: the application id, the code, the TPDU as base64,
- * its length as stored, and the option; expects `(iiii)`: the result, and three members that are
- * not used.
+ * its length as stored, and the option.
  *
- * @param handle     the handle
- * @param report     the report
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param report  the report
  */
 IMS_API int ims_sms_send_deliver_report(ims_h handle, const ims_sms_deliver_report_s *report,
                                         ims_response_cb callback, void *user_data);
+
+/** @} */
 
 #ifdef __cplusplus
 }

@@ -5,11 +5,50 @@
 #define KELVO_IMS_SS_H
 
 /**
- * @file ims_ss.h
+ * @file
  * @brief Supplementary services: call waiting, forwarding and barring.
+ */
+
+/**
+ * @defgroup ims_ss Supplementary services
+ * @brief Call waiting, call forwarding and call barring: `org.kelvo.ims.Ss`.
  *
- * All methods are on the D-Bus interface `org.kelvo.ims.Ss`. The service defines what classes,
- * statuses and types mean; the library passes them through unchanged.
+ * @section ims_ss_life The life of a setting
+ *
+ * What is set is kept by the network for the subscription, and acts on its calls whether or not an
+ * application runs. A set request changes it; its callback says whether the network has. A get
+ * request asks for it: the callback receives a list, an entry for each service class that is
+ * told of. There are no events.
+ *
+ * @code{.c}
+ * #include <ims.h>
+ * #include <stdio.h>
+ *
+ * void on_forwarding(ims_h handle, int result, void *data, void *user_data) {
+ *     const ims_ss_status_list_s *list = data; // gone after this function
+ *     for (uint32_t i = 0; list != NULL && i < list->count; ++i) {
+ *         const ims_ss_cf_info_s *entry = &list->entries.call_forwarding[i];
+ *         printf("class %d: status %d, to %s\n", (int)entry->ss_class, (int)entry->ss_status,
+ *                entry->cf_uri != NULL ? entry->cf_uri : "nobody");
+ *     }
+ * }
+ *
+ * int ask(ims_h handle, int32_t ss_class, int32_t condition) {
+ *     const ims_ss_query_s query = {.ss_class = ss_class, .type = condition};
+ *     return ims_ss_get_call_forwarding(handle, &query, on_forwarding, NULL);
+ * }
+ * @endcode
+ *
+ * What all requests share is said in @ref ims_requests and @ref ims_errors; classes, statuses and
+ * types are the service's, see @ref ims_values. Request records are the caller's and read during
+ * the call only.
+ *
+ * Sent are the application id and then the argument, or the record's fields in their order. A set
+ * request's reply is `(i)`, the result, and its callback's data is NULL. That of a get request is
+ * `(iuaa{sv})`: the result, the count and one dictionary an entry, of the fields' names; its
+ * callback's data is an #ims_ss_status_list_s, NULL when the result is not 0.
+ *
+ * @{
  */
 
 #include "ims_types.h"
@@ -74,97 +113,68 @@ typedef struct ims_ss_status_list_s {
 } ims_ss_status_list_s;
 
 /**
- * @brief Sets call waiting.
+ * Sets call waiting.
  *
- * D-Bus: `SetCallWaiting`, sends `(iii)`: the application id and the record's fields; expects
- * `(i)`: the result.
+ * D-Bus: `SetCallWaiting`, sends `(iii)`.
  *
- * @param handle     the handle. Not checked: must not be NULL
- * @param info       what to set. Not checked: must not be NULL
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param handle  not checked: must not be NULL
+ * @param info    what to set. Not checked: must not be NULL
  */
 IMS_API int ims_ss_set_call_waiting(ims_h handle, const ims_ss_cw_info_s *info,
                                     ims_response_cb callback, void *user_data);
 
 /**
- * @brief Asks what is set for call waiting.
+ * Asks what is set for call waiting.
  *
- * D-Bus: `GetCallWaiting`, sends `(ii)`: the application id and the class; expects `(iu\@aa{sv})`:
- * the result, the count and one dictionary an entry.
+ * D-Bus: `GetCallWaiting`, sends `(ii)`.
  *
- * @param handle     the handle. Not checked: must not be NULL
- * @param ss_class   the service class
- * @param callback   receives the outcome with an #ims_ss_status_list_s as data, NULL when the
- *                   result is not 0; or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param handle    not checked: must not be NULL
+ * @param ss_class  the service class
  */
 IMS_API int ims_ss_get_call_waiting(ims_h handle, int32_t ss_class, ims_response_cb callback,
                                     void *user_data);
 
 /**
- * @brief Sets call forwarding.
+ * Sets call forwarding.
  *
- * D-Bus: `SetCallForwarding`, sends `(iiiiiiis)`: the application id and the record's fields;
- * expects `(i)`: the result.
+ * D-Bus: `SetCallForwarding`, sends `(iiiiiiis)`.
  *
- * @param handle     the handle
- * @param info       what to set
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  what to set
  */
 IMS_API int ims_ss_set_call_forwarding(ims_h handle, const ims_ss_cf_info_s *info,
                                        ims_response_cb callback, void *user_data);
 
 /**
- * @brief Asks what is set for call forwarding.
+ * Asks what is set for call forwarding.
  *
- * D-Bus: `GetCallForwarding`, sends `(iii)`: the application id and the record's fields; expects
- * `(iu\@aa{sv})`: the result, the count and one dictionary an entry.
+ * D-Bus: `GetCallForwarding`, sends `(iii)`.
  *
- * @param handle     the handle
- * @param query      what to ask for
- * @param callback   receives the outcome with an #ims_ss_status_list_s as data, NULL when the
- *                   result is not 0; or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param query  what to ask for
  */
 IMS_API int ims_ss_get_call_forwarding(ims_h handle, const ims_ss_query_s *query,
                                        ims_response_cb callback, void *user_data);
 
 /**
- * @brief Sets call barring.
+ * Sets call barring.
  *
- * D-Bus: `SetCallBarring`, sends `(iiiis)`: the application id and the record's fields; expects
- * `(i)`: the result.
+ * D-Bus: `SetCallBarring`, sends `(iiiis)`.
  *
- * @param handle     the handle
- * @param info       what to set, with the password
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  what to set, with the password
  */
 IMS_API int ims_ss_set_call_barring(ims_h handle, const ims_ss_cb_set_s *info,
                                     ims_response_cb callback, void *user_data);
 
 /**
- * @brief Asks what is set for call barring.
+ * Asks what is set for call barring.
  *
- * D-Bus: `GetCallBarring`, sends `(iii)`: the application id and the record's fields; expects
- * `(iu\@aa{sv})`: the result, the count and one dictionary an entry.
+ * D-Bus: `GetCallBarring`, sends `(iii)`.
  *
- * @param handle     the handle
- * @param query      what to ask for
- * @param callback   receives the outcome with an #ims_ss_status_list_s as data, NULL when the
- *                   result is not 0; or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param query  what to ask for
  */
 IMS_API int ims_ss_get_call_barring(ims_h handle, const ims_ss_query_s *query,
                                     ims_response_cb callback, void *user_data);
+
+/** @} */
 
 #ifdef __cplusplus
 }

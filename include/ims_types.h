@@ -4,51 +4,93 @@
 #ifndef KELVO_IMS_TYPES_H
 #define KELVO_IMS_TYPES_H
 
-#include <stdbool.h>
-#include <stddef.h>
-#include <stdint.h>
+/**
+ * @file
+ * @brief What all functions share: the handle, the result codes, the callbacks, the event ids.
+ */
 
 /**
- * @file ims_types.h
- * @brief The handle, the result codes, the callbacks and the notification ids.
+ * @defgroup ims_common What all functions share
+ * @brief Requests, queries and events; errors, threads, ownership, log lines.
  *
- * @section requests Requests
+ * What is said here is not said again with the functions.
  *
- * A request or query is one method call on the IMS service: bus name `org.kelvo.ims` on
- * the system bus, object `/org/kelvo/ims/sub<slot>`, one interface per module. The functions that
- * take an #ims_response_cb are asynchronous: they return as soon as the call is queued, and the
- * outcome reaches the callback. The queries are synchronous: they block for at most 60 s. A bus
- * that is not configured otherwise lets one process wait for 128 answers at a time.
+ * @section ims_requests Requests and queries
+ *
+ * A request or query is one method call on the IMS service: bus name `org.kelvo.ims` on the system
+ * bus, object `/org/kelvo/ims/sub<slot>`, one interface per module. A function's documentation
+ * names the method, the signature of what is sent, and that of the reply that is expected; a reply
+ * of another shape is a failure. The application id that many methods take is the one that
+ * ims_init() got: the library adds it.
+ *
+ * A **request** takes a callback and is asynchronous: it returns as soon as the call is queued, and
+ * the outcome reaches the callback, once. The callback may be NULL: the request is sent all the
+ * same and its outcome dropped. `user_data` is handed to the callback as it is; the library never
+ * looks behind it. Nothing tells at once that a call could not be sent: a service that cannot be
+ * reached shows only as #IMS_RESPONSE_FAILED in the callback, after at most 60 s. A request that is
+ * pending cannot be cancelled.
+ *
+ * A **query** is synchronous: it blocks for at most 60 s and fills a record of the caller's.
+ *
+ * A bus that is not configured otherwise lets one process wait for 128 answers at a time.
+ *
+ * @section ims_errors Errors
  *
  * Every function, the ones that only clear a record excepted, first asks the platform whether the
- * device has the IMS feature. No argument is looked at before that.
+ * device has the IMS feature. No argument is looked at before that. It returns
  *
- * What every function can return:
- *  - #IMS_ERROR_NONE: an asynchronous request was queued; a query has filled its record.
+ *  - #IMS_ERROR_NONE: a request was queued; a query has filled its record.
  *  - #IMS_ERROR_NOT_SUPPORTED: the device's IMS feature is switched off.
  *  - #IMS_ERROR_OPERATION_FAILED: the feature could not be queried. For a query also: the service
  *    could not be reached, did not answer in time, answered with something that is not the
  *    operation's reply, or reported a failure of its own.
- *  - #IMS_ERROR_INVALID_PARAMETER: the handle or a required pointer is NULL, a text is not valid
- *    UTF-8, or the request would be larger than 16 MiB. Nothing was sent.
+ *  - #IMS_ERROR_INVALID_PARAMETER: the handle or a pointer to what the function reads or fills is
+ *    NULL, a text is not valid UTF-8, or the request would be larger than 16 MiB. Nothing was sent.
+ *    A pointer that is *not checked* is one that must not be NULL all the same.
  *  - #IMS_ERROR_PERMISSION_DENIED (queries and ims_init()): the bus or the service refused the
- *    caller.
+ *    caller. A request has #IMS_RESPONSE_ACCESS_DENIED in its callback instead.
  *
- * @section threads Threads
+ * @section ims_values Values
  *
- * The library starts no thread and takes no lock. Use a handle from one thread. Replies and
- * notifications are delivered in the GLib main context that was thread-default when the request or
- * the subscription was made; an application that iterates no main context receives none. A
- * synchronous query blocks the thread and never runs that context.
+ * What is *defined by the service* the library passes through unchanged and checks in no way: ids,
+ * kinds, reasons, states, units and ranges, and every field with a neutral name such as `value_1`,
+ * `flag_1`, `text_1` or `member_1`. The definitions of the stand-in service, `ims-sim`, are in
+ * docs/stand-in.md, in the order of the methods' and signals' members. What a callback gets as its
+ * result is the service's too; only 0, 1 and 2 have a meaning here.
  *
- * @section ownership Ownership
+ * @section ims_threads Threads
+ *
+ * The library starts no thread and takes no lock. Use a handle from one thread. Replies and events
+ * are delivered in the GLib main context that was thread-default when the request or the
+ * subscription was made; an application that iterates no main context receives none. A query blocks
+ * the thread and never runs that context.
+ *
+ * @section ims_ownership Ownership
  *
  * Records and texts that the application passes in are read during the call only; the exceptions
  * are stated with the functions. Whatever a callback receives is valid while the callback runs,
- * unless its documentation says that the application takes it over: then free() releases it.
+ * unless its documentation says that the application takes it over: then free() releases it. Texts
+ * that a query puts into a record are copies that the caller owns.
+ *
+ * @section ims_log Log lines
+ *
+ * What return codes and results do not explain is in the platform's log, in its system buffer, as
+ * `file: function(line) > message`: the library's source file, the function that was called or took
+ * the reply, and the line there. Errors are a feature that is off or cannot be queried, refused
+ * arguments and callers, what the service fails to give to those who read from it, and parts of
+ * records and events that are missing or cannot be read. Warnings are lists of calls, profiles and
+ * supplementary services whose count is 0 or wrong. A call that failed otherwise, or was not
+ * answered in time, leaves no line, and success none.
+ *
+ * @{
  */
 
+#include <stdbool.h>
+#include <stddef.h>
+#include <stdint.h>
+
 #ifdef __GNUC__
+/** Marks what the library exports. */
 #define IMS_API __attribute__((visibility("default")))
 #else
 #define IMS_API
@@ -61,7 +103,7 @@ extern "C" {
 /** A client of one subscription slot. Made by ims_init(), released by ims_deinit(). */
 typedef struct ims_client_s *ims_h;
 
-/** What every function of the library returns. */
+/** What the functions of the library return; see @ref ims_errors. */
 typedef enum ims_error_e {
     /** Success. For an asynchronous request: the call was handed to D-Bus. */
     IMS_ERROR_NONE = 0,
@@ -84,7 +126,7 @@ enum {
 };
 
 /**
- * @brief Receives the outcome of one asynchronous request, once.
+ * Receives the outcome of one request, once.
  *
  * It is not called when the request's D-Bus call was cancelled.
  *
@@ -92,14 +134,14 @@ enum {
  * @param result     the service's result, where 0 is success and every other value is the
  *                   service's own; #IMS_RESPONSE_FAILED or #IMS_RESPONSE_ACCESS_DENIED when the
  *                   service's answer never came
- * @param data       what the request's documentation says; NULL on every failure of the D-Bus
- *                   call. Valid while the callback runs
+ * @param data       what the request's documentation says, otherwise NULL; NULL on every failure
+ *                   of the D-Bus call. Valid while the callback runs
  * @param user_data  the pointer that was given with the request
  */
 typedef void (*ims_response_cb)(ims_h handle, int result, void *data, void *user_data);
 
 /**
- * @brief Receives one kind of event, every time it happens.
+ * Receives one kind of event, every time it happens.
  *
  * ims_unset_notification_cb() and ims_deinit() may be called from here.
  *
@@ -110,7 +152,10 @@ typedef void (*ims_response_cb)(ims_h handle, int result, void *data, void *user
  */
 typedef void (*ims_notification_cb)(ims_h handle, int noti_id, void *event, void *user_data);
 
-/** The events that ims_set_notification_cb() takes. Each is one D-Bus signal of the service. */
+/**
+ * The events that ims_set_notification_cb() takes. Each is one D-Bus signal of the service on
+ * `org.kelvo.ims.<Module>`, spelled as here, and comes with the record that is named.
+ */
 typedef enum ims_noti_id_e {
     IMS_NOTI_REG_REGISTRATION_STATUS =
         0x101, /**< Registration.RegistrationStatus: #ims_registration_info_s */
@@ -187,6 +232,8 @@ typedef enum ims_noti_id_e {
 
     IMS_NOTI_LOGIN_STATE = 0x501 /**< Login.LoginState: #ims_login_state_s */
 } ims_noti_id_e;
+
+/** @} */
 
 #ifdef __cplusplus
 }

@@ -136,396 +136,284 @@ typedef struct ims_vt_buffer_s {
 /** @} */
 
 /**
- * @brief Starts a camera.
+ * Starts a camera.
  *
- * D-Bus: `StartCamera`, sends `(ii)`: the record's fields.
+ * D-Bus: `StartCamera`, sends `(ii)`.
  *
- * @param handle     the handle
- * @param info       the session and which camera
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the session and which camera
  */
 IMS_API int ims_vt_start_camera(ims_h handle, const ims_vt_camera_s *info, ims_response_cb callback,
                                 void *user_data);
 
 /**
- * @brief Stops the camera.
+ * Stops the camera.
  *
- * D-Bus: `StopCamera`, sends `(i)`: the session.
+ * D-Bus: `StopCamera`, sends `(i)`.
  *
- * @param handle     the handle
- * @param session_id the session
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param session_id  the session
  */
 IMS_API int ims_vt_stop_camera(ims_h handle, int32_t session_id, ims_response_cb callback,
                                void *user_data);
 
 /**
- * @brief Hides the user: the other party no longer sees the camera's picture.
+ * Hides the user: the other party no longer sees the camera's picture.
  *
- * D-Bus: `HideMe`, sends `(is)`: the record's fields.
+ * D-Bus: `HideMe`, sends `(is)`.
  *
- * @param handle     the handle
- * @param info       the session and what is shown instead
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the session and what is shown instead
  */
 IMS_API int ims_vt_hide_me(ims_h handle, const ims_vt_hide_me_s *info, ims_response_cb callback,
                            void *user_data);
 
 /**
- * @brief Shows the user again, after ims_vt_hide_me().
+ * Shows the user again, after ims_vt_hide_me().
  *
- * D-Bus: `ShowMe`, sends `(i)`: the session.
+ * D-Bus: `ShowMe`, sends `(i)`.
  *
- * @param handle     the handle
- * @param session_id the session
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param session_id  the session
  */
 IMS_API int ims_vt_show_me(ims_h handle, int32_t session_id, ims_response_cb callback,
                            void *user_data);
 
 /**
- * @brief Switches to the other camera.
+ * Switches to the other camera.
  *
- * D-Bus: `SwitchCamera`, sends `(i)`: the session.
+ * D-Bus: `SwitchCamera`, sends `(i)`.
  *
- * @param handle     the handle
- * @param session_id the session
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param session_id  the session
  */
 IMS_API int ims_vt_switch_camera(ims_h handle, int32_t session_id, ims_response_cb callback,
                                  void *user_data);
 
 /**
- * @brief Sets the orientation of the video.
+ * Sets the orientation of the video.
  *
- * D-Bus: `SetVideoOrientation`, sends `(ii)`: the record's fields.
+ * D-Bus: `SetVideoOrientation`, sends `(ii)`.
  *
- * @param handle     the handle
- * @param info       the session and the orientation
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the session and the orientation
  */
 IMS_API int ims_vt_set_video_orientation(ims_h handle, const ims_vt_orientation_s *info,
                                          ims_response_cb callback, void *user_data);
 
 /**
- * @brief Asks for the zoom.
+ * Asks for the zoom.
  *
- * D-Bus: `GetZoom`, sends `(ii)`: the record's fields; expects `(ii)`: the callback's data is an
- * `int32_t *`, the second member, or NULL when the call failed.
+ * D-Bus: `GetZoom`, sends `(ii)`; expects `(ii)`: the callback's data is an `int32_t *`, the second
+ * member, or NULL when the call failed.
  *
- * @param handle     the handle
- * @param info       the session and what to ask for
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the session and what to ask for
  */
 IMS_API int ims_vt_get_zoom(ims_h handle, const ims_vt_zoom_query_s *info, ims_response_cb callback,
                             void *user_data);
 
 /**
- * @brief Sets the zoom.
+ * Sets the zoom.
  *
- * D-Bus: `SetZoom`, sends `(iii)`: the record's fields.
+ * D-Bus: `SetZoom`, sends `(iii)`.
  *
- * @param handle     the handle
- * @param info       the session and the zoom
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the session and the zoom
  */
 IMS_API int ims_vt_set_zoom(ims_h handle, const ims_vt_zoom_s *info, ims_response_cb callback,
                             void *user_data);
 
 /**
- * @brief Holds the video stream.
+ * Holds the video stream.
  *
- * D-Bus: `HoldVideo`, sends `(i)`: the session.
+ * D-Bus: `HoldVideo`, sends `(i)`.
  *
- * @param handle     the handle
- * @param session_id the session
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param session_id  the session
  */
 IMS_API int ims_vt_hold_video(ims_h handle, int32_t session_id, ims_response_cb callback,
                               void *user_data);
 
 /**
- * @brief Resumes the video stream, after ims_vt_hold_video().
+ * Resumes the video stream, after ims_vt_hold_video().
  *
- * D-Bus: `ResumeVideo`, sends `(i)`: the session.
+ * D-Bus: `ResumeVideo`, sends `(i)`.
  *
- * @param handle     the handle
- * @param session_id the session
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param session_id  the session
  */
 IMS_API int ims_vt_resume_video(ims_h handle, int32_t session_id, ims_response_cb callback,
                                 void *user_data);
 
 /**
- * @brief Takes a picture of a surface.
+ * Takes a picture of a surface.
  *
- * D-Bus: `CaptureSurfaceImage`, sends `(iis)`: the record's fields.
+ * D-Bus: `CaptureSurfaceImage`, sends `(iis)`.
  *
- * @param handle     the handle
- * @param info       the session, the surface and the picture's file
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the session, the surface and the picture's file
  */
 IMS_API int ims_vt_capture_surface_image(ims_h handle, const ims_vt_capture_s *info,
                                          ims_response_cb callback, void *user_data);
 
 /**
- * @brief Starts recording the video.
+ * Starts recording the video.
  *
- * D-Bus: `StartRecordVideo`, sends `(iiisi)`: the record's fields.
+ * D-Bus: `StartRecordVideo`, sends `(iiisi)`.
  *
- * @param handle     the handle
- * @param info       the session, what to record and the file
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the session, what to record and the file
  */
 IMS_API int ims_vt_start_record_video(ims_h handle, const ims_vt_record_start_s *info,
                                       ims_response_cb callback, void *user_data);
 
 /**
- * @brief Pauses a recording.
+ * Pauses a recording.
  *
- * D-Bus: `PauseRecordVideo`, sends `(ii)`: the record's fields.
+ * D-Bus: `PauseRecordVideo`, sends `(ii)`.
  *
- * @param handle     the handle
- * @param info       the session and the recording
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the session and the recording
  */
 IMS_API int ims_vt_pause_record_video(ims_h handle, const ims_vt_record_s *info,
                                       ims_response_cb callback, void *user_data);
 
 /**
- * @brief Resumes a recording, after ims_vt_pause_record_video().
+ * Resumes a recording, after ims_vt_pause_record_video().
  *
- * D-Bus: `ResumeRecordVideo`, sends `(ii)`: the record's fields.
+ * D-Bus: `ResumeRecordVideo`, sends `(ii)`.
  *
- * @param handle     the handle
- * @param info       the session and the recording
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the session and the recording
  */
 IMS_API int ims_vt_resume_record_video(ims_h handle, const ims_vt_record_s *info,
                                        ims_response_cb callback, void *user_data);
 
 /**
- * @brief Cancels a recording.
+ * Cancels a recording.
  *
- * D-Bus: `CancelRecordVideo`, sends `(ii)`: the record's fields.
+ * D-Bus: `CancelRecordVideo`, sends `(ii)`.
  *
- * @param handle     the handle
- * @param info       the session and the recording
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the session and the recording
  */
 IMS_API int ims_vt_cancel_record_video(ims_h handle, const ims_vt_record_s *info,
                                        ims_response_cb callback, void *user_data);
 
 /**
- * @brief Ends a recording.
+ * Ends a recording.
  *
- * D-Bus: `StopRecordVideo`, sends `(ii)`: the record's fields.
+ * D-Bus: `StopRecordVideo`, sends `(ii)`.
  *
- * @param handle     the handle
- * @param info       the session and the recording
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the session and the recording
  */
 IMS_API int ims_vt_stop_record_video(ims_h handle, const ims_vt_record_s *info,
                                      ims_response_cb callback, void *user_data);
 
 /**
- * @brief Casts a file into the call.
+ * Casts a file into the call.
  *
- * D-Bus: `StartFileCast`, sends `(is)`: the record's fields.
+ * D-Bus: `StartFileCast`, sends `(is)`.
  *
- * @param handle     the handle
- * @param info       the session and the file
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the session and the file
  */
 IMS_API int ims_vt_start_file_cast(ims_h handle, const ims_vt_file_cast_s *info,
                                    ims_response_cb callback, void *user_data);
 
 /**
- * @brief Stops casting a file.
+ * Stops casting a file.
  *
- * D-Bus: `StopFileCast`, sends `(i)`: the session.
+ * D-Bus: `StopFileCast`, sends `(i)`.
  *
- * @param handle     the handle
- * @param session_id the session
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param session_id  the session
  */
 IMS_API int ims_vt_stop_file_cast(ims_h handle, int32_t session_id, ims_response_cb callback,
                                   void *user_data);
 
 /**
- * @brief Swaps the two video surfaces.
+ * Swaps the two video surfaces.
  *
- * D-Bus: `SwapVideoSurface`, sends `(i)`: the session.
+ * D-Bus: `SwapVideoSurface`, sends `(i)`.
  *
- * @param handle     the handle
- * @param session_id the session
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param session_id  the session
  */
 IMS_API int ims_vt_swap_video_surface(ims_h handle, int32_t session_id, ims_response_cb callback,
                                       void *user_data);
 
 /**
- * @brief Swipes the video.
+ * Swipes the video.
  *
- * D-Bus: `SwipeVideo`, sends `(iiiiii)`: the record's fields.
+ * D-Bus: `SwipeVideo`, sends `(iiiiii)`.
  *
- * @param handle     the handle
- * @param info       the session and the movement. Not checked: must not be NULL
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the session and the movement. Not checked: must not be NULL
  */
 IMS_API int ims_vt_swipe_video(ims_h handle, const ims_vt_swipe_s *info, ims_response_cb callback,
                                void *user_data);
 
 /**
- * @brief Sets the surface that the near end's video is drawn on.
+ * Sets the surface that the near end's video is drawn on.
  *
  * D-Bus: `SetNearEndSurface`, sends `(iiv)`: the session, the count, and a variant with an `ai` of
  * the entries.
  *
- * @param handle     the handle
- * @param info       the surface
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the surface
  */
 IMS_API int ims_vt_set_near_end_surface(ims_h handle, const ims_vt_surface_s *info,
                                         ims_response_cb callback, void *user_data);
 
 /**
- * @brief Sets the surface that the far end's video is drawn on.
+ * Sets the surface that the far end's video is drawn on.
  *
  * D-Bus: `SetFarEndSurface`, sends `(iiv)`: the session, the count, and a variant with an `ai` of
  * the entries.
  *
- * @param handle     the handle
- * @param info       the surface
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the surface
  */
 IMS_API int ims_vt_set_far_end_surface(ims_h handle, const ims_vt_surface_s *info,
                                        ims_response_cb callback, void *user_data);
 
 /**
- * @brief Names the session whose video is active.
+ * Names the session whose video is active.
  *
- * D-Bus: `SetActiveSessionId`, sends `(i)`: the session.
+ * D-Bus: `SetActiveSessionId`, sends `(i)`.
  *
- * @param handle     the handle
- * @param session_id the session
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param session_id  the session
  */
 IMS_API int ims_vt_set_active_session_id(ims_h handle, int32_t session_id, ims_response_cb callback,
                                          void *user_data);
 
 /**
- * @brief Lets the service use a pixmap again.
+ * Lets the service use a pixmap again.
  *
- * D-Bus: `ReUsePixMapId`, sends `(iii)`: the record's fields.
+ * D-Bus: `ReUsePixMapId`, sends `(iii)`.
  *
- * @param handle     the handle
- * @param info       the session and the pixmap
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the session and the pixmap
  */
 IMS_API int ims_vt_re_use_pix_map_id(ims_h handle, const ims_vt_pix_map_re_use_s *info,
                                      ims_response_cb callback, void *user_data);
 
 /**
- * @brief Releases a pixmap.
+ * Releases a pixmap.
  *
- * D-Bus: `ReleasePixMapId`, sends `(ii)`: the record's fields.
+ * D-Bus: `ReleasePixMapId`, sends `(ii)`.
  *
- * @param handle     the handle
- * @param info       the session and the pixmap
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the session and the pixmap
  */
 IMS_API int ims_vt_release_pix_map_id(ims_h handle, const ims_vt_pix_map_s *info,
                                       ims_response_cb callback, void *user_data);
 
 /**
- * @brief Sets the windows that the video is drawn in.
+ * Sets the windows that the video is drawn in.
  *
- * D-Bus: `SetWindowId`, sends `(iiiiii)`: the record's fields.
+ * D-Bus: `SetWindowId`, sends `(iiiiii)`.
  *
- * @param handle     the handle
- * @param info       the session and the windows
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the session and the windows
  */
 IMS_API int ims_vt_set_window_id(ims_h handle, const ims_vt_window_s *info,
                                  ims_response_cb callback, void *user_data);
 
 /**
- * @brief Sets the buffer of the camera's pictures.
+ * Sets the buffer of the camera's pictures.
  *
- * D-Bus: `SetCameraBuffer`, sends `(is)`: the record's fields.
+ * D-Bus: `SetCameraBuffer`, sends `(is)`.
  *
- * @param handle     the handle
- * @param info       the session and the buffer
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the session and the buffer
  */
 IMS_API int ims_vt_set_camera_buffer(ims_h handle, const ims_vt_buffer_s *info,
                                      ims_response_cb callback, void *user_data);
 
 /**
- * @brief Sets the buffer of the media.
+ * Sets the buffer of the media.
  *
- * D-Bus: `SetMediaBuffer`, sends `(is)`: the record's fields.
+ * D-Bus: `SetMediaBuffer`, sends `(is)`.
  *
- * @param handle     the handle
- * @param info       the session and the buffer
- * @param callback   receives the outcome, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param info  the session and the buffer
  */
 IMS_API int ims_vt_set_media_buffer(ims_h handle, const ims_vt_buffer_s *info,
                                     ims_response_cb callback, void *user_data);

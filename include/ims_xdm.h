@@ -387,393 +387,288 @@ typedef struct ims_xdm_participant_info_s {
 } ims_xdm_participant_info_s;
 
 /**
- * @brief Creates a group document.
+ * Creates a group document.
  *
  * Properties, supported services or a member list that are NULL are each logged, and do not stop
  * the request.
  *
- * D-Bus: `XdmCreateGroup`, sends `(a{sv})`: the document; expects `(i)`: the result.
+ * D-Bus: `XdmCreateGroup`, sends `(a{sv})`.
  *
- * @param handle     the handle
- * @param group      the document
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param group  the document
  */
 IMS_API int ims_xdm_create_group(ims_h handle, const ims_xdm_group_info_s *group,
                                  ims_response_cb callback, void *user_data);
 
 /**
- * @brief Deletes a group document.
+ * Deletes a group document.
  *
- * D-Bus: `XdmDeleteGroup`, sends `(s)`: the group; expects `(i)`: the result.
+ * D-Bus: `XdmDeleteGroup`, sends `(s)`.
  *
- * @param handle     the handle
  * @param group_uri  the group's URI
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
  */
 IMS_API int ims_xdm_delete_group(ims_h handle, const char *group_uri, ims_response_cb callback,
                                  void *user_data);
 
 /**
- * @brief Asks for one group document.
+ * Asks for one group document.
+ *
+ * The callback's data is an #ims_xdm_group_info_s, NULL when the result is not 0.
  *
  * D-Bus: `XdmFetchSharedGroup`, sends `(ss)`: the URI and the channel of the record; expects
  * `(i\@a{sv})`: the result and the record as a dictionary.
  *
- * @param handle     the handle
- * @param group      the group: its group_uri and channel_id are read, a NULL channel_id as an empty
- *                   text
- * @param callback   receives the outcome with an #ims_xdm_group_info_s as data, NULL when the
- *                   result is not 0; or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param group  the group: its group_uri and channel_id are read, a NULL channel_id as an empty
+ *               text
  */
 IMS_API int ims_xdm_fetch_shared_group(ims_h handle, const ims_xdm_group_info_s *group,
                                        ims_response_cb callback, void *user_data);
 
 /**
- * @brief Asks for all group documents.
+ * Asks for all group documents.
  *
- * D-Bus: `XdmFetchAllSharedGroups`, sends `(s)`: the text; expects `(i\@a{sv})`: the result and
- * the record as a dictionary.
+ * The callback's data is an #ims_xdm_shared_group_list_s, NULL when the result is not 0.
  *
- * @param handle     the handle
- * @param text       defined by the service; NULL is sent as an empty text
- * @param callback   receives the outcome with an #ims_xdm_shared_group_list_s as data, NULL when
- *                   the result is not 0; or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * D-Bus: `XdmFetchAllSharedGroups`, sends `(s)`: the text; expects `(i\@a{sv})`: the result and the
+ * record as a dictionary.
+ *
+ * @param text  defined by the service; NULL is sent as an empty text
  */
 IMS_API int ims_xdm_fetch_all_shared_groups(ims_h handle, const char *text,
                                             ims_response_cb callback, void *user_data);
 
 /**
- * @brief Asks for the lists of groups that the user takes part in.
+ * Asks for the lists of groups that the user takes part in.
+ *
+ * The callback's data is an #ims_xdm_participant_groups_s, NULL when the result is not 0.
  *
  * D-Bus: `XdmFetchAllParticipantGroups`, sends `(s)`: the text; expects `(i\@a{sv})`: the result
  * and the record as a dictionary.
  *
- * @param handle     the handle
- * @param text       defined by the service; NULL is sent as an empty text
- * @param callback   receives the outcome with an #ims_xdm_participant_groups_s as data, NULL when
- *                   the result is not 0; or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * @param text  defined by the service; NULL is sent as an empty text
  */
 IMS_API int ims_xdm_fetch_all_participant_groups(ims_h handle, const char *text,
                                                  ims_response_cb callback, void *user_data);
 
 /**
- * @brief Asks for a shared user profile.
+ * Asks for a shared user profile.
  *
- * D-Bus: `XdmFetchSharedUserProfile`, sends `(s)`: the text; expects `(i\@a{sv})`: the result
- * and the record as a dictionary.
+ * The callback's data is an #ims_xdm_user_profile_s, NULL when the result is not 0.
  *
- * @param handle     the handle
- * @param text       defined by the service; NULL is sent as an empty text
- * @param callback   receives the outcome with an #ims_xdm_user_profile_s as data, NULL when the
- *                   result is not 0; or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * D-Bus: `XdmFetchSharedUserProfile`, sends `(s)`: the text; expects `(i\@a{sv})`: the result and
+ * the record as a dictionary.
+ *
+ * @param text  defined by the service; NULL is sent as an empty text
  */
 IMS_API int ims_xdm_fetch_shared_user_profile(ims_h handle, const char *text,
                                               ims_response_cb callback, void *user_data);
 
 /**
- * @brief Adds members to a group.
+ * Adds members to a group.
  *
- * D-Bus: `XdmAddUserToSharedGroup`, sends `(sa{sv})`: the group and the member list; expects
- * `(i)`: the result.
+ * D-Bus: `XdmAddUserToSharedGroup`, sends `(sa{sv})`.
  *
- * @param handle     the handle
  * @param group_uri  the group's URI
  * @param members    the members
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
  */
 IMS_API int ims_xdm_add_user_to_shared_group(ims_h handle, const char *group_uri,
                                              const ims_xdm_member_list_s *members,
                                              ims_response_cb callback, void *user_data);
 
 /**
- * @brief Removes members from a group.
+ * Removes members from a group.
  *
- * D-Bus: `XdmRemoveUserFromSharedGroup`, sends `(sa{sv})`: the group and the member list;
- * expects `(i)`: the result.
+ * D-Bus: `XdmRemoveUserFromSharedGroup`, sends `(sa{sv})`.
  *
- * @param handle     the handle
  * @param group_uri  the group's URI
  * @param members    the members
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
  */
 IMS_API int ims_xdm_remove_user_from_shared_group(ims_h handle, const char *group_uri,
                                                   const ims_xdm_member_list_s *members,
                                                   ims_response_cb callback, void *user_data);
 
 /**
- * @brief Adds rules to a group.
+ * Adds rules to a group.
  *
- * D-Bus: `XdmAddGroupRule`, sends `(saa{sv})`: the group and the rules; expects `(i)`: the
- * result.
+ * D-Bus: `XdmAddGroupRule`, sends `(saa{sv})`.
  *
- * @param handle     the handle
  * @param group_uri  the group's URI
  * @param rules      the first of the rules
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
  */
 IMS_API int ims_xdm_add_group_rule(ims_h handle, const char *group_uri,
                                    const ims_xdm_group_rule_s *rules, ims_response_cb callback,
                                    void *user_data);
 
 /**
- * @brief Replaces rules of a group.
+ * Replaces rules of a group.
  *
- * D-Bus: `XdmModifyGroupRule`, sends `(saa{sv})`: the group and the rules; expects `(i)`: the
- * result.
+ * D-Bus: `XdmModifyGroupRule`, sends `(saa{sv})`.
  *
- * @param handle     the handle
  * @param group_uri  the group's URI
  * @param rules      the first of the rules
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
  */
 IMS_API int ims_xdm_modify_group_rule(ims_h handle, const char *group_uri,
                                       const ims_xdm_group_rule_s *rules, ims_response_cb callback,
                                       void *user_data);
 
 /**
- * @brief Deletes a rule of a group.
+ * Deletes a rule of a group.
  *
- * D-Bus: `XdmDeleteGroupRule`, sends `(ss)`: the group and the rule; expects `(i)`: the result.
+ * D-Bus: `XdmDeleteGroupRule`, sends `(ss)`.
  *
- * @param handle     the handle
  * @param group_uri  the group's URI
  * @param rule_id    the rule's name
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
  */
 IMS_API int ims_xdm_delete_group_rule(ims_h handle, const char *group_uri, const char *rule_id,
                                       ims_response_cb callback, void *user_data);
 
 /**
- * @brief Sets a group's display name.
+ * Sets a group's display name.
  *
- * D-Bus: `XdmModifyGroupDisplayName`, sends `(ss)`: the group and the name; expects `(i)`: the
- * result.
+ * D-Bus: `XdmModifyGroupDisplayName`, sends `(ss)`.
  *
- * @param handle        the handle
  * @param group_uri     the group's URI
  * @param display_name  the display name
- * @param callback      receives the outcome with NULL as data, or NULL
- * @param user_data     handed to the callback
- * @return see @ref requests
  */
 IMS_API int ims_xdm_modify_group_display_name(ims_h handle, const char *group_uri,
                                               const char *display_name, ims_response_cb callback,
                                               void *user_data);
 
 /**
- * @brief Sets a group's subject.
+ * Sets a group's subject.
  *
- * D-Bus: `XdmModifyGroupSubject`, sends `(ss)`: the group and the subject; expects `(i)`: the
- * result.
+ * D-Bus: `XdmModifyGroupSubject`, sends `(ss)`.
  *
- * @param handle     the handle
  * @param group_uri  the group's URI
  * @param subject    the subject
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
  */
 IMS_API int ims_xdm_modify_group_subject(ims_h handle, const char *group_uri, const char *subject,
                                          ims_response_cb callback, void *user_data);
 
 /**
- * @brief Says whether a search finds a group.
+ * Says whether a search finds a group.
  *
- * D-Bus: `XdmModifyGroupSearchable`, sends `(sb)`: the group and the flag; expects `(i)`: the
- * result.
+ * D-Bus: `XdmModifyGroupSearchable`, sends `(sb)`.
  *
- * @param handle      the handle
  * @param group_uri   the group's URI
  * @param searchable  whether it is found
- * @param callback    receives the outcome with NULL as data, or NULL
- * @param user_data   handed to the callback
- * @return see @ref requests
  */
 IMS_API int ims_xdm_modify_group_searchable(ims_h handle, const char *group_uri, bool searchable,
                                             ims_response_cb callback, void *user_data);
 
 /**
- * @brief Says whether the members of a group are invited.
+ * Says whether the members of a group are invited.
  *
- * D-Bus: `XdmModifyGroupInviteMembers`, sends `(sb)`: the group and the flag; expects `(i)`: the
- * result.
+ * D-Bus: `XdmModifyGroupInviteMembers`, sends `(sb)`.
  *
- * @param handle          the handle
  * @param group_uri       the group's URI
  * @param invite_members  whether they are invited
- * @param callback        receives the outcome with NULL as data, or NULL
- * @param user_data       handed to the callback
- * @return see @ref requests
  */
 IMS_API int ims_xdm_modify_group_invite_members(ims_h handle, const char *group_uri,
                                                 bool invite_members, ims_response_cb callback,
                                                 void *user_data);
 
 /**
- * @brief Limits the participants of a group's sessions.
+ * Limits the participants of a group's sessions.
  *
- * D-Bus: `XdmModifyGroupMaxParticipants`, sends `(si)`: the group and the number; expects `(i)`:
- * the result.
+ * D-Bus: `XdmModifyGroupMaxParticipants`, sends `(si)`.
  *
- * @param handle            the handle
  * @param group_uri         the group's URI
  * @param max_participants  the most participants
- * @param callback          receives the outcome with NULL as data, or NULL
- * @param user_data         handed to the callback
- * @return see @ref requests
  */
 IMS_API int ims_xdm_modify_group_max_participants(ims_h handle, const char *group_uri,
                                                   int32_t max_participants,
                                                   ims_response_cb callback, void *user_data);
 
 /**
- * @brief Says whether a group advertises itself.
+ * Says whether a group advertises itself.
  *
- * D-Bus: `XdmModifyGroupAutoAdvertisements`, sends `(sb)`: the group and the flag; expects
- * `(i)`: the result.
+ * D-Bus: `XdmModifyGroupAutoAdvertisements`, sends `(sb)`.
  *
- * @param handle               the handle
  * @param group_uri            the group's URI
  * @param auto_advertisements  whether it does
- * @param callback             receives the outcome with NULL as data, or NULL
- * @param user_data            handed to the callback
- * @return see @ref requests
  */
 IMS_API int ims_xdm_modify_group_auto_advertisements(ims_h handle, const char *group_uri,
                                                      bool auto_advertisements,
                                                      ims_response_cb callback, void *user_data);
 
 /**
- * @brief Sets a group's quality of experience.
+ * Sets a group's quality of experience.
  *
- * D-Bus: `XdmModifyGroupQoe`, sends `(si)`: the group and the number; expects `(i)`: the result.
+ * D-Bus: `XdmModifyGroupQoe`, sends `(si)`.
  *
- * @param handle     the handle
  * @param group_uri  the group's URI
  * @param qoe        the quality, defined by the service
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
  */
 IMS_API int ims_xdm_modify_group_qoe(ims_h handle, const char *group_uri, int32_t qoe,
                                      ims_response_cb callback, void *user_data);
 
 /**
- * @brief Sets a group's session policy.
+ * Sets a group's session policy.
  *
- * D-Bus: `XdmModifyGroupSessionActivePolicy`, sends `(sa{sv})`: the group and the policy;
- * expects `(i)`: the result.
+ * D-Bus: `XdmModifyGroupSessionActivePolicy`, sends `(sa{sv})`.
  *
- * @param handle     the handle
  * @param group_uri  the group's URI
  * @param policy     the policy
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
  */
 IMS_API int ims_xdm_modify_group_session_active_policy(ims_h handle, const char *group_uri,
                                                        const ims_xdm_session_policy_s *policy,
                                                        ims_response_cb callback, void *user_data);
 
 /**
- * @brief Sets a service of a group's sessions.
+ * Sets a service of a group's sessions.
  *
- * D-Bus: `XdmModifyGroupSessionServiceList`, sends `(sa{sv})`: the group and the service;
- * expects `(i)`: the result.
+ * D-Bus: `XdmModifyGroupSessionServiceList`, sends `(sa{sv})`.
  *
- * @param handle     the handle
  * @param group_uri  the group's URI
  * @param service    the service
- * @param callback   receives the outcome with NULL as data, or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
  */
 IMS_API int ims_xdm_modify_group_session_service_list(ims_h handle, const char *group_uri,
                                                       const ims_xdm_session_service_s *service,
                                                       ims_response_cb callback, void *user_data);
 
 /**
- * @brief Sets a group's restrictions of age.
+ * Sets a group's restrictions of age.
  *
- * D-Bus: `XdmModifyGroupAgeRestriction`, sends `(saa{sv})`: the group and the restrictions;
- * expects `(i)`: the result.
+ * D-Bus: `XdmModifyGroupAgeRestriction`, sends `(saa{sv})`.
  *
- * @param handle        the handle
  * @param group_uri     the group's URI
  * @param restrictions  the first of the restrictions
- * @param callback      receives the outcome with NULL as data, or NULL
- * @param user_data     handed to the callback
- * @return see @ref requests
  */
 IMS_API int ims_xdm_modify_group_age_restriction(ims_h handle, const char *group_uri,
                                                  const ims_xdm_age_restriction_s *restrictions,
                                                  ims_response_cb callback, void *user_data);
 
 /**
- * @brief Sets what one member of a group is.
+ * Sets what one member of a group is.
  *
- * D-Bus: `XdmModifyGroupAttributes`, sends `(sssbbiba{sv})`: the group, then the member's uri,
- * disp_name, stt, active, type, auto_join and status; expects `(i)`: the result.
+ * D-Bus: `XdmModifyGroupAttributes`, sends `(sssbbiba{sv})`.
  *
- * @param handle      the handle
  * @param attributes  the group and the member. A NULL disp_name is sent as an empty text; a NULL
  *                    member is refused without a log line
- * @param callback    receives the outcome with NULL as data, or NULL
- * @param user_data   handed to the callback
- * @return see @ref requests
  */
 IMS_API int ims_xdm_modify_group_attributes(ims_h handle,
                                             const ims_xdm_group_attributes_s *attributes,
                                             ims_response_cb callback, void *user_data);
 
 /**
- * @brief Sets or clears the default group of a list.
+ * Sets or clears the default group of a list.
  *
- * D-Bus: `XdmModifyDefaultGroup`, sends `(ssb)`: the record's fields; expects `(i)`: the result.
+ * D-Bus: `XdmModifyDefaultGroup`, sends `(ssb)`.
  *
- * @param handle         the handle
  * @param default_group  the list, the group and the flag
- * @param callback       receives the outcome with NULL as data, or NULL
- * @param user_data      handed to the callback
- * @return see @ref requests
  */
 IMS_API int ims_xdm_modify_default_group(ims_h handle, const ims_xdm_default_group_s *default_group,
                                          ims_response_cb callback, void *user_data);
 
 /**
- * @brief Asks who takes part in a session.
+ * Asks who takes part in a session.
  *
- * D-Bus: `XdmGetParticipantInfo`, sends `(s)`: the text; expects `(i\@a{sv})`: the result and
- * the record as a dictionary.
+ * The callback's data is an #ims_xdm_participant_info_s, NULL when the result is not 0.
  *
- * @param handle     the handle
- * @param text       the session or group to ask about
- * @param callback   receives the outcome with an #ims_xdm_participant_info_s as data, NULL when the
- *                   result is not 0; or NULL
- * @param user_data  handed to the callback
- * @return see @ref requests
+ * D-Bus: `XdmGetParticipantInfo`, sends `(s)`: the text; expects `(i\@a{sv})`: the result and the
+ * record as a dictionary.
+ *
+ * @param text  the session or group to ask about
  */
 IMS_API int ims_xdm_get_participant_info(ims_h handle, const char *text, ims_response_cb callback,
                                          void *user_data);
