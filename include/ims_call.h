@@ -361,10 +361,10 @@ typedef struct ims_call_list_info_s {
 /**
  * Reads the list of current calls.
  *
- * A list that is empty, or whose count is not the number of entries that
- * came, is reported as success with @p list->count 0. Of more than #IMS_CALL_LIST_CAPACITY calls
- * the first ones are kept. An entry keeps the value that the caller had in a field which the
- * service left out; a text that a field held before is overwritten, not freed.
+ * A list that is empty, or whose count is not the number of entries that came, is reported as
+ * success with @p list->count 0. Of more than #IMS_CALL_LIST_CAPACITY calls the first ones are
+ * kept. An entry keeps the value that the caller had in a field which the service left out; a text
+ * that a field held before is overwritten, not freed.
  *
  * D-Bus: `CallListInfo`, sends `(i)`: the application id; expects `(iuaa{sv})`: the result, the
  * count and one dictionary a call.
@@ -786,9 +786,9 @@ IMS_API int ims_call_change_epdg_audio_path(ims_h handle, int32_t value, ims_res
 /**
  * Starts a conference with a list of participants.
  *
- * D-Bus: `StartConference`, sends `(iiv)`: the record's value, its count, and a variant that
- * holds the first count participants as `as`; no application id; expects `(ii)`: the callback's
- * data is the second member itself in the pointer's place: `(int)(intptr_t)data`.
+ * D-Bus: `StartConference`, sends `(iiv)`: the record's value, its count, and a variant that holds
+ * the first count participants as `as`; no application id; expects `(ii)`: the callback's data is
+ * the second member itself in the pointer's place: `(int)(intptr_t)data`.
  *
  * @param info  the conference. Not checked: must not be NULL
  */
@@ -798,8 +798,8 @@ IMS_API int ims_call_start_conference(ims_h handle, const ims_call_conference_s 
 /**
  * Changes the participants of a conference.
  *
- * D-Bus: `ModifyParticipantsInConference`, sends `(iiiv)`: the session, the value, the count, and
- * a variant that holds the first count participants as `as`; no application id; expects `(ii)`: the
+ * D-Bus: `ModifyParticipantsInConference`, sends `(iiiv)`: the session, the value, the count, and a
+ * variant that holds the first count participants as `as`; no application id; expects `(ii)`: the
  * callback's data is the second member itself in the pointer's place: `(int)(intptr_t)data`.
  *
  * @param info  the change. Not checked: must not be NULL

@@ -5,24 +5,85 @@
 #define KELVO_IMS_POC_H
 
 /**
- * @file ims_poc.h
+ * @file
  * @brief Push-to-talk: calls, the floor, recording, messages, file transfer and the events.
+ */
+
+/**
+ * @defgroup ims_poc Push-to-talk
+ * @brief Calls in which one speaks at a time, messages and files: `org.kelvo.ims.Poc`.
  *
- * All methods and signals are on the D-Bus interface `org.kelvo.ims.Poc`. No request carries the
- * application id: the service tells its callers by their connections.
+ * @section ims_poc_life The life of a push-to-talk call
  *
- * The service defines what the values mean: every field with a neutral name such as `value_1`,
- * `flag_1`, `text_1` or `int_set_1`. The library passes them through unchanged. A set of four
- * integers crosses the bus as an `ai` inside a `v`; of an event's set that has more or fewer
- * integers the first four are kept, and what is missing is 0.
+ * A call is a session with an id that the service gives. A placed call's id comes with the callback
+ * of ims_poc_call_make_call() or ims_poc_make_ad_hoc_call(), then come
+ * #IMS_NOTI_POC_CALL_IN_PROGRESS, #IMS_NOTI_POC_CALL_ALERTING and #IMS_NOTI_POC_CALL_ESTABLISHED. A
+ * call that comes in begins with #IMS_NOTI_POC_CALL_INCOMING_IND and waits for
+ * ims_poc_call_answer_call() or ims_poc_call_reject_call(). #IMS_NOTI_POC_CALL_ENDED is the last
+ * event of both.
  *
- * Records cross the bus as dictionaries where the documentation says so. In these an integer goes
- * as a 64-bit `x` and comes back cut to 32 bits, and a text that is NULL is left out. In a
- * dictionary that comes in, unknown keys are ignored, and a key that is missing, or whose value has
- * another type, leaves its field 0 or NULL. A value may be wrapped in any number of variants.
+ * In an established call one participant has the floor, the right to talk.
+ * ims_poc_call_request_floor() asks for it; the answer is an event:
+ * #IMS_NOTI_POC_CALL_FLOOR_GRANTED, #IMS_NOTI_POC_CALL_FLOOR_REJECTED or, while others talk,
+ * #IMS_NOTI_POC_CALL_FLOOR_QUEUE_POSITION and in the end perhaps
+ * #IMS_NOTI_POC_CALL_FLOOR_REQUEST_TIMEOUT. Who has it talks until ims_poc_call_release_floor(), or
+ * until #IMS_NOTI_POC_CALL_FLOOR_CANCELED takes it away. The others hear
+ * #IMS_NOTI_POC_CALL_FLOOR_TAKEN, and all #IMS_NOTI_POC_CALL_FLOOR_IDLE when it is free.
+ *
+ * Other media are offered with ims_poc_modify_call(), which is #IMS_NOTI_POC_CALL_MODIFY_REQUEST at
+ * the others; #IMS_NOTI_POC_CALL_MODIFY_STATUS says what became of the offer. Messages and files go
+ * with a call or without one, by numbers of their own.
+ *
+ * @code{.c}
+ * #include <ims.h>
+ * #include <stdio.h>
+ *
+ * void on_floor(ims_h handle, int noti_id, void *event, void *user_data) {
+ *     if (noti_id == IMS_NOTI_POC_CALL_FLOOR_GRANTED)
+ *         printf("talk\n");
+ * }
+ *
+ * void on_made(ims_h handle, int result, void *data, void *user_data) {
+ *     if (result == 0)
+ *         *(int32_t *)user_data = *(int32_t *)data; // the session, as the stand-in has it
+ * }
+ *
+ * int call(ims_h handle, const char *group, int32_t *session) {
+ *     const ims_poc_make_call_s info = {.text_1 = group, .value_1 = 1};
+ *     int error = ims_set_notification_cb(handle, IMS_NOTI_POC_CALL_FLOOR_GRANTED, on_floor, NULL);
+ *     return error == IMS_ERROR_NONE ? ims_poc_call_make_call(handle, &info, on_made, session) :
+ * error;
+ * }
+ *
+ * int press(ims_h handle, int32_t session) { // once the call is established
+ *     const ims_poc_floor_s floor = {.session_id = session, .text = ""};
+ *     return ims_poc_call_request_floor(handle, &floor, NULL, NULL);
+ * }
+ *
+ * int let_go(ims_h handle, int32_t session) {
+ *     const ims_poc_floor_s floor = {.session_id = session};
+ *     return ims_poc_call_release_floor(handle, &floor, NULL, NULL);
+ * }
+ * @endcode
+ *
+ * @section ims_poc_wire Values, sets and dictionaries
+ *
+ * No request carries the application id: the service tells its callers by their connections. The
+ * values are the service's, see @ref ims_values.
+ *
+ * A set of four integers crosses the bus as an `ai` inside a `v`; of an event's set that has more
+ * or fewer integers the first four are kept, and what is missing is 0.
+ *
+ * Records cross the bus as dictionaries where the documentation says so: `a{sv}`, a list of them
+ * `aa{sv}`, inside a `v`. In these an integer goes as a 64-bit `x` and comes back cut to 32 bits,
+ * and a text that is NULL is left out. In a dictionary that comes in, unknown keys are ignored, and
+ * a key that is missing, or whose value has another type, leaves its field 0 or NULL. A value may
+ * be wrapped in any number of variants.
  *
  * Texts and lists in the records that a callback receives belong to the library and are gone after
  * the callback: copy what is to stay.
+ *
+ * @{
  */
 
 #include "ims_types.h"
@@ -35,7 +96,9 @@ extern "C" {
 #define IMS_POC_INT_SET_SIZE 4
 
 /**
- * @name Records of both directions
+ * @defgroup ims_poc_parties Records of both directions
+ * @brief Parties and files.
+ *
  * In a request they are owned by the caller and read during the call only. In an event they are the
  * library's and valid while the callback runs.
  * @{
@@ -68,10 +131,11 @@ typedef struct ims_poc_file_attributes_s {
 /** @} */
 
 /**
- * @name Request records
- * Owned by the caller and read during the call only. A NULL text is sent as an empty one, unless a
- * text is part of a dictionary: there it is left out. Texts that are said to be required should be
- * there; NULL is sent as an empty text there too.
+ * @defgroup ims_poc_records Request records
+ * @brief Owned by the caller and read during the call only.
+ *
+ * A NULL text is sent as an empty one, unless a text is part of a dictionary: there it is left out.
+ * Texts that are said to be required should be there; NULL is sent as an empty text there too.
  * @{
  */
 
@@ -230,9 +294,9 @@ typedef struct ims_poc_transfer_answer_s {
 /** @} */
 
 /**
- * @name Response records
- * What the callbacks of some requests receive, valid while the callback runs with everything in
- * them.
+ * @defgroup ims_poc_answers Response records
+ * @brief What the callbacks of some requests receive, valid while the callback runs with everything
+ *        in them.
  * @{
  */
 
@@ -272,9 +336,11 @@ typedef struct ims_poc_transfer_result_s {
 /** @} */
 
 /**
- * @name Event records
- * What an #ims_notification_cb receives, by id. The record and everything in it is valid while the
- * callback runs; the application releases nothing.
+ * @defgroup ims_poc_events Event records
+ * @brief What an #ims_notification_cb receives, by id.
+ *
+ * The record and everything in it is valid while the callback runs; the application releases
+ * nothing.
  *
  * A nested value that the service left out, an empty dictionary or list or a value of another type,
  * does not hold up its event: a pointer to it is NULL, an embedded record or a set is all 0.
@@ -460,12 +526,24 @@ typedef struct ims_poc_file_terminated_s {
 /** @} */
 
 /**
+ * @defgroup ims_poc_requests Requests
+ * @brief Calls and the floor, recordings, messages and files.
+ *
+ * What all requests share is said in @ref ims_requests and @ref ims_errors. Where nothing else is
+ * said here, what is sent is the argument, or the record's fields in their order; the reply is
+ * `(i)`, the result, and the callback's data is NULL. What a callback's data is made of is what
+ * comes in the reply after the result; it is there whatever the result.
+ *
+ * Users go as an `aa{sv}`: of a list that is longer than its count the first ones, a shorter one as
+ * it is. A count below 1 is refused, whatever the list holds.
+ * @{
+ */
+
+/**
  * Places a call.
  *
- * The callback's data is a pointer to the second integer of the reply (`int32_t`).
- *
- * D-Bus: `PocMakeCall`, sends `(bbbsisvvi)`; expects `(ii)`: the result and an integer defined by
- * the service.
+ * D-Bus: `PocMakeCall`, sends `(bbbsisvvi)`; expects `(ii)`: the callback's data is an `int32_t *`
+ * to the second member, defined by the service.
  *
  * @param info  the call
  */
@@ -475,16 +553,12 @@ IMS_API int ims_poc_call_make_call(ims_h handle, const ims_poc_make_call_s *info
 /**
  * Starts a conference of users who are no group yet.
  *
- * A count below 1 is refused, whatever the list holds. Of a longer list the first users are sent; a
- * shorter one is sent as it is.
- *
- * The callback's data is a pointer to the second integer of the reply (`int32_t`).
- *
  * D-Bus: `PocMakeAdHocConfCall`, sends `(vbvssbibivi)`: the record's fields, the users as an
- * `aa{sv}` inside a `v`; expects `(ii)`: the result and an integer defined by the service.
+ * `aa{sv}` inside a `v`; expects `(ii)`: the callback's data is an `int32_t *` to the second
+ * member, defined by the service.
  *
  * @param info  the conference
- * @return see @ref requests; #IMS_ERROR_INVALID_PARAMETER also when the count is below 1
+ * @return #IMS_ERROR_INVALID_PARAMETER also when the count is below 1
  */
 IMS_API int ims_poc_make_ad_hoc_call(ims_h handle, const ims_poc_ad_hoc_call_s *info,
                                      ims_response_cb callback, void *user_data);
@@ -492,14 +566,11 @@ IMS_API int ims_poc_make_ad_hoc_call(ims_h handle, const ims_poc_ad_hoc_call_s *
 /**
  * Adds users to an ad hoc conference.
  *
- * A count below 1 is refused, whatever the list holds. Of a longer list the first users are sent; a
- * shorter one is sent as it is.
- *
  * D-Bus: `PocAddUsersToAdHocConfCall`, sends `(iiiviv)`: the record's fields, the users as an
- * `aa{sv}` and the content as an `a{sv}`, each inside a `v`; expects `(i)`: the result.
+ * `aa{sv}` and the content as an `a{sv}`, each inside a `v`.
  *
  * @param info  the users
- * @return see @ref requests; #IMS_ERROR_INVALID_PARAMETER also when the count is below 1
+ * @return #IMS_ERROR_INVALID_PARAMETER also when the count is below 1
  */
 IMS_API int ims_poc_add_users_to_ad_hoc_call(ims_h handle, const ims_poc_users_s *info,
                                              ims_response_cb callback, void *user_data);
@@ -507,14 +578,11 @@ IMS_API int ims_poc_add_users_to_ad_hoc_call(ims_h handle, const ims_poc_users_s
 /**
  * Removes users from an ad hoc conference.
  *
- * A count below 1 is refused, whatever the list holds. Of a longer list the first users are sent; a
- * shorter one is sent as it is.
- *
  * D-Bus: `PocRemoveUsersFromAdHocConfCall`, sends `(iiiviv)`: the record's fields, the users as an
- * `aa{sv}` and the content as an `a{sv}`, each inside a `v`; expects `(i)`: the result.
+ * `aa{sv}` and the content as an `a{sv}`, each inside a `v`.
  *
  * @param info  the users
- * @return see @ref requests; #IMS_ERROR_INVALID_PARAMETER also when the count is below 1
+ * @return #IMS_ERROR_INVALID_PARAMETER also when the count is below 1
  */
 IMS_API int ims_poc_remove_users_from_ad_hoc_call(ims_h handle, const ims_poc_users_s *info,
                                                   ims_response_cb callback, void *user_data);
@@ -575,7 +643,7 @@ IMS_API int ims_poc_call_request_floor(ims_h handle, const ims_poc_floor_s *info
 /**
  * Releases the floor.
  *
- * D-Bus: `PocReleaseFloor`, sends `(iv)`: the session and the set; expects `(i)`: the result.
+ * D-Bus: `PocReleaseFloor`, sends `(iv)`: the session and the set.
  *
  * @param info  the session and its set; the other fields are not looked at
  */
@@ -591,12 +659,12 @@ IMS_API int ims_poc_call_release_floor(ims_h handle, const ims_poc_floor_s *info
  * The callback's data is the first #ims_poc_floor_status_s, NULL when there is none, whatever the
  * result.
  *
- * D-Bus: `PocRequestFloorStatus`, sends `(v)`: the values as an `ai`; expects `(i\@aa{sv})`: the
+ * D-Bus: `PocRequestFloorStatus`, sends `(v)`: the values as an `ai`; expects `(iaa{sv})`: the
  * result and one dictionary a session, of `session_id`, `status`, `participant_count` and
  * `floor_taken_uri`.
  *
  * @param query  what to ask for
- * @return see @ref requests; #IMS_ERROR_INVALID_PARAMETER also for a count out of range
+ * @return #IMS_ERROR_INVALID_PARAMETER also for a count out of range
  */
 IMS_API int ims_poc_call_request_floor_status(ims_h handle, const ims_poc_floor_query_s *query,
                                               ims_response_cb callback, void *user_data);
@@ -646,7 +714,7 @@ IMS_API int ims_poc_set_channel(ims_h handle, const ims_poc_value_pair_s *info,
  *
  * The callback's data is an #ims_poc_recording_info_s, whatever the result.
  *
- * D-Bus: `PocStartCallRecording`, sends `(iiis)`; expects `(i\@a{sv})`: the result and a dictionary
+ * D-Bus: `PocStartCallRecording`, sends `(iiis)`; expects `(ia{sv})`: the result and a dictionary
  * of `session_id`, `record_state`, `record_error` and `record_file_path`.
  *
  * @param info  what to record
@@ -697,10 +765,9 @@ IMS_API int ims_poc_cancel_call_recording(ims_h handle, int32_t value, ims_respo
 /**
  * Sends a message.
  *
- * The callback's data is an #ims_poc_msg_result_s.
- *
  * D-Bus: `PocSendMsg`, sends `(isvissivi)`: the record's fields, the targets as an `aa{sv}` and the
- * originator as an `a{sv}`, each inside a `v`; expects `(iiii)`: the result and three integers.
+ * originator as an `a{sv}`, each inside a `v`; expects `(iiii)`; the callback's data is an
+ * #ims_poc_msg_result_s.
  *
  * @param message  the message
  */
@@ -710,11 +777,9 @@ IMS_API int ims_poc_send_msg(ims_h handle, const ims_poc_message_s *message,
 /**
  * Tells that a received message was delivered or read.
  *
- * The callback's data is an #ims_poc_msg_result_s.
- *
  * D-Bus: `PocSendReceivedMsgNoti`, sends `(isvvsi)`: the record's fields, the originator as an
- * `a{sv}` and the parties as an `aa{sv}`, each inside a `v`; expects `(iiii)`: the result and three
- * integers.
+ * `a{sv}` and the parties as an `aa{sv}`, each inside a `v`; expects `(iiii)`; the callback's data
+ * is an #ims_poc_msg_result_s.
  *
  * @param notification  the notice
  */
@@ -725,11 +790,9 @@ IMS_API int ims_poc_send_received_msg_notification(ims_h handle,
 /**
  * Offers a file.
  *
- * The callback's data is an #ims_poc_transfer_result_s.
- *
  * D-Bus: `PocTransferFile`, sends `(ivvv)`: the record's fields, the targets as an `aa{sv}`, the
- * attributes and the originator as an `a{sv}`, each inside a `v`; expects `(iii)`: the result and
- * two integers.
+ * attributes and the originator as an `a{sv}`, each inside a `v`; expects `(iii)`; the callback's
+ * data is an #ims_poc_transfer_result_s.
  *
  * @param transfer  the file
  */
@@ -739,9 +802,8 @@ IMS_API int ims_poc_transfer_file(ims_h handle, const ims_poc_file_transfer_s *t
 /**
  * Accepts a file that is offered.
  *
- * The callback's data is an #ims_poc_transfer_result_s.
- *
- * D-Bus: `PocAcceptFileTransfer`, sends `(is)`; expects `(iii)`: the result and two integers.
+ * D-Bus: `PocAcceptFileTransfer`, sends `(is)`; expects `(iii)`; the callback's data is an
+ * #ims_poc_transfer_result_s.
  *
  * @param answer  the transfer
  */
@@ -751,10 +813,8 @@ IMS_API int ims_poc_accept_file_transfer(ims_h handle, const ims_poc_transfer_an
 /**
  * Rejects a file that is offered.
  *
- * The callback's data is an #ims_poc_transfer_result_s.
- *
- * D-Bus: `PocARejectFileTransfer`, spelled so, sends `(is)`; expects `(iii)`: the result and two
- * integers.
+ * D-Bus: `PocARejectFileTransfer`, spelled so, sends `(is)`; expects `(iii)`; the callback's data
+ * is an #ims_poc_transfer_result_s.
  *
  * @param answer  the transfer
  */
@@ -764,9 +824,8 @@ IMS_API int ims_poc_reject_file_transfer(ims_h handle, const ims_poc_transfer_an
 /**
  * Ends a file transfer before its time.
  *
- * The callback's data is an #ims_poc_transfer_result_s.
- *
- * D-Bus: `PocCancelFileTransfer`, sends `(i)`; expects `(iii)`: the result and two integers.
+ * D-Bus: `PocCancelFileTransfer`, sends `(i)`; expects `(iii)`; the callback's data is an
+ * #ims_poc_transfer_result_s.
  *
  * @param value  defined by the service
  */
@@ -782,6 +841,10 @@ IMS_API int ims_poc_cancel_file_transfer(ims_h handle, int32_t value, ims_respon
  */
 IMS_API int ims_poc_send_keep_alive(ims_h handle, int32_t value, ims_response_cb callback,
                                     void *user_data);
+
+/** @} */
+
+/** @} */
 
 #ifdef __cplusplus
 }

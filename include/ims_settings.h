@@ -589,12 +589,12 @@ IMS_API void ims_global_settings_clear(ims_global_settings_s *settings);
 /**
  * Reads the list of profiles.
  *
- * A list that is empty, or whose count is not the number of entries that
- * came, is reported as success with @p list->count 0. Of more than #IMS_PROFILE_LIST_CAPACITY
- * profiles the first ones are kept.
+ * A list that is empty, or whose count is not the number of entries that came, is reported as
+ * success with @p list->count 0. Of more than #IMS_PROFILE_LIST_CAPACITY profiles the first ones
+ * are kept.
  *
- * D-Bus: `GetProfileList`, sends no parameters; expects `(iuaa{sv})`: the result, the count and
- * one dictionary a profile.
+ * D-Bus: `GetProfileList`, sends no parameters; expects `(iuaa{sv})`: the result, the count and one
+ * dictionary a profile.
  *
  * @param[in,out] list  receives the profiles. On a failure of the service itself, its count is the
  *                      reply's and no profile was written; otherwise untouched on failure
@@ -658,8 +658,7 @@ IMS_API int ims_set_network_environment(ims_h handle, int32_t environment_type,
 /**
  * Reads the network environment.
  *
- * The service's own result is not looked at: whatever it is, the type that
- * came with it is stored.
+ * The service's own result is not looked at: whatever it is, the type that came with it is stored.
  *
  * D-Bus: `GetNetworkEnvironment`, sends no parameters; expects `(ii)`: the result and the type.
  *

@@ -5,15 +5,46 @@
 #define KELVO_IMS_VT_H
 
 /**
- * @file ims_vt.h
+ * @file
  * @brief Video telephony: camera, preview, zoom, recording, casting, drawing surfaces.
+ */
+
+/**
+ * @defgroup ims_vt Video telephony
+ * @brief The picture of a video call: `org.kelvo.ims.Vt`.
  *
- * All methods are on the D-Bus interface `org.kelvo.ims.Vt`; there are no signals. None of them
- * carries the application id. Each expects `(i)`, the result, and its callback's data is NULL,
- * unless it says otherwise.
+ * The service does the media work; the library only steers it.
  *
- * The service does the media work and defines what the values mean: every field with a neutral name
- * such as `value_1` or `text_1`. The library passes them through unchanged.
+ * @section ims_vt_life The life of a picture
+ *
+ * All of it belongs to a session of @ref ims_call, and goes when the session ends. An application
+ * starts a camera, says where the near end's and the far end's video is drawn (surfaces of pixmaps,
+ * or windows), and then holds, hides, zooms, records or casts as its user wants. The callback of
+ * each request says whether the service has done it; there are no events.
+ *
+ * @code{.c}
+ * #include <ims.h>
+ *
+ * void on_started(ims_h handle, int result, void *data, void *user_data) {
+ *     const int32_t *session = user_data; // must live until now
+ *     const int32_t pixmaps[] = {101, 102};
+ *     const ims_vt_surface_s surface = {.session_id = *session, .count = 2, .entries = pixmaps};
+ *     if (result == 0)
+ *         ims_vt_set_near_end_surface(handle, &surface, NULL, NULL);
+ * }
+ *
+ * int show_me(ims_h handle, int32_t *session, int32_t which) {
+ *     const ims_vt_camera_s camera = {.session_id = *session, .value_1 = which};
+ *     return ims_vt_start_camera(handle, &camera, on_started, session);
+ * }
+ * @endcode
+ *
+ * What all requests share is said in @ref ims_requests and @ref ims_errors; values are the
+ * service's, see @ref ims_values. Sent are the argument, or the record's fields in their order: no
+ * method carries the application id. The reply is `(i)`, the result, and the callback's data is
+ * NULL, unless something else is said.
+ *
+ * @{
  */
 
 #include "ims_types.h"
@@ -23,8 +54,8 @@ extern "C" {
 #endif
 
 /**
- * @name Request records
- * Owned by the caller and read during the call only. A NULL text is sent as an empty one.
+ * @defgroup ims_vt_records Request records
+ * @brief Owned by the caller, read during the call only; a NULL text is sent as an empty one.
  * @{
  */
 
@@ -134,6 +165,12 @@ typedef struct ims_vt_buffer_s {
 } ims_vt_buffer_s;
 
 /** @} */
+
+/**
+ * @defgroup ims_vt_requests Requests
+ * @brief To show, hide, draw, record and cast video.
+ * @{
+ */
 
 /**
  * Starts a camera.
@@ -417,6 +454,10 @@ IMS_API int ims_vt_set_camera_buffer(ims_h handle, const ims_vt_buffer_s *info,
  */
 IMS_API int ims_vt_set_media_buffer(ims_h handle, const ims_vt_buffer_s *info,
                                     ims_response_cb callback, void *user_data);
+
+/** @} */
+
+/** @} */
 
 #ifdef __cplusplus
 }
