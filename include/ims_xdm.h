@@ -5,30 +5,73 @@
 #define KELVO_IMS_XDM_H
 
 /**
- * @file ims_xdm.h
+ * @file
  * @brief Group documents of push-to-talk: to create, to edit and to read.
+ */
+
+/**
+ * @defgroup ims_xdm Group documents
+ * @brief The documents of push-to-talk groups: `org.kelvo.ims.Xdm`.
  *
- * All methods are on the D-Bus interface `org.kelvo.ims.Xdm`. None of them carries the application
- * id. The service defines what the values mean; the library passes them through unchanged.
+ * @section ims_xdm_life The life of a group document
  *
- * @section xdm_records Records
+ * A group is a document that the network keeps, known by the group's URI: what the group is
+ * (#ims_xdm_group_properties_s), who is in it (#ims_xdm_member_list_s), and rules that say who may
+ * do what (#ims_xdm_group_rule_s). ims_xdm_create_group() makes it whole, the functions that add,
+ * remove and modify change a part, ims_xdm_delete_group() ends it. Others see a change when they
+ * fetch the document again: there are no events here. Calls to the group are made with @ref
+ * ims_poc.
+ *
+ * @code{.c}
+ * #include <ims.h>
+ * #include <stdio.h>
+ *
+ * void on_group(ims_h handle, int result, void *data, void *user_data) {
+ *     const ims_xdm_group_info_s *group = data; // gone after this function
+ *     if (group != NULL && group->group_properties != NULL)
+ *         printf("%s: %s\n", group->group_uri, group->group_properties->display_name);
+ * }
+ *
+ * int create(ims_h handle) {
+ *     ims_xdm_group_properties_s properties = {.display_name = "Crew", .max_participants = 8};
+ *     ims_xdm_member_entry_s members[] = {{.uri = "tel:+15550100"}, {.uri = "tel:+15550101"}};
+ *     ims_xdm_member_list_s list = {.contacts = members, .num_of_contacts = 2};
+ *     const ims_xdm_group_info_s group = {.group_uri = "sip:crew@groups.invalid",
+ *                                         .group_properties = &properties,
+ *                                         .group_member_list = &list};
+ *     return ims_xdm_create_group(handle, &group, NULL, NULL);
+ * }
+ *
+ * int look(ims_h handle) {
+ *     const ims_xdm_group_info_s group = {.group_uri = "sip:crew@groups.invalid"};
+ *     return ims_xdm_fetch_shared_group(handle, &group, on_group, NULL);
+ * }
+ * @endcode
+ *
+ * @section ims_xdm_records Records
  *
  * The same records go both ways. What an application hands over is read during the call only: it
  * stays the application's. What a callback receives is the library's and gone after the callback:
  * copy what is to be kept.
  *
- * - A text that is NULL is left out when it is sent, and NULL where the service left it out.
- * - A text in a buffer always ends with a zero byte when it is received, and is cut to what the
- *   buffer holds, never inside a UTF-8 character. A buffer without a zero byte is sent up to
- *   its last byte but one.
- * - An array is a pointer and a count. The count is sent as it is, the elements only when the
- *   pointer is set and the count at least 1: the array must then have that many. Received, an array
- *   is NULL when the service's count is not the number of elements that came; the count is the
- *   service's.
- * - A chain is linked through the field `next` and ends with NULL.
- * - A value that the service left out, or sent with another type, is 0, false or NULL. Unknown keys
- *   are ignored.
- * - Numbers travel as 64-bit integers and are cut to 32 bits when received.
+ *  - A text that is NULL is left out when it is sent, and NULL where the service left it out.
+ *  - A text in a buffer always ends with a zero byte when it is received, and is cut to what the
+ *    buffer holds, never inside a UTF-8 character. A buffer without a zero byte is sent up to its
+ *    last byte but one.
+ *  - An array is a pointer and a count. The count is sent as it is, the elements only when the
+ *    pointer is set and the count at least 1: the array must then have that many. Received, an
+ * array is NULL when the service's count is not the number of elements that came; the count is the
+ *    service's.
+ *  - A chain is linked through the field `next` and ends with NULL.
+ *  - A value that the service left out, or sent with another type, is 0, false or NULL. Unknown
+ * keys are ignored.
+ *  - Numbers travel as 64-bit integers and are cut to 32 bits when received.
+ *
+ * On the bus a record is a dictionary `a{sv}`, a chain or an array of records an `aa{sv}`; the keys
+ * are in the introspection data, dbus/interfaces/org.kelvo.ims.Xdm.xml. The values are the
+ * service's, see @ref ims_values.
+ *
+ * @{
  */
 
 #include "ims_types.h"
@@ -36,6 +79,12 @@
 #ifdef __cplusplus
 extern "C" {
 #endif
+
+/**
+ * @defgroup ims_xdm_document The document
+ * @brief A group, its properties, members and rules.
+ * @{
+ */
 
 /** The sizes of the texts that are held in records, with the zero byte. */
 enum {
@@ -218,6 +267,14 @@ typedef struct ims_xdm_group_info_s {
     ims_xdm_group_rule_s *group_rule_set;         /**< the first rule, or NULL */
 } ims_xdm_group_info_s;
 
+/** @} */
+
+/**
+ * @defgroup ims_xdm_changes Changes
+ * @brief What some requests take that is no part of a document.
+ * @{
+ */
+
 /** A service of a group's sessions, for ims_xdm_modify_group_session_service_list(). */
 typedef struct ims_xdm_session_service_s {
     int32_t group_app;        /**< which service */
@@ -242,6 +299,14 @@ typedef struct ims_xdm_default_group_s {
     const char *group_uri;       /**< the group's URI; NULL is sent as an empty text */
     bool is_default_group;       /**< whether the group is the list's default */
 } ims_xdm_default_group_s;
+
+/** @} */
+
+/**
+ * @defgroup ims_xdm_answers Answers
+ * @brief What the callbacks of the reading requests receive, valid while the callback runs.
+ * @{
+ */
 
 /** All shared groups, as the callback of ims_xdm_fetch_all_shared_groups() receives them. */
 typedef struct ims_xdm_shared_group_list_s {
@@ -386,6 +451,20 @@ typedef struct ims_xdm_participant_info_s {
     int32_t num_of_conf_participants;                   /**< how many conf_participant_entry */
 } ims_xdm_participant_info_s;
 
+/** @} */
+
+/**
+ * @defgroup ims_xdm_requests Requests
+ * @brief To create, change, read and delete group documents.
+ *
+ * What all requests share is said in @ref ims_requests and @ref ims_errors. Where nothing else is
+ * said, sent are the arguments in their order, or a record's fields in theirs: no method carries
+ * the application id. The reply is `(i)`, the result, and the callback's data is NULL. A reading
+ * request expects `(ia{sv})`: the result, and the record that is named with it, which its
+ * callback's data points to; NULL when the result is not 0.
+ * @{
+ */
+
 /**
  * Creates a group document.
  *
@@ -412,10 +491,8 @@ IMS_API int ims_xdm_delete_group(ims_h handle, const char *group_uri, ims_respon
 /**
  * Asks for one group document.
  *
- * The callback's data is an #ims_xdm_group_info_s, NULL when the result is not 0.
- *
  * D-Bus: `XdmFetchSharedGroup`, sends `(ss)`: the URI and the channel of the record; expects
- * `(i\@a{sv})`: the result and the record as a dictionary.
+ * `(ia{sv})`: #ims_xdm_group_info_s.
  *
  * @param group  the group: its group_uri and channel_id are read, a NULL channel_id as an empty
  *               text
@@ -426,10 +503,7 @@ IMS_API int ims_xdm_fetch_shared_group(ims_h handle, const ims_xdm_group_info_s 
 /**
  * Asks for all group documents.
  *
- * The callback's data is an #ims_xdm_shared_group_list_s, NULL when the result is not 0.
- *
- * D-Bus: `XdmFetchAllSharedGroups`, sends `(s)`: the text; expects `(i\@a{sv})`: the result and the
- * record as a dictionary.
+ * D-Bus: `XdmFetchAllSharedGroups`, sends `(s)`; expects `(ia{sv})`: #ims_xdm_shared_group_list_s.
  *
  * @param text  defined by the service; NULL is sent as an empty text
  */
@@ -439,10 +513,8 @@ IMS_API int ims_xdm_fetch_all_shared_groups(ims_h handle, const char *text,
 /**
  * Asks for the lists of groups that the user takes part in.
  *
- * The callback's data is an #ims_xdm_participant_groups_s, NULL when the result is not 0.
- *
- * D-Bus: `XdmFetchAllParticipantGroups`, sends `(s)`: the text; expects `(i\@a{sv})`: the result
- * and the record as a dictionary.
+ * D-Bus: `XdmFetchAllParticipantGroups`, sends `(s)`; expects `(ia{sv})`:
+ * #ims_xdm_participant_groups_s.
  *
  * @param text  defined by the service; NULL is sent as an empty text
  */
@@ -452,10 +524,7 @@ IMS_API int ims_xdm_fetch_all_participant_groups(ims_h handle, const char *text,
 /**
  * Asks for a shared user profile.
  *
- * The callback's data is an #ims_xdm_user_profile_s, NULL when the result is not 0.
- *
- * D-Bus: `XdmFetchSharedUserProfile`, sends `(s)`: the text; expects `(i\@a{sv})`: the result and
- * the record as a dictionary.
+ * D-Bus: `XdmFetchSharedUserProfile`, sends `(s)`; expects `(ia{sv})`: #ims_xdm_user_profile_s.
  *
  * @param text  defined by the service; NULL is sent as an empty text
  */
@@ -641,7 +710,8 @@ IMS_API int ims_xdm_modify_group_age_restriction(ims_h handle, const char *group
 /**
  * Sets what one member of a group is.
  *
- * D-Bus: `XdmModifyGroupAttributes`, sends `(sssbbiba{sv})`.
+ * D-Bus: `XdmModifyGroupAttributes`, sends `(sssbbiba{sv})`: the group, then the member's uri,
+ * disp_name, stt, active, type, auto_join and status.
  *
  * @param attributes  the group and the member. A NULL disp_name is sent as an empty text; a NULL
  *                    member is refused without a log line
@@ -663,15 +733,16 @@ IMS_API int ims_xdm_modify_default_group(ims_h handle, const ims_xdm_default_gro
 /**
  * Asks who takes part in a session.
  *
- * The callback's data is an #ims_xdm_participant_info_s, NULL when the result is not 0.
- *
- * D-Bus: `XdmGetParticipantInfo`, sends `(s)`: the text; expects `(i\@a{sv})`: the result and the
- * record as a dictionary.
+ * D-Bus: `XdmGetParticipantInfo`, sends `(s)`; expects `(ia{sv})`: #ims_xdm_participant_info_s.
  *
  * @param text  the session or group to ask about
  */
 IMS_API int ims_xdm_get_participant_info(ims_h handle, const char *text, ims_response_cb callback,
                                          void *user_data);
+
+/** @} */
+
+/** @} */
 
 #ifdef __cplusplus
 }
