@@ -50,6 +50,26 @@
  *  - #IMS_ERROR_PERMISSION_DENIED (queries and ims_init()): the bus or the service refused the
  *    caller. A request has #IMS_RESPONSE_ACCESS_DENIED in its callback instead.
  *
+ * So a request is answered for twice: by what it returns, and, when that is #IMS_ERROR_NONE, by
+ * what its callback receives.
+ *
+ * @code{.c}
+ * #include <ims_types.h>
+ * #include <stdio.h>
+ *
+ * void on_done(ims_h handle, int result, void *data, void *user_data) {
+ *     const char *what = user_data;
+ *     if (result == 0)
+ *         printf("%s: done\n", what);
+ *     else if (result == IMS_RESPONSE_FAILED)
+ *         printf("%s: no answer\n", what);
+ *     else if (result == IMS_RESPONSE_ACCESS_DENIED)
+ *         printf("%s: not allowed\n", what);
+ *     else
+ *         printf("%s: the service says %d\n", what, result);
+ * }
+ * @endcode
+ *
  * @section ims_values Values
  *
  * What is *defined by the service* the library passes through unchanged and checks in no way: ids,
