@@ -1,7 +1,8 @@
 #!/usr/bin/env bash
 # SPDX-License-Identifier: Apache-2.0
-# The checks beyond the tests: formatting, shell scripts, the library and the programs with a second
-# compiler and under sanitizers, static analysis, and an installation that others can build against.
+# The checks beyond the tests: formatting, shell scripts, the reference documentation, the library and
+# the programs with a second compiler and under sanitizers, static analysis, and an installation that
+# others can build against.
 set -euo pipefail
 cd "$(dirname "$0")/.."
 
@@ -14,6 +15,10 @@ git ls-files '*.c' '*.h' '*.cpp' '*.hpp' | xargs clang-format --dry-run --Werror
 
 step "Shell scripts"
 git ls-files '*.sh' .ci/run | xargs shellcheck
+
+step "Reference documentation"
+scripts/check-reference.py --self-test
+scripts/check-reference.py
 
 # Sanitized are the library with its tests, and the programs. The tests that run the programs are
 # those that the test command has built: to build them again would take longer than all else here.

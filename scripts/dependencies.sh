@@ -9,7 +9,7 @@ set -euo pipefail
 build=(cmake dbus-daemon g++ libcli11-dev libfmt-dev libglib2.0-dev libgtest-dev libgmock-dev
     ninja-build nlohmann-json3-dev pkg-config python3 shared-mime-info)
 bench=(libbenchmark-dev valgrind)
-check=(clang clang-format clang-tidy libclang-rt-14-dev shellcheck)
+check=(clang clang-format clang-tidy doxygen libclang-rt-14-dev shellcheck)
 
 case "${1:-}" in
 build) wanted=("${build[@]}") ;;
