@@ -46,6 +46,7 @@
  *     ims_call_incoming_s *call = event;
  *     char *texts[] = {call->number, call->text_1, call->text_2,
  *                      call->text_3, call->text_4, call->text_5};
+ *     // the session and the kind of call, as the stand-in takes them
  *     ims_call_id_info_s answer = {.session_id = call->session_id, .value_1 = call->call_type};
  *     ims_call_answer_call(handle, &answer, NULL, NULL);
  *     for (size_t i = 0; i < sizeof texts / sizeof *texts; ++i)
@@ -335,7 +336,7 @@ typedef struct ims_call_dtmf_event_s {
 
 /**
  * @defgroup ims_call_list The call list
- * @brief What calls there are now: a query.
+ * @brief What calls there are now: a query, see @ref ims_requests.
  * @{
  */
 

@@ -45,14 +45,16 @@
  *
  * void on_made(ims_h handle, int result, void *data, void *user_data) {
  *     if (result == 0)
- *         *(int32_t *)user_data = *(int32_t *)data; // the session, as the stand-in has it
+ *         *(int32_t *)user_data = *(int32_t *)data; // the session, says the stand-in
  * }
  *
  * int call(ims_h handle, const char *group, int32_t *session) {
+ *     // whom to call and the kind of call, as the stand-in takes them
  *     const ims_poc_make_call_s info = {.text_1 = group, .value_1 = 1};
  *     int error = ims_set_notification_cb(handle, IMS_NOTI_POC_CALL_FLOOR_GRANTED, on_floor, NULL);
- *     return error == IMS_ERROR_NONE ? ims_poc_call_make_call(handle, &info, on_made, session) :
- * error;
+ *     if (error == IMS_ERROR_NONE)
+ *         error = ims_poc_call_make_call(handle, &info, on_made, session);
+ *     return error;
  * }
  *
  * int press(ims_h handle, int32_t session) { // once the call is established

@@ -17,8 +17,8 @@
  *
  * What is set is kept by the network for the subscription, and acts on its calls whether or not an
  * application runs. A set request changes it; its callback says whether the network has. A get
- * request asks for it: the callback receives a list, an entry for each service class that is
- * told of. There are no events.
+ * request asks for it: its callback receives a list of what is set for which service class. There
+ * are no events.
  *
  * @code{.c}
  * #include <ims.h>
