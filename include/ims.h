@@ -45,7 +45,11 @@
  *
  * static void on_status(ims_h handle, int noti_id, void *event, void *user_data) {
  *     const ims_registration_info_s *info = event; // gone after this function
- *     printf(info->registered ? "registered\n" : "not registered\n");
+ *     printf("%s\n", info->registered ? "registered" : "not registered");
+ * }
+ *
+ * static void on_answer(ims_h handle, int result, void *data, void *user_data) {
+ *     printf("result %d\n", result);
  *     g_main_loop_quit(user_data);
  * }
  *
@@ -54,9 +58,9 @@
  *     if (ims_init(0, &handle) != IMS_ERROR_NONE)
  *         return 1;
  *     GMainLoop *loop = g_main_loop_new(NULL, FALSE);
- *     if (ims_set_notification_cb(handle, IMS_NOTI_REG_REGISTRATION_STATUS, on_status, loop) ==
- *         IMS_ERROR_NONE)
- *         g_main_loop_run(loop); // replies and events are delivered here
+ *     ims_set_notification_cb(handle, IMS_NOTI_REG_REGISTRATION_STATUS, on_status, NULL);
+ *     if (ims_register_application(handle, on_answer, loop) == IMS_ERROR_NONE)
+ *         g_main_loop_run(loop); // answers and events are delivered here
  *     ims_deinit(handle);
  *     g_main_loop_unref(loop);
  *     return 0;

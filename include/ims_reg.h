@@ -37,9 +37,13 @@
  *
  * int follow(ims_h handle) {
  *     ims_registration_info_s now;
- *     int error = ims_set_notification_cb(handle, IMS_NOTI_REG_REGISTRATION_STATUS, on_status,
- * NULL); if (error == IMS_ERROR_NONE) error = ims_get_registration_info(handle, &now); if (error ==
- * IMS_ERROR_NONE) on_status(handle, IMS_NOTI_REG_REGISTRATION_STATUS, &now, NULL); return error;
+ *     int error =
+ *         ims_set_notification_cb(handle, IMS_NOTI_REG_REGISTRATION_STATUS, on_status, NULL);
+ *     if (error == IMS_ERROR_NONE)
+ *         error = ims_get_registration_info(handle, &now);
+ *     if (error == IMS_ERROR_NONE)
+ *         on_status(handle, IMS_NOTI_REG_REGISTRATION_STATUS, &now, NULL);
+ *     return error;
  * }
  * @endcode
  *
