@@ -93,7 +93,8 @@ IMS_API int ims_get_registration_info(ims_h handle, ims_registration_info_s *inf
  * There is no argument that says on or off: the request itself means on. ims_register_application()
  * registers again.
  *
- * D-Bus: `EnableFlightMode`, sends no parameters; the callback's data is NULL.
+ * D-Bus: `EnableFlightMode`, sends no parameters; expects `(i)`: the result. The callback's data
+ * is NULL.
  *
  * @param handle  not checked: must not be NULL
  */

@@ -95,6 +95,8 @@ PLANTED = [
     ("include/ims_reg.h", "IMS_API int ims_get_registration_info(",
      "IMS_API int ims_planted_get(ims_h handle);\n\n/** Sound. @param info the record */\n"
      "IMS_API int ims_get_registration_info(", "info' of command @param is not found"),
+    ("include/ims_reg.h", "/** @} */", "IMS_API int ims_planted_set(ims_h handle);\n/** @} */",
+     "ims_planted_set(ims_h handle) (function)"),
     ("include/ims_login.h", "} ims_login_state_s;",
      "    int32_t planted_field;\n} ims_login_state_s;", "planted_field (variable)"),
     ("include/ims_login.h", "/** @} */", "#define IMS_PLANTED_MACRO 1\n/** @} */",
