@@ -52,7 +52,7 @@ StandIn::StandIn(const Options &options, const Log &log, MainLoop &loop)
       login_interface_(logins_), call_interface_(calls_, ussd_), sms_interface_(centre_),
       ss_interface_(services_), settings_interface_(settings_), vt_interface_(video_),
       ptt_interface_(ptt_calls_, ptt_recorder_, ptt_messages_, ptt_files_),
-      xdm_interface_(groups_, plan_, registrations_, [this](int slot) {
+      group_interface_(groups_, plan_, registrations_, [this](int slot) {
           std::vector<ParticipantInfo> sessions;
           for (const PttRunningCall &call : ptt_calls_.running(slot))
               sessions.push_back(participant_info(call));
@@ -69,7 +69,7 @@ StandIn::StandIn(const Options &options, const Log &log, MainLoop &loop)
     service_.add(settings_interface_.describe());
     service_.add(vt_interface_.describe());
     service_.add(ptt_interface_.describe());
-    service_.add(xdm_interface_.describe());
+    service_.add(group_interface_.describe());
 }
 
 std::optional<std::string> StandIn::restore(const std::string &state_directory) {

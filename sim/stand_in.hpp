@@ -72,7 +72,7 @@ class StandIn {
     SettingsInterface settings_interface_;
     VtInterface vt_interface_;
     PttInterface ptt_interface_;
-    XdmInterface xdm_interface_;
+    GroupInterface group_interface_;
 };
 
 } // namespace sim

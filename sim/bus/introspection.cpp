@@ -2,6 +2,7 @@
 #include "sim/bus/introspection.hpp"
 
 #include <algorithm>
+#include <fmt/format.h>
 
 namespace sim::introspection {
 

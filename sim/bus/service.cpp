@@ -1,10 +1,13 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "sim/bus/service.hpp"
 
+#include "sim/bus/form.hpp"
 #include "sim/bus/introspection.hpp"
+#include "sim/bus/wire.hpp"
 
 #include <algorithm>
 #include <fstream>
+#include <utility>
 
 namespace sim {
 

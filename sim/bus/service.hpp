@@ -6,68 +6,16 @@
 #include "sim/base/result.hpp"
 #include "sim/bus/applications.hpp"
 #include "sim/bus/bus.hpp"
-#include "sim/bus/wire.hpp"
+#include "sim/bus/interface.hpp"
 
-#include <functional>
-#include <map>
 #include <optional>
 #include <span>
 #include <string>
 #include <string_view>
-#include <tuple>
+#include <variant>
 #include <vector>
 
 namespace sim {
-
-// How a method learns which application asks.
-enum class Caller {
-    kAnybody,
-    kFirstArgument, // the application id comes first
-    kLastArgument,  // ... or last
-    kConnection,    // the connection must have registered on the slot
-};
-
-// A method call whose signature has been checked.
-struct Request {
-    int slot = -1;
-    std::string connection;
-    Variant arguments;
-
-    template <typename... Ts>
-    std::tuple<Ts...> unpack() const {
-        return wire::unpack<Ts...>(arguments.get());
-    }
-};
-
-using Handler = std::function<Answer<Variant>(const Request &)>;
-
-// Signatures are those of the whole body in parentheses, "()" for none.
-struct Method {
-    std::string_view member;
-    std::string_view in;
-    std::string_view out;
-    Caller caller;
-    Handler handler;
-    std::size_t result_index = 0;          // where in the reply the result stands
-    std::optional<std::size_t> password{}; // the argument that the log does not show
-};
-
-struct SignalInfo {
-    std::string_view member;
-    std::string_view signature;
-};
-
-// What an event becomes on the wire.
-struct Signal {
-    std::string_view member;
-    Variant body;
-};
-
-struct Interface {
-    std::string_view name;
-    std::vector<Method> methods;
-    std::span<const SignalInfo> signals;
-};
 
 // The objects on the bus: finds the method that a call means, checks its signature, lets the
 // module answer and writes the log.
@@ -131,29 +79,5 @@ class Service {
     bool handling_ = false;
     std::vector<PendingSignal> pending_;
 };
-
-// A module's table holds pointers to its own members; this makes them methods of that module.
-template <typename Module>
-struct MethodRow {
-    std::string_view member;
-    std::string_view in;
-    std::string_view out;
-    Caller caller;
-    Answer<Variant> (Module::*handler)(const Request &);
-    std::size_t result_index = 0;
-    std::optional<std::size_t> password{};
-};
-
-template <typename Module>
-std::vector<Method> bind_methods(Module &module, std::span<const MethodRow<Module>> rows) {
-    std::vector<Method> methods;
-    for (const auto &row : rows)
-        methods.push_back({row.member, row.in, row.out, row.caller,
-                           [&module, handler = row.handler](const Request &request) {
-                               return (module.*handler)(request);
-                           },
-                           row.result_index, row.password});
-    return methods;
-}
 
 } // namespace sim

@@ -10,7 +10,6 @@
 #include <span>
 #include <string>
 #include <string_view>
-#include <tuple>
 #include <type_traits>
 #include <vector>
 
@@ -33,6 +32,8 @@ template <typename T>
 T read(GVariant *member) {
     if constexpr (std::same_as<T, std::int32_t>)
         return g_variant_get_int32(member);
+    else if constexpr (std::is_enum_v<T>)
+        return static_cast<T>(g_variant_get_int32(member));
     else if constexpr (std::same_as<T, std::uint8_t>)
         return g_variant_get_byte(member);
     else if constexpr (std::same_as<T, bool>)
@@ -41,22 +42,10 @@ T read(GVariant *member) {
         return g_variant_get_string(member, nullptr);
     else if constexpr (std::same_as<T, Numbers>)
         return numbers_in(member);
-    else if constexpr (std::same_as<T, Variant>)
-        return Variant(member);
     else {
         static_assert(std::same_as<T, Texts>);
         return texts_in(member);
     }
-}
-
-// All members of a tuple, in order. The types must be those of the checked signature.
-template <typename... Ts>
-std::tuple<Ts...> unpack(GVariant *tuple) {
-    gsize index = 0;
-    const auto next = [&]<typename T>(std::type_identity<T>) {
-        return read<T>(Variant::adopt(g_variant_get_child_value(tuple, index++)).get());
-    };
-    return std::tuple<Ts...>{next(std::type_identity<Ts>{})...};
 }
 
 inline GVariant *write(std::int32_t value) {
@@ -75,9 +64,6 @@ GVariant *write(const char *value) = delete; // would become a boolean
 inline GVariant *write(const std::string &value) {
     return g_variant_new_string(value.c_str());
 }
-inline GVariant *write(const Variant &value) {
-    return value.get();
-}
 inline GVariant *write(std::span<const std::int32_t> values) {
     return g_variant_new_variant(g_variant_new_fixed_array(G_VARIANT_TYPE_INT32, values.data(),
                                                            values.size(), sizeof(std::int32_t)));
@@ -91,29 +77,8 @@ inline GVariant *write(std::span<const std::string> values) {
 }
 template <typename T>
 requires std::is_enum_v<T> GVariant *write(T value) {
+    static_assert(std::same_as<std::underlying_type_t<T>, std::int32_t>);
     return g_variant_new_int32(static_cast<std::int32_t>(value));
-}
-
-template <typename... Ts>
-Variant pack(const Ts &...values) {
-    GVariant *const members[] = {write(values)...};
-    return Variant(g_variant_new_tuple(members, sizeof...(values)));
-}
-
-// An "aa{sv}" of one dictionary for each entry. `fill` is given the entry and a function that takes
-// a key and its value.
-template <typename T, typename Fill>
-Variant dictionaries(const std::vector<T> &entries, Fill fill) {
-    GVariantBuilder list;
-    g_variant_builder_init(&list, G_VARIANT_TYPE("aa{sv}"));
-    for (const auto &entry : entries) {
-        g_variant_builder_open(&list, G_VARIANT_TYPE_VARDICT);
-        fill(entry, [&](const char *key, const auto &value) {
-            g_variant_builder_add(&list, "{sv}", key, write(value));
-        });
-        g_variant_builder_close(&list);
-    }
-    return Variant(g_variant_builder_end(&list));
 }
 
 // Standard alphabet with padding, and nothing else.

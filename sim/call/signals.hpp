@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/bus/service.hpp"
+#include "sim/bus/interface.hpp"
 #include "sim/call/events.hpp"
 
 #include <span>

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "sim/group/interface.hpp"
 
-#include "sim/bus/replies.hpp"
+#include "sim/bus/ask.hpp"
 #include "sim/group/answer_fields.hpp"
 #include "sim/group/edits.hpp"
 #include "sim/group/profile.hpp"
@@ -15,187 +15,158 @@ namespace sim {
 
 namespace {
 
+template <typename T>
+concept GroupRecord = requires(GroupWriter &writer, const T &record) {
+    describe(writer, record);
+};
+
+} // namespace
+
+namespace wire {
+
+// Records come as they are written and are answered as they are read.
+template <GroupRecord Record>
+struct Form<Record> {
+    static constexpr std::string_view kSignature = "a{sv}";
+    static Answer<Record> read(const Variant &member) {
+        const auto dictionary = read_dictionary(member.get());
+        if (!dictionary)
+            return dictionary.refusal();
+        return read_record<Record>(*dictionary, GroupForm::kWritten);
+    }
+    static void write(Tuple &tuple, const Record &record) {
+        tuple.put(write_dictionary(write_record(record, GroupForm::kRead)).get());
+    }
+};
+
+template <GroupRecord Record>
+struct Form<const Record *> {
+    static constexpr std::string_view kSignature = Form<Record>::kSignature;
+    static void write(Tuple &tuple, const Record *record) { tuple.add(*record); }
+};
+
+template <GroupRecord Record>
+struct Form<std::vector<Record>> {
+    static constexpr std::string_view kSignature = "aa{sv}";
+    static Answer<std::vector<Record>> read(const Variant &member) {
+        const auto list = read_dictionaries(member.get());
+        if (!list)
+            return list.refusal();
+        return read_records<Record>(*list, GroupForm::kWritten);
+    }
+};
+
+} // namespace wire
+
+namespace {
+
 using std::int32_t;
 using std::string;
 using enum Caller;
 
-// Second arguments as an edit takes them.
-template <typename Record>
-Answer<Record> read_argument(GVariant *argument, std::type_identity<Record>) {
-    const auto dictionary = wire::read_dictionary(argument);
-    if (!dictionary)
-        return dictionary.refusal();
-    return read_record<Record>(*dictionary, GroupForm::kWritten);
-}
-
-template <typename Record>
-Answer<std::vector<Record>> read_argument(GVariant *argument,
-                                          std::type_identity<std::vector<Record>>) {
-    const auto list = wire::read_dictionaries(argument);
-    if (!list)
-        return list.refusal();
-    return read_records<Record>(*list, GroupForm::kWritten);
-}
-
-Answer<string> read_argument(GVariant *argument, std::type_identity<string>) {
-    return wire::read<string>(argument);
-}
-
 template <typename Argument>
-std::type_identity<Argument> argument_of(Status (*)(GroupDocument &, const Argument &));
-
+Argument argument_of(Status (*)(GroupDocument &, const Argument &));
 template <typename Property>
-std::type_identity<Property> type_of(Property GroupProperties::*);
+Property type_of(Property GroupProperties::*);
 
-template <typename Record>
-Answer<Variant> answer(const Record &record) {
-    return wire::pack(Result::kOk, wire::write_dictionary(write_record(record, GroupForm::kRead)));
+// What a function of sim/group/edits.hpp does with the second argument.
+template <auto kEdit>
+Status edit(GroupModel &groups, const string &uri, const decltype(argument_of(kEdit)) &argument) {
+    return groups.edit(uri, [&](GroupDocument &group) { return kEdit(group, argument); });
+}
+
+// The second argument becomes this property.
+template <auto kProperty>
+Status set_property(GroupModel &groups, const string &uri,
+                    const decltype(type_of(kProperty)) &property) {
+    return groups.edit(uri, [&](GroupDocument &group) -> Status {
+        made(group.properties).*kProperty = property;
+        return Done{};
+    });
+}
+
+Status modify_group_attributes(GroupModel &groups, const string &uri, const string &member,
+                               const string &name, bool stt, bool active, int32_t type,
+                               bool auto_join, const MemberStatus &status) {
+    const GroupMember contact{
+        member, name.empty() ? OptionalText() : name, stt, active, type, auto_join, status};
+    return groups.edit(uri, [&](GroupDocument &group) { return replace_contact(group, contact); });
 }
 
 } // namespace
 
-template <auto kEdit>
-Answer<Variant> XdmInterface::edit(const Request &request) {
-    const auto [uri, raw] = request.unpack<string, Variant>();
-    const auto argument = read_argument(raw.get(), decltype(argument_of(kEdit))());
-    if (!argument)
-        return argument.refusal();
-    return result_of(
-        groups_.edit(uri, [&](GroupDocument &group) { return kEdit(group, *argument); }));
+ParticipantGroups GroupInterface::fetch_participant_groups(int slot, const string &user) const {
+    return groups_.participant_groups(user_of(slot, user));
 }
 
-template <auto kProperty>
-Answer<Variant> XdmInterface::set_property(const Request &request) {
-    using Property = typename decltype(type_of(kProperty))::type;
-    const auto arguments = request.unpack<string, Property>();
-    return result_of(groups_.edit(std::get<0>(arguments), [&](GroupDocument &group) -> Status {
-        made(group.properties).*kProperty = std::get<1>(arguments);
-        return Done{};
-    }));
-}
-
-const MethodRow<XdmInterface> XdmInterface::kMethods[] = {
-    {"XdmCreateGroup", "(a{sv})", "(i)", kConnection, &XdmInterface::create_group},
-    {"XdmDeleteGroup", "(s)", "(i)", kConnection, &XdmInterface::delete_group},
-    {"XdmFetchSharedGroup", "(ss)", "(ia{sv})", kConnection, &XdmInterface::fetch_shared_group},
-    {"XdmFetchAllSharedGroups", "(s)", "(ia{sv})", kConnection,
-     &XdmInterface::fetch_all_shared_groups},
-    {"XdmFetchAllParticipantGroups", "(s)", "(ia{sv})", kConnection,
-     &XdmInterface::fetch_all_participant_groups},
-    {"XdmFetchSharedUserProfile", "(s)", "(ia{sv})", kConnection,
-     &XdmInterface::fetch_shared_user_profile},
-    {"XdmAddUserToSharedGroup", "(sa{sv})", "(i)", kConnection, &XdmInterface::edit<add_members>},
-    {"XdmRemoveUserFromSharedGroup", "(sa{sv})", "(i)", kConnection,
-     &XdmInterface::edit<remove_members>},
-    {"XdmAddGroupRule", "(saa{sv})", "(i)", kConnection, &XdmInterface::edit<add_rules>},
-    {"XdmModifyGroupRule", "(saa{sv})", "(i)", kConnection, &XdmInterface::edit<replace_rules>},
-    {"XdmDeleteGroupRule", "(ss)", "(i)", kConnection, &XdmInterface::edit<delete_rule>},
-    {"XdmModifyGroupDisplayName", "(ss)", "(i)", kConnection,
-     &XdmInterface::set_property<&GroupProperties::display_name>},
-    {"XdmModifyGroupSubject", "(ss)", "(i)", kConnection,
-     &XdmInterface::set_property<&GroupProperties::subject>},
-    {"XdmModifyGroupSearchable", "(sb)", "(i)", kConnection,
-     &XdmInterface::set_property<&GroupProperties::is_searchable>},
-    {"XdmModifyGroupInviteMembers", "(sb)", "(i)", kConnection,
-     &XdmInterface::set_property<&GroupProperties::inv_members>},
-    {"XdmModifyGroupMaxParticipants", "(si)", "(i)", kConnection,
-     &XdmInterface::set_property<&GroupProperties::max_participants>},
-    {"XdmModifyGroupAutoAdvertisements", "(sb)", "(i)", kConnection,
-     &XdmInterface::set_property<&GroupProperties::auto_grp_advertisements>},
-    {"XdmModifyGroupQoe", "(si)", "(i)", kConnection,
-     &XdmInterface::set_property<&GroupProperties::group_qoe>},
-    {"XdmModifyGroupSessionActivePolicy", "(sa{sv})", "(i)", kConnection,
-     &XdmInterface::edit<set_active_policy>},
-    {"XdmModifyGroupSessionServiceList", "(sa{sv})", "(i)", kConnection,
-     &XdmInterface::edit<set_service>},
-    {"XdmModifyGroupAgeRestriction", "(saa{sv})", "(i)", kConnection,
-     &XdmInterface::edit<set_age_restrictions>},
-    {"XdmModifyGroupAttributes", "(sssbbiba{sv})", "(i)", kConnection,
-     &XdmInterface::modify_group_attributes},
-    {"XdmModifyDefaultGroup", "(ssb)", "(i)", kConnection, &XdmInterface::modify_default_group},
-    {"XdmGetParticipantInfo", "(s)", "(ia{sv})", kConnection, &XdmInterface::get_participant_info},
-};
-
-Interface XdmInterface::describe() {
-    auto methods = bind_methods<XdmInterface>(*this, kMethods);
-    // The network keeps the groups: without a radio they cannot be reached.
-    for (auto &method : methods)
-        method.handler = [this, handler = std::move(method.handler)](const Request &request) {
-            const auto off = registrations_.radio_off(request.slot);
-            return off ? Outcome(*off) : handler(request);
-        };
-    return {"org.kelvo.ims.Xdm", std::move(methods), {}};
-}
-
-std::string XdmInterface::user_of(const Request &request) const {
-    const auto [user] = request.unpack<string>();
-    return user.empty() ? to_uri(plan_.number_of(request.slot)) : user;
-}
-
-Answer<Variant> XdmInterface::create_group(const Request &request) {
-    const auto [raw] = request.unpack<Variant>();
-    const auto group = read_argument(raw.get(), std::type_identity<GroupDocument>());
-    return group ? result_of(groups_.create(*group)) : group.refusal();
-}
-
-Answer<Variant> XdmInterface::delete_group(const Request &request) {
-    const auto [uri] = request.unpack<string>();
-    return result_of(groups_.remove(uri));
-}
-
-Answer<Variant> XdmInterface::fetch_shared_group(const Request &request) {
-    const auto [uri, channel] = request.unpack<string, string>();
-    const auto group = groups_.find(uri, channel);
-    return group ? answer(**group) : group.refusal();
-}
-
-Answer<Variant> XdmInterface::fetch_all_shared_groups(const Request &request) {
-    const auto [user] = request.unpack<string>();
-    return answer(groups_.shared_groups(user));
-}
-
-Answer<Variant> XdmInterface::fetch_all_participant_groups(const Request &request) {
-    return answer(groups_.participant_groups(user_of(request)));
-}
-
-Answer<Variant> XdmInterface::fetch_shared_user_profile(const Request &request) {
-    const auto user = user_of(request);
-    for (int slot = 0; slot < plan_.slots(); ++slot)
-        if (const auto uri = to_uri(plan_.number_of(slot)); same_user(uri, user))
-            return answer(profile_of_slot(slot, uri));
+Answer<UserProfile> GroupInterface::fetch_profile(int slot, const string &named) const {
+    const auto user = user_of(slot, named);
+    for (int each = 0; each < plan_.slots(); ++each)
+        if (const auto uri = to_uri(plan_.number_of(each)); same_user(uri, user))
+            return profile_of_slot(each, uri);
     return refuse(Result::kUnknownRecord, "nobody knows a profile of \"{}\"", user);
 }
 
-Answer<Variant> XdmInterface::modify_group_attributes(const Request &request) {
-    const auto [uri, member, name, stt, active, type, auto_join, raw] =
-        request.unpack<string, string, string, bool, bool, int32_t, bool, Variant>();
-    const auto status = read_argument(raw.get(), std::type_identity<MemberStatus>());
-    if (!status)
-        return status.refusal();
-    const GroupMember contact{
-        member, name.empty() ? OptionalText() : name, stt, active, type, auto_join, *status};
-    return result_of(
-        groups_.edit(uri, [&](GroupDocument &group) { return replace_contact(group, contact); }));
+Status GroupInterface::set_default(int slot, const string &list, const string &uri,
+                                   bool is_default) {
+    return groups_.set_default(user_of(slot, ""), list, uri, is_default);
 }
 
-Answer<Variant> XdmInterface::modify_default_group(const Request &request) {
-    const auto [list, uri, is_default] = request.unpack<string, string, bool>();
-    return result_of(
-        groups_.set_default(to_uri(plan_.number_of(request.slot)), list, uri, is_default));
-}
-
-Answer<Variant> XdmInterface::get_participant_info(const Request &request) {
-    const auto [text] = request.unpack<string>();
-    const auto sessions = sessions_(request.slot);
-    const auto session = std::ranges::find_if(sessions, [&, &named = text](const auto &running) {
-        return !named.empty() &&
-               (running.session_uri == named || running.list_service_uri == named);
+Answer<ParticipantInfo> GroupInterface::participant_info(int slot, const string &text) const {
+    const auto sessions = sessions_(slot);
+    const auto session = std::ranges::find_if(sessions, [&](const auto &running) {
+        return !text.empty() && (running.session_uri == text || running.list_service_uri == text);
     });
     if (session == sessions.end())
         return refuse(Result::kUnknownSession,
                       "the slot has no push-to-talk session \"{}\", and none of such a group",
                       text);
-    return answer(*session);
+    return *session;
+}
+
+string GroupInterface::user_of(int slot, const string &user) const {
+    return user.empty() ? to_uri(plan_.number_of(slot)) : user;
+}
+
+Interface GroupInterface::describe() {
+    using Properties = GroupProperties;
+    static constexpr MethodRow<GroupInterface, GroupModel> kMethods[] = {
+        {"XdmCreateGroup", ask<&GroupModel::create>, kConnection},
+        {"XdmDeleteGroup", ask<&GroupModel::remove>, kConnection},
+        {"XdmFetchSharedGroup", ask<&GroupModel::find>, kConnection},
+        {"XdmFetchAllSharedGroups", ask<&GroupModel::shared_groups>, kConnection},
+        {"XdmFetchAllParticipantGroups", ask<&GroupInterface::fetch_participant_groups>,
+         kConnection},
+        {"XdmFetchSharedUserProfile", ask<&GroupInterface::fetch_profile>, kConnection},
+        {"XdmAddUserToSharedGroup", ask<&edit<add_members>>, kConnection},
+        {"XdmRemoveUserFromSharedGroup", ask<&edit<remove_members>>, kConnection},
+        {"XdmAddGroupRule", ask<&edit<add_rules>>, kConnection},
+        {"XdmModifyGroupRule", ask<&edit<replace_rules>>, kConnection},
+        {"XdmDeleteGroupRule", ask<&edit<delete_rule>>, kConnection},
+        {"XdmModifyGroupDisplayName", ask<&set_property<&Properties::display_name>>, kConnection},
+        {"XdmModifyGroupSubject", ask<&set_property<&Properties::subject>>, kConnection},
+        {"XdmModifyGroupSearchable", ask<&set_property<&Properties::is_searchable>>, kConnection},
+        {"XdmModifyGroupInviteMembers", ask<&set_property<&Properties::inv_members>>, kConnection},
+        {"XdmModifyGroupMaxParticipants", ask<&set_property<&Properties::max_participants>>,
+         kConnection},
+        {"XdmModifyGroupAutoAdvertisements",
+         ask<&set_property<&Properties::auto_grp_advertisements>>, kConnection},
+        {"XdmModifyGroupQoe", ask<&set_property<&Properties::group_qoe>>, kConnection},
+        {"XdmModifyGroupSessionActivePolicy", ask<&edit<set_active_policy>>, kConnection},
+        {"XdmModifyGroupSessionServiceList", ask<&edit<set_service>>, kConnection},
+        {"XdmModifyGroupAgeRestriction", ask<&edit<set_age_restrictions>>, kConnection},
+        {"XdmModifyGroupAttributes", ask<modify_group_attributes>, kConnection},
+        {"XdmModifyDefaultGroup", ask<&GroupInterface::set_default>, kConnection},
+        {"XdmGetParticipantInfo", ask<&GroupInterface::participant_info>, kConnection},
+    };
+    auto methods = bind_methods(kMethods, *this, groups_);
+    // The network keeps the groups: without a radio they cannot be reached.
+    for (auto &method : methods)
+        method.handler = [this, handler = std::move(method.handler)](const Request &request) {
+            const auto off = registrations_.radio_off(request.slot);
+            return off ? Answer<Variant>(*off) : handler(request);
+        };
+    return {"org.kelvo.ims.Xdm", std::move(methods), {}};
 }
 
 } // namespace sim

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/bus/service.hpp"
+#include "sim/bus/interface.hpp"
 #include "sim/ptt/events.hpp"
 
 #include <span>

@@ -1,75 +1,55 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "sim/registration/interface.hpp"
 
-#include "sim/bus/replies.hpp"
+#include "sim/bus/ask.hpp"
+#include "sim/bus/tell.hpp"
 
 namespace sim {
 
 namespace {
 
-constexpr SignalInfo kSignals[] = {
-    {"RegistrationStatus", "(buuiii)"},
-    {"EmergencyRegistrationStatus", "(bui)"},
-};
+using enum Caller;
 
-struct ToSignal {
-    Signal operator()(const RegistrationInfo &e) const {
-        return {"RegistrationStatus",
-                wire::pack(e.registered, e.network, e.features, e.reason, e.sip_status, e.expires)};
-    }
-    Signal operator()(const EmergencyRegistrationStatus &e) const {
-        return {"EmergencyRegistrationStatus", wire::pack(e.registered, e.network, e.reason)};
-    }
-};
-
-constexpr std::size_t kResultComesLast = 6;
-
-} // namespace
-
-// RegisterApplication has two forms: a new application each time, or the one that this connection
-// already has.
-const MethodRow<RegistrationInterface> RegistrationInterface::kMethods[] = {
-    {"RegisterApplication", "(is)", "(ii)", Caller::kAnybody,
-     &RegistrationInterface::register_application},
-    {"RegisterApplication", "()", "(ii)", Caller::kAnybody,
-     &RegistrationInterface::register_connection},
-    {"GetRegistrationInfo", "()", "(buuiiii)", Caller::kConnection,
-     &RegistrationInterface::get_registration_info, kResultComesLast},
-    {"EnableFlightMode", "()", "(i)", Caller::kConnection,
-     &RegistrationInterface::enable_flight_mode},
-};
-
-Interface RegistrationInterface::describe() {
-    return {kName, bind_methods<RegistrationInterface>(*this, kMethods), kSignals};
-}
-
-Answer<Variant> RegistrationInterface::register_application(const Request &request) {
-    const auto [slot, name] = request.unpack<std::int32_t, std::string>();
+Answer<int> register_application(Applications &applications, const Request &request,
+                                 std::int32_t slot, const std::string &name) {
     if (slot != request.slot)
         return refuse(Result::kInvalidArgument, "slot {} is asked for at the object of slot {}",
                       slot, request.slot);
-    return wire::pack(Result::kOk, applications_.add(request.slot, request.connection, name));
+    return applications.add(request.slot, request.connection, name);
 }
 
-Answer<Variant> RegistrationInterface::register_connection(const Request &request) {
+ResultLast<RegistrationInfo> get_registration_info(const Registrations &registrations, int slot) {
+    return {registrations.info(slot)};
+}
+
+constexpr SignalTable kSignals{
+    SignalRow<RegistrationInfo>{"RegistrationStatus"},
+    SignalRow<EmergencyRegistrationStatus>{"EmergencyRegistrationStatus"},
+};
+
+} // namespace
+
+int RegistrationInterface::register_connection(const Request &request) {
     const auto present = applications_.latest(request.slot, request.connection);
     const int id = present ? *present : applications_.add(request.slot, request.connection, "");
     registrations_.switch_on(request.slot);
-    return wire::pack(Result::kOk, id);
+    return id;
 }
 
-Answer<Variant> RegistrationInterface::get_registration_info(const Request &request) {
-    const auto info = registrations_.info(request.slot);
-    return wire::pack(info.registered, info.network, info.features, info.reason, info.sip_status,
-                      info.expires, Result::kOk);
-}
-
-Answer<Variant> RegistrationInterface::enable_flight_mode(const Request &request) {
-    return result_of(registrations_.enable_flight_mode(request.slot));
+Interface RegistrationInterface::describe() {
+    // RegisterApplication has two forms: a new application each time, or the one that this
+    // connection already has.
+    static constexpr MethodRow<RegistrationInterface, Applications, Registrations> kMethods[] = {
+        {"RegisterApplication", ask<register_application>, kAnybody},
+        {"RegisterApplication", ask<&RegistrationInterface::register_connection>, kAnybody},
+        {"GetRegistrationInfo", ask<get_registration_info>, kConnection},
+        {"EnableFlightMode", ask<&Registrations::enable_flight_mode>, kConnection},
+    };
+    return {kName, bind_methods(kMethods, *this, applications_, registrations_), kSignals.infos()};
 }
 
 Signal to_signal(const RegistrationEvent &event) {
-    return std::visit(ToSignal{}, event);
+    return kSignals.signal_of(event);
 }
 
 } // namespace sim

@@ -2,7 +2,7 @@
 #pragma once
 
 #include "sim/bus/applications.hpp"
-#include "sim/bus/service.hpp"
+#include "sim/bus/interface.hpp"
 #include "sim/registration/registrations.hpp"
 
 namespace sim {
@@ -17,12 +17,7 @@ class RegistrationInterface {
     Interface describe();
 
   private:
-    Answer<Variant> register_application(const Request &request);
-    Answer<Variant> register_connection(const Request &request);
-    Answer<Variant> get_registration_info(const Request &request);
-    Answer<Variant> enable_flight_mode(const Request &request);
-
-    static const MethodRow<RegistrationInterface> kMethods[];
+    int register_connection(const Request &request);
 
     Applications &applications_;
     Registrations &registrations_;

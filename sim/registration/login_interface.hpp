@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/bus/service.hpp"
+#include "sim/bus/interface.hpp"
 #include "sim/registration/logins.hpp"
 
 namespace sim {
@@ -15,12 +15,6 @@ class LoginInterface {
     Interface describe();
 
   private:
-    Answer<Variant> login(const Request &request);
-    Answer<Variant> logout(const Request &request);
-    Answer<Variant> get_login_state(const Request &request);
-
-    static const MethodRow<LoginInterface> kMethods[];
-
     Logins &logins_;
 };
 

@@ -1,13 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "sim/settings/interface.hpp"
 
-#include "sim/bus/replies.hpp"
+#include "sim/bus/ask.hpp"
 
 namespace sim {
 
 namespace {
-
-using enum Caller;
 
 OfferedEntry offered(GVariant *entry) {
     const auto key = Variant::adopt(g_variant_get_child_value(entry, 0));
@@ -26,15 +24,23 @@ OfferedEntry offered(GVariant *entry) {
     return made;
 }
 
-// The dictionary that is the only argument.
-OfferedEntries entries_of(const Request &request) {
-    const auto dictionary = Variant::adopt(g_variant_get_child_value(request.arguments.get(), 0));
-    OfferedEntries entries;
-    for (gsize i = 0; i < g_variant_n_children(dictionary.get()); ++i)
-        entries.push_back(
-            offered(Variant::adopt(g_variant_get_child_value(dictionary.get(), i)).get()));
-    return entries;
-}
+} // namespace
+
+template <>
+struct wire::Form<OfferedEntries> {
+    static constexpr std::string_view kSignature = "a{sv}";
+    static OfferedEntries read(const Variant &dictionary) {
+        OfferedEntries entries;
+        for (gsize i = 0; i < g_variant_n_children(dictionary.get()); ++i)
+            entries.push_back(
+                offered(Variant::adopt(g_variant_get_child_value(dictionary.get(), i)).get()));
+        return entries;
+    }
+};
+
+namespace {
+
+using enum Caller;
 
 GVariant *travelling(const SettingsField &field, const SettingValue &value) {
     const auto *number = std::get_if<std::int32_t>(&value);
@@ -50,52 +56,20 @@ void add_entries(GVariantBuilder &builder, const SettingsFields &fields,
                               travelling(fields[place], record[place]));
 }
 
-} // namespace
-
-const MethodRow<SettingsInterface> SettingsInterface::kMethods[] = {
-    {"GetGlobalSettings", "(s)", "(ia{sv})", kAnybody, &SettingsInterface::get_global_settings},
-    {"UpdateGlobalSettings", "(a{sv})", "(i)", kAnybody,
-     &SettingsInterface::update_global_settings},
-    {"AddGlobalSettings", "(a{sv})", "(i)", kAnybody, &SettingsInterface::add_global_settings},
-    {"DeleteGlobalSettings", "(s)", "(i)", kAnybody, &SettingsInterface::delete_global_settings},
-    {"GetProfileList", "()", "(iuaa{sv})", kAnybody, &SettingsInterface::get_profile_list},
-    {"UpdateProfile", "(a{sv})", "(i)", kAnybody, &SettingsInterface::update_profile},
-    {"AddProfile", "(a{sv})", "(i)", kAnybody, &SettingsInterface::add_profile},
-    {"DeleteProfile", "(i)", "(i)", kAnybody, &SettingsInterface::delete_profile},
-    {"SetNetworkEnvironment", "(i)", "(i)", kAnybody, &SettingsInterface::set_network_environment},
-    {"GetNetworkEnvironment", "()", "(ii)", kAnybody, &SettingsInterface::get_network_environment},
-};
-
-Interface SettingsInterface::describe() {
-    return {"org.kelvo.ims.Settings", bind_methods<SettingsInterface>(*this, kMethods), {}};
-}
-
-Answer<Variant> SettingsInterface::get_global_settings(const Request &request) {
-    const auto [name] = request.unpack<std::string>();
-    const auto set = settings_.find_set(request.slot, name);
+Answer<wire::Dictionary> get_global_settings(const SettingsModel &settings, int slot,
+                                             std::string_view name) {
+    const auto set = settings.find_set(slot, name);
     if (!set)
         return set.refusal();
     GVariantBuilder dictionary;
     g_variant_builder_init(&dictionary, G_VARIANT_TYPE_VARDICT);
     add_entries(dictionary, global_settings_fields(), **set);
-    return wire::pack(Result::kOk, Variant(g_variant_builder_end(&dictionary)));
+    return wire::Dictionary{Variant(g_variant_builder_end(&dictionary))};
 }
 
-Answer<Variant> SettingsInterface::update_global_settings(const Request &request) {
-    return result_of(settings_.update_set(request.slot, entries_of(request)));
-}
-
-Answer<Variant> SettingsInterface::add_global_settings(const Request &request) {
-    return result_of(settings_.add_set(request.slot, entries_of(request)));
-}
-
-Answer<Variant> SettingsInterface::delete_global_settings(const Request &request) {
-    const auto [name] = request.unpack<std::string>();
-    return result_of(settings_.delete_set(request.slot, name));
-}
-
-Answer<Variant> SettingsInterface::get_profile_list(const Request &request) {
-    const auto &profiles = settings_.of(request.slot).profiles;
+std::tuple<std::uint32_t, wire::Dictionaries> get_profile_list(const SettingsModel &settings,
+                                                               int slot) {
+    const auto &profiles = settings.of(slot).profiles;
     GVariantBuilder list;
     g_variant_builder_init(&list, G_VARIANT_TYPE("aa{sv}"));
     for (const auto &profile : profiles) {
@@ -103,30 +77,30 @@ Answer<Variant> SettingsInterface::get_profile_list(const Request &request) {
         add_entries(list, profile_fields(), profile);
         g_variant_builder_close(&list);
     }
-    return wire::pack(Result::kOk, static_cast<std::uint32_t>(profiles.size()),
-                      Variant(g_variant_builder_end(&list)));
+    return {static_cast<std::uint32_t>(profiles.size()), {Variant(g_variant_builder_end(&list))}};
 }
 
-Answer<Variant> SettingsInterface::update_profile(const Request &request) {
-    return result_of(settings_.update_profile(request.slot, entries_of(request)));
+std::int32_t get_network_environment(const SettingsModel &settings, int slot) {
+    return settings.of(slot).network_environment;
 }
 
-Answer<Variant> SettingsInterface::add_profile(const Request &request) {
-    return result_of(settings_.add_profile(request.slot, entries_of(request)));
-}
+constexpr MethodRow<SettingsModel> kMethods[] = {
+    {"GetGlobalSettings", ask<get_global_settings>, kAnybody},
+    {"UpdateGlobalSettings", ask<&SettingsModel::update_set>, kAnybody},
+    {"AddGlobalSettings", ask<&SettingsModel::add_set>, kAnybody},
+    {"DeleteGlobalSettings", ask<&SettingsModel::delete_set>, kAnybody},
+    {"GetProfileList", ask<get_profile_list>, kAnybody},
+    {"UpdateProfile", ask<&SettingsModel::update_profile>, kAnybody},
+    {"AddProfile", ask<&SettingsModel::add_profile>, kAnybody},
+    {"DeleteProfile", ask<&SettingsModel::delete_profile>, kAnybody},
+    {"SetNetworkEnvironment", ask<&SettingsModel::set_network_environment>, kAnybody},
+    {"GetNetworkEnvironment", ask<get_network_environment>, kAnybody},
+};
 
-Answer<Variant> SettingsInterface::delete_profile(const Request &request) {
-    const auto [id] = request.unpack<std::int32_t>();
-    return result_of(settings_.delete_profile(request.slot, id));
-}
+} // namespace
 
-Answer<Variant> SettingsInterface::set_network_environment(const Request &request) {
-    const auto [type] = request.unpack<std::int32_t>();
-    return result_of(settings_.set_network_environment(request.slot, type));
-}
-
-Answer<Variant> SettingsInterface::get_network_environment(const Request &request) {
-    return wire::pack(Result::kOk, settings_.of(request.slot).network_environment);
+Interface SettingsInterface::describe() {
+    return {"org.kelvo.ims.Settings", bind_methods(kMethods, settings_), {}};
 }
 
 } // namespace sim

@@ -1,18 +1,16 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "sim/sms/interface.hpp"
 
+#include "sim/bus/ask.hpp"
+#include "sim/bus/tell.hpp"
+
 namespace sim {
 
 namespace {
 
 using std::int32_t;
 using std::string;
-
-constexpr SignalInfo kSignals[] = {
-    {"IncomingSms", "(isii)"},
-    {"SendSmsAck", "(iiisii)"},
-    {"DeliveryReportAck", "(ii)"},
-};
+using enum Caller;
 
 string to_base64(const tpdu::Octets &octets) {
     return wire::encode_base64(string(octets.begin(), octets.end()));
@@ -29,60 +27,62 @@ Answer<tpdu::Octets> from_base64(const string &text, std::string_view what) {
     return tpdu::Octets(bytes->begin(), bytes->end());
 }
 
-struct ToSignal {
-    Signal operator()(const IncomingSms &e) const {
-        return {"IncomingSms", wire::pack(length_of(e.tpdu), to_base64(e.tpdu), e.number, e.kind)};
-    }
-    Signal operator()(const SendSmsAck &e) const {
-        return {"SendSmsAck", wire::pack(e.number, e.cause, e.reference, to_base64(e.tpdu),
-                                         length_of(e.tpdu), int32_t{e.try_again})};
-    }
-    Signal operator()(const DeliveryReportAck &e) const {
-        return {"DeliveryReportAck", wire::pack(e.number, e.code)};
-    }
-};
-
-} // namespace
-
-const MethodRow<SmsInterface> SmsInterface::kMethods[] = {
-    {"SendSms", "(isisi)", "(iiii)", Caller::kFirstArgument, &SmsInterface::send_sms},
-    {"SendDeliverReport", "(iisii)", "(iiii)", Caller::kFirstArgument,
-     &SmsInterface::send_deliver_report},
-};
-
-Interface SmsInterface::describe() {
-    return {kName, bind_methods<SmsInterface>(*this, kMethods), kSignals};
-}
-
-Answer<Variant> SmsInterface::send_sms(const Request &request) {
-    const auto [app, tpdu_text, length, address_text, option] =
-        request.unpack<int32_t, string, int32_t, string, int32_t>();
+Answer<std::tuple<int32_t, int32_t, int32_t>> send_sms(ServiceCentre &centre, int slot,
+                                                       const string &tpdu_text, int32_t length,
+                                                       const string &address_text, int32_t option) {
     const auto tpdu = from_base64(tpdu_text, "TPDU");
     if (!tpdu)
         return tpdu.refusal();
     const auto address = from_base64(address_text, "service centre's address");
     if (!address)
         return address.refusal();
-    const auto receipt = centre_.submit(request.slot, {*tpdu, length, *address, option});
+    const auto receipt = centre.submit(slot, {*tpdu, length, *address, option});
     if (!receipt)
         return receipt.refusal();
-    return wire::pack(Result::kOk, receipt->number, receipt->reference, option);
+    return std::tuple(receipt->number, receipt->reference, option);
 }
 
-Answer<Variant> SmsInterface::send_deliver_report(const Request &request) {
-    const auto [app, code, tpdu_text, length, option] =
-        request.unpack<int32_t, int32_t, string, int32_t, int32_t>();
+Answer<std::tuple<int32_t, int32_t, int32_t>> send_deliver_report(ServiceCentre &centre, int slot,
+                                                                  int32_t code,
+                                                                  const string &tpdu_text,
+                                                                  int32_t length, int32_t option) {
     const auto tpdu = from_base64(tpdu_text, "TPDU");
     if (!tpdu)
         return tpdu.refusal();
-    const auto number = centre_.report(request.slot, {code, *tpdu, length, option});
+    const auto number = centre.report(slot, {code, *tpdu, length, option});
     if (!number)
         return number.refusal();
-    return wire::pack(Result::kOk, *number, code, option);
+    return std::tuple(*number, code, option);
+}
+
+constexpr MethodRow<ServiceCentre> kMethods[] = {
+    {"SendSms", ask<send_sms>, kFirstArgument},
+    {"SendDeliverReport", ask<send_deliver_report>, kFirstArgument},
+};
+
+auto incoming(const IncomingSms &e) {
+    return std::tuple(length_of(e.tpdu), to_base64(e.tpdu), e.number, e.kind);
+}
+
+auto send_ack(const SendSmsAck &e) {
+    return std::tuple(e.number, e.cause, e.reference, to_base64(e.tpdu), length_of(e.tpdu),
+                      int32_t{e.try_again});
+}
+
+constexpr SignalTable kSignals{
+    SignalRow{"IncomingSms", incoming},
+    SignalRow{"SendSmsAck", send_ack},
+    SignalRow<DeliveryReportAck>{"DeliveryReportAck"},
+};
+
+} // namespace
+
+Interface SmsInterface::describe() {
+    return {kName, bind_methods(kMethods, centre_), kSignals.infos()};
 }
 
 Signal to_signal(const MessageEvent &event) {
-    return std::visit(ToSignal{}, event);
+    return kSignals.signal_of(event);
 }
 
 } // namespace sim

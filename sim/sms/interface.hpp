@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/bus/service.hpp"
+#include "sim/bus/interface.hpp"
 #include "sim/sms/service_centre.hpp"
 
 namespace sim {
@@ -15,11 +15,6 @@ class SmsInterface {
     Interface describe();
 
   private:
-    Answer<Variant> send_sms(const Request &request);
-    Answer<Variant> send_deliver_report(const Request &request);
-
-    static const MethodRow<SmsInterface> kMethods[];
-
     ServiceCentre &centre_;
 };
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/bus/service.hpp"
+#include "sim/bus/interface.hpp"
 #include "sim/ss/model.hpp"
 
 namespace sim {
@@ -15,15 +15,6 @@ class SsInterface {
     Interface describe();
 
   private:
-    Answer<Variant> set_call_waiting(const Request &request);
-    Answer<Variant> get_call_waiting(const Request &request);
-    Answer<Variant> set_call_forwarding(const Request &request);
-    Answer<Variant> get_call_forwarding(const Request &request);
-    Answer<Variant> set_call_barring(const Request &request);
-    Answer<Variant> get_call_barring(const Request &request);
-
-    static const MethodRow<SsInterface> kMethods[];
-
     SupplementaryServices &services_;
 };
 

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "sim/bus/wire.hpp"
 
+#include "sim/bus/form.hpp"
 #include "sim/call/signals.hpp"
 
 #include <algorithm>
@@ -11,24 +12,23 @@
 namespace sim {
 namespace {
 
-TEST(Wire, PacksAndUnpacksMembersInOrder) {
+TEST(Wire, PacksAndTakesMembersInOrder) {
     const auto tuple = wire::pack(std::int32_t{-3}, std::string("text"), true, std::uint8_t{7},
                                   std::uint32_t{9}, CallType::kVideo);
     EXPECT_EQ(tuple.print(), "(-3, 'text', true, 0x07, 9, 1)");
-    const auto [number, text, flag, byte] =
-        wire::unpack<std::int32_t, std::string, bool, std::uint8_t>(tuple.get());
-    EXPECT_EQ(number, -3);
-    EXPECT_EQ(text, "text");
-    EXPECT_TRUE(flag);
-    EXPECT_EQ(byte, 7);
+    wire::Arguments arguments(tuple.get());
+    EXPECT_EQ(arguments.take<std::int32_t>(), -3);
+    EXPECT_EQ(arguments.take<std::string>(), "text");
+    EXPECT_TRUE(arguments.take<bool>());
+    EXPECT_EQ(arguments.take<std::uint8_t>(), 7);
 }
 
 TEST(Wire, AVariantOfTextsMayHoldSomethingElse) {
     const auto texts = wire::pack(std::vector<std::string>{"a", "b"});
-    EXPECT_EQ(std::get<0>(wire::unpack<wire::Texts>(texts.get())),
+    EXPECT_EQ(wire::Arguments(texts.get()).take<wire::Texts>(),
               (std::vector<std::string>{"a", "b"}));
     const auto numbers = wire::pack(std::vector<std::int32_t>{1, 2});
-    EXPECT_EQ(std::get<0>(wire::unpack<wire::Texts>(numbers.get())), std::nullopt);
+    EXPECT_EQ(wire::Arguments(numbers.get()).take<wire::Texts>(), std::nullopt);
 }
 
 TEST(Wire, Base64IsStrict) {

@@ -2,6 +2,8 @@
 // What org.kelvo.ims.Xdm answers about push-to-talk sessions.
 #include "sim/group/interface.hpp"
 
+#include "sim/bus/form.hpp"
+
 #include <algorithm>
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
@@ -59,10 +61,10 @@ class XdmParticipants : public testing::Test {
     Timers timers_{1, [] { return std::chrono::nanoseconds(0); }};
     Registrations registrations_{2, timers_, [](int, const RegistrationEvent &) {}};
     // One session, of the second slot alone.
-    XdmInterface interface_{groups_, plan_, registrations_, [](int slot) {
-                                return slot == 1 ? std::vector{sample_session()}
-                                                 : std::vector<ParticipantInfo>();
-                            }};
+    GroupInterface interface_{groups_, plan_, registrations_, [](int slot) {
+                                  return slot == 1 ? std::vector{sample_session()}
+                                                   : std::vector<ParticipantInfo>();
+                              }};
 };
 
 TEST_F(XdmParticipants, AreThoseOfTheSessionOrOfTheGroupsSession) {
