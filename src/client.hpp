@@ -16,13 +16,6 @@ struct ims_client_s {
     std::int32_t app_id;
 };
 
-// One subscription to a signal.
-struct ims_noti_cb_info_s {
-    guint subscription_id;
-    ims_notification_cb callback;
-    void *user_data;
-};
-
 // What travels with one asynchronous request.
 struct ims_request_ctx_s {
     ims_h handle;

@@ -24,10 +24,8 @@ GVariant *body(const Variant &tuple) noexcept {
 
 int gate(Site site) noexcept {
     bool enabled = false;
-    if (system_info_get_custom_bool(IMS_PLATFORM_FEATURE_KEY, &enabled) != 0) {
-        log_error(site, "Error - Feature getting from System Info");
-        return IMS_ERROR_OPERATION_FAILED;
-    }
+    if (system_info_get_custom_bool(IMS_PLATFORM_FEATURE_KEY, &enabled) != 0)
+        return operation_failed(site, "Error - Feature getting from System Info");
     if (!enabled) {
         log_error(site, "IMS feature is disabled");
         return IMS_ERROR_NOT_SUPPORTED;
@@ -71,10 +69,8 @@ int query(ims_h handle, const char *interface, const char *method, const Variant
         handle->connection.get(), kServiceName, handle->object_path.get(), interface, method,
         body(tuple), nullptr, G_DBUS_CALL_FLAGS_NONE, timeout_ms, nullptr, &failure)};
     const Error error{failure};
-    if (answer && error) {
-        log_error(site, "dbus error = %d (%s)", error->code, error->message);
-        return IMS_ERROR_OPERATION_FAILED;
-    }
+    if (answer && error)
+        return operation_failed(site, "dbus error = %d (%s)", error->code, error->message);
     if (is_refusal(error)) {
         log_error(site, "Permission denied");
         return IMS_ERROR_PERMISSION_DENIED;
@@ -93,14 +89,14 @@ std::uint32_t checked_count(const char *subject, std::uint32_t count, GVariant *
     return is_true ? std::min(count, capacity) : 0;
 }
 
-Variant finish(GObject *source, GAsyncResult *outcome, const Completion &done, Site site) noexcept {
+Variant frame::finish(GObject *source, GAsyncResult *outcome, const Completion &done) noexcept {
     GError *failure = nullptr;
     Variant reply{g_dbus_connection_call_finish(G_DBUS_CONNECTION(source), outcome, &failure)};
     const Error error{failure};
     if (reply || is_cancelled(error))
         return reply;
     if (is_refusal(error)) {
-        log_error(site, "Permission denied");
+        log_error(done.site(), "Permission denied");
         done(IMS_RESPONSE_ACCESS_DENIED);
     } else {
         done(IMS_RESPONSE_FAILED);

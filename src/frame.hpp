@@ -1,17 +1,17 @@
 // SPDX-License-Identifier: Apache-2.0
 // What every exported function shares: gate and argument checks, the asynchronous request with its
-// response, the synchronous query.
+// answer, the synchronous query.
 //
 // An exported function admits its arguments, packs its tuple and requests:
 //
 //     if (const int refused = admit({handle, info}))
 //         return refused;
 //     return request(handle, kInterface, "AnswerCall", pack<"(ii)">(handle->app_id, info->...),
-//                    {on_response_call_answer_call, callback, user_data});
+//                    {answer<"on_response_call_answer_call", "(ii)", kSecondByPointer>, callback,
+//                     user_data});
 //
-// Its response handler completes the request with the signature of the reply:
-//
-//     complete<"(ii)">(source, outcome, context, kSecondByPointer);
+// answer<> is the handler of the response: its name as log lines have it, the signature of the
+// reply, how the application gets what is in the reply.
 #pragma once
 
 #include "client.hpp"
@@ -55,8 +55,8 @@ std::uint32_t checked_count(const char *subject, std::uint32_t count, GVariant *
 // The application's side of a finished request.
 class Completion {
   public:
-    explicit Completion(gpointer context) noexcept
-        : context_{static_cast<ims_request_ctx_s *>(context)} {}
+    Completion(gpointer context, Site site) noexcept
+        : context_{static_cast<ims_request_ctx_s *>(context)}, site_{site} {}
 
     bool is_wanted() const noexcept { return context_ && context_->callback != nullptr; }
     void operator()(int result, void *data = nullptr) const noexcept {
@@ -64,12 +64,32 @@ class Completion {
             context_->callback(context_->handle, result, data, context_->user_data);
     }
 
+    // The handler's, for the lines of a delivery.
+    Site site() const noexcept { return site_; }
+
   private:
     std::unique_ptr<ims_request_ctx_s> context_;
+    Site site_;
 };
 
-// The reply, or nothing: then the application has been told what it is to know of the failure.
-Variant finish(GObject *source, GAsyncResult *outcome, const Completion &done, Site site) noexcept;
+// How an application usually gets a reply: the result alone whatever follows it, a pointer to the
+// second member, the second member itself in the pointer's place, a record of all members but the
+// first.
+inline constexpr auto kResultOnly = [](const Completion &done, std::int32_t result,
+                                       const auto &...) { done(result); };
+inline constexpr auto kSecondByPointer = [](const Completion &done, std::int32_t result,
+                                            auto &second) { done(result, &second); };
+inline constexpr auto kSecondInPlace = [](const Completion &done, std::int32_t result,
+                                          std::int32_t second) {
+    // NOLINTNEXTLINE(performance-no-int-to-ptr): applications read the value from the pointer.
+    done(result, reinterpret_cast<void *>(static_cast<std::intptr_t>(second)));
+};
+template <typename Record>
+inline constexpr auto kRestAsRecord =
+    [](const Completion &done, std::int32_t result, const auto &...rest) {
+        Record record{rest...};
+        done(result, &record);
+    };
 
 namespace frame {
 
@@ -99,50 +119,51 @@ template <Literal Format, std::size_t... Index>
 auto reply_members(std::index_sequence<Index...>)
     -> std::tuple<typename ReplyMember<Signature<Format>::member(Index)[0]>::Type...>;
 
-} // namespace frame
+// The reply, or nothing: then the application has been told what it is to know of the failure.
+Variant finish(GObject *source, GAsyncResult *outcome, const Completion &done) noexcept;
 
-// Ends a request whose reply has this signature: `deliver` gets the completion and the reply's
-// members, and calls the completion. A reply of another type is a failed call.
-template <Literal Format, typename Deliver>
-void complete(GObject *source, GAsyncResult *outcome, gpointer context, const Deliver &deliver,
-              Site site = here()) noexcept {
-    const Completion done{context};
-    const Variant reply = finish(source, outcome, done, site);
+template <Literal Format, auto Deliver>
+void complete(GObject *source, GAsyncResult *outcome, gpointer context, Site site) noexcept {
+    const Completion done{context, site};
+    const Variant reply = finish(source, outcome, done);
     if (!reply)
         return;
-    decltype(frame::reply_members<Format>(
+    decltype(reply_members<Format>(
         std::make_index_sequence<Signature<Format>::size()>{})) members{};
     const auto unpack_members = [&reply](auto &...member) {
         return unpack<Format>(reply.get(), member...);
     };
     if (std::apply(unpack_members, members))
-        std::apply([&](auto &...member) { deliver(done, member...); }, members);
+        std::apply([&](auto &...member) { Deliver(done, member...); }, members);
     else
         done(IMS_RESPONSE_FAILED);
 }
 
-// The usual deliveries: the result alone whatever follows it, a pointer to the second member, the
-// second member itself in the pointer's place, a record of all members but the first.
-inline constexpr auto kResultOnly = [](const Completion &done, std::int32_t result,
-                                       const auto &...) { done(result); };
-inline constexpr auto kSecondByPointer = [](const Completion &done, std::int32_t result,
-                                            auto &second) { done(result, &second); };
-inline constexpr auto kSecondInPlace = [](const Completion &done, std::int32_t result,
-                                          std::int32_t second) {
-    // NOLINTNEXTLINE(performance-no-int-to-ptr): applications read the value from the pointer.
-    done(result, reinterpret_cast<void *>(static_cast<std::intptr_t>(second)));
-};
-template <typename Record>
-inline constexpr auto kRestAsRecord =
-    [](const Completion &done, std::int32_t result, const auto &...rest) {
-        Record record{rest...};
-        done(result, &record);
-    };
+// The name of a handler, and where it stands: the place of its request. A template argument, so
+// that a pending request carries nothing for a line that is hardly ever written.
+template <std::size_t Size>
+struct HandlerSite {
+    Literal<Size> function;
+    char file[32]{};
+    int line;
 
-// Ends a request whose reply is the result alone.
-inline void complete(GObject *source, GAsyncResult *outcome, gpointer context,
-                     Site site = here()) noexcept {
-    complete<"(i)">(source, outcome, context, kResultOnly, site);
+    consteval HandlerSite(const char (&name)[Size], const char *path = __builtin_FILE(),
+                          int at_line = __builtin_LINE())
+        : function{name}, line{at_line} {
+        std::size_t at = 0;
+        for (const char c : std::string_view{file_name(path)})
+            file[at++] = c;
+    }
+    constexpr Site site() const { return {file, function.text, line}; }
+};
+
+} // namespace frame
+
+// Ends a request: `Deliver` gets the completion and the members of the reply, and calls the
+// completion. A reply of another signature is a failed call.
+template <frame::HandlerSite Handler, Literal Format = "(i)", auto Deliver = kResultOnly>
+void answer(GObject *source, GAsyncResult *outcome, gpointer context) noexcept {
+    frame::complete<Format, Deliver>(source, outcome, context, Handler.site());
 }
 
 } // namespace ims

@@ -13,7 +13,6 @@ namespace ims {
 namespace {
 
 constexpr const char *kObjectPathPrefix = "/org/kelvo/ims";
-constexpr const char *kRegistrationInterface = "org.kelvo.ims.Registration";
 constexpr int kRegisterTimeoutMs = kRequestTimeoutMs / 10;
 
 // Releases a client's parts in the order in which they depend on each other: the table's
@@ -29,60 +28,37 @@ struct ClientReleaser {
 };
 using Client = std::unique_ptr<ims_client_s, ClientReleaser>;
 
-struct Route {
+constexpr const Module *kModules[] = {&kRegModule, &kCallModule, &kSmsModule, &kPocModule,
+                                      &kLoginModule};
+
+// The signal that brings an event.
+struct Signal {
     const char *interface;
+    const char *member;
     Decoder decode;
+
+    // As the table of subscriptions has it.
+    Text text() const noexcept { return Text{g_strdup_printf("%s:%s", interface, member)}; }
 };
 
-constexpr Route kRoutes[] = {
-    {"org.kelvo.ims.Call", on_call_signal_emit_handler},
-    {"org.kelvo.ims.Poc", on_poc_signal_emit_handler},
-    {"org.kelvo.ims.Sms", on_sms_signal_emit_handler},
-    {"org.kelvo.ims.Registration", on_reg_signal_emit_handler},
-    {"org.kelvo.ims.Login", on_login_signal_emit_handler},
-};
-
-const Notification *find_notification(int noti_id) noexcept {
-    for (const Notification &notification : notifications()) {
-        if (notification.id == noti_id)
-            return &notification;
+// No member for an id that nobody can ask for.
+Signal find_signal(int noti_id) noexcept {
+    for (const Module *module : kModules) {
+        if (const Notification *notification = module->find(noti_id))
+            return {module->interface, notification->member, module->decode};
     }
-    return nullptr;
+    return {};
 }
 
-Text signal_string(const char *interface, const char *member) noexcept {
-    return Text{g_strdup_printf("%s:%s", interface, member)};
-}
-
-// 0 for a signal that is no notification's.
-int notification_id(const char *interface, const char *member) noexcept {
-    for (const Notification &notification : notifications()) {
-        if (g_str_equal(notification.interface, interface) &&
-            g_str_equal(notification.member, member))
-            return notification.id;
-    }
-    return 0;
-}
-
-void on_signal_callback(GDBusConnection *, const char *, const char *, const char *interface,
-                        const char *member, GVariant *parameters, gpointer user_data) noexcept {
-    const auto handle = static_cast<ims_h>(user_data);
-    if (handle == nullptr) {
+// GDBus delivers what is waiting only while the subscription lasts, so its record is there.
+void on_signal_callback(GDBusConnection *, const char *, const char *, const char *, const char *,
+                        GVariant *parameters, gpointer user_data) noexcept {
+    const auto *subscription = static_cast<const ims_noti_cb_info_s *>(user_data);
+    if (subscription == nullptr) {
         log_error(here(), "Invalid parameter");
         return;
     }
-    const Text noti_str = signal_string(interface, member);
-    const auto *found = static_cast<const ims_noti_cb_info_s *>(
-        g_hash_table_lookup(handle->noti_table.get(), noti_str.get()));
-    if (found == nullptr) {
-        log_error(here(), "can't find noti_str(%s) callback info", noti_str.get());
-        return;
-    }
-    for (const Route &route : kRoutes) {
-        if (g_str_equal(route.interface, interface))
-            return route.decode(handle, notification_id(interface, member), parameters, found);
-    }
-    log_error(here(), "unhandled signal!!");
+    subscription->decode(subscription->handle, subscription->noti_id, parameters, subscription);
 }
 
 // For g_hash_table_foreach_remove(): TRUE removes the entry.
@@ -102,33 +78,28 @@ int ims_init(int slot, ims_h *handle) {
     if (const int refused = admit({handle}))
         return refused;
     Client client{new (std::nothrow) ims_client_s{}};
-    if (!client) {
-        log_error(here(), "Memory allocation failed!");
-        return IMS_ERROR_OPERATION_FAILED;
-    }
+    if (!client)
+        return operation_failed(here(), "Memory allocation failed!");
     GError *failure = nullptr;
     client->connection.reset(g_bus_get_sync(G_BUS_TYPE_SYSTEM, nullptr, &failure));
     const Error error{failure};
-    if (!client->connection) {
-        log_error(here(), "Error creating dbus connection: %s\n", error ? error->message : "");
-        return IMS_ERROR_OPERATION_FAILED;
-    }
+    if (!client->connection)
+        return operation_failed(here(), "Error creating dbus connection: %s\n",
+                                error ? error->message : "");
     client->object_path.reset(g_strdup_printf("%s/sub%d", kObjectPathPrefix, slot));
     client->noti_table.reset(g_hash_table_new_full(g_str_hash, g_str_equal, g_free, g_free));
 
     // A program's name is bytes; a D-Bus text is UTF-8.
     const Text program{g_utf8_make_valid(program_invocation_name, -1)};
     Variant reply;
-    if (const int failed = query(client.get(), kRegistrationInterface, "RegisterApplication",
+    if (const int failed = query(client.get(), kRegModule.interface, "RegisterApplication",
                                  pack<"(is)">(slot, program.get()), reply, kRegisterTimeoutMs))
         return failed;
     std::int32_t result = 1;
     if (!unpack<"(ii)">(reply.get(), result, client->app_id))
         return IMS_ERROR_OPERATION_FAILED;
-    if (result != 0) {
-        log_error(here(), "Failed to get registration info: %d", result);
-        return IMS_ERROR_OPERATION_FAILED;
-    }
+    if (result != 0)
+        return operation_failed(here(), "Failed to get registration info: %d", result);
     *handle = client.release();
     return IMS_ERROR_NONE;
 }
@@ -146,21 +117,20 @@ int ims_set_notification_cb(ims_h handle, int noti_id, ims_notification_cb callb
                             void *user_data) {
     if (const int refused = admit({reinterpret_cast<const void *>(callback), handle}))
         return refused;
-    const Notification *notification = find_notification(noti_id);
-    if (notification == nullptr)
+    const Signal signal = find_signal(noti_id);
+    if (signal.member == nullptr)
         return invalid_parameter();
-    Text noti_str = signal_string(notification->interface, notification->member);
+    Text noti_str = signal.text();
     if (g_hash_table_contains(handle->noti_table.get(), noti_str.get())) {
         log_error(here(), "noti_str[%s] is already registered", noti_str.get());
         return IMS_ERROR_INVALID_PARAMETER;
     }
-    auto *subscription = g_new0(ims_noti_cb_info_s, 1);
-    subscription->callback = callback;
-    subscription->user_data = user_data;
+    auto *subscription = g_new(ims_noti_cb_info_s, 1);
+    *subscription = {0, callback, user_data, handle, signal.decode, noti_id};
     subscription->subscription_id = g_dbus_connection_signal_subscribe(
-        handle->connection.get(), kServiceName, notification->interface, notification->member,
-        handle->object_path.get(), nullptr, G_DBUS_SIGNAL_FLAGS_NONE, on_signal_callback, handle,
-        nullptr);
+        handle->connection.get(), kServiceName, signal.interface, signal.member,
+        handle->object_path.get(), nullptr, G_DBUS_SIGNAL_FLAGS_NONE, on_signal_callback,
+        subscription, nullptr);
     g_hash_table_insert(handle->noti_table.get(), noti_str.release(), subscription);
     return IMS_ERROR_NONE;
 }
@@ -170,10 +140,10 @@ int ims_unset_notification_cb(ims_h handle, int noti_id) {
         return refused;
     if (!handle->connection)
         return invalid_parameter();
-    const Notification *notification = find_notification(noti_id);
-    if (notification == nullptr)
+    const Signal signal = find_signal(noti_id);
+    if (signal.member == nullptr)
         return invalid_parameter();
-    const Text noti_str = signal_string(notification->interface, notification->member);
+    const Text noti_str = signal.text();
     const auto *subscription = static_cast<const ims_noti_cb_info_s *>(
         g_hash_table_lookup(handle->noti_table.get(), noti_str.get()));
     if (subscription == nullptr) {
@@ -181,9 +151,7 @@ int ims_unset_notification_cb(ims_h handle, int noti_id) {
         return IMS_ERROR_INVALID_PARAMETER;
     }
     g_dbus_connection_signal_unsubscribe(handle->connection.get(), subscription->subscription_id);
-    if (!g_hash_table_remove(handle->noti_table.get(), noti_str.get())) {
-        log_error(here(), "Fail to deregister noti_str [%s]", noti_str.get());
-        return IMS_ERROR_OPERATION_FAILED;
-    }
+    if (!g_hash_table_remove(handle->noti_table.get(), noti_str.get()))
+        return operation_failed(here(), "Fail to deregister noti_str [%s]", noti_str.get());
     return IMS_ERROR_NONE;
 }

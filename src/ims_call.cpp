@@ -7,7 +7,6 @@
 #include "wire/dictionary.hpp"
 
 #include <algorithm>
-#include <cstring>
 #include <vector>
 
 using namespace ims;
@@ -32,22 +31,15 @@ Variant participants(const ims_call_participant_s *head, std::int32_t count) noe
 
 } // namespace
 
-static void on_response_call_make_call(GObject *source, GAsyncResult *outcome, gpointer context) {
-    complete<"(ii)">(source, outcome, context, kSecondByPointer);
-}
-
 int ims_call_make_call(ims_h handle, const ims_call_make_info_s *info, ims_response_cb callback,
                        void *user_data) {
     if (const int refused = admit({handle, info}))
         return refused;
-    return request(handle, kInterface, "MakeCall",
-                   pack<"(isissss)">(handle->app_id, info->number, info->call_type, info->text_1,
-                                     info->text_2, info->text_3, info->text_4),
-                   {on_response_call_make_call, callback, user_data});
-}
-
-static void on_response_call_send_ussd(GObject *source, GAsyncResult *outcome, gpointer context) {
-    complete(source, outcome, context);
+    return request(
+        handle, kInterface, "MakeCall",
+        pack<"(isissss)">(handle->app_id, info->number, info->call_type, info->text_1, info->text_2,
+                          info->text_3, info->text_4),
+        {answer<"on_response_call_make_call", "(ii)", kSecondByPointer>, callback, user_data});
 }
 
 int ims_call_send_ussd(ims_h handle, const ims_call_ussd_info_s *info, ims_response_cb callback,
@@ -61,11 +53,7 @@ int ims_call_send_ussd(ims_h handle, const ims_call_ussd_info_s *info, ims_respo
     }
     return request(handle, kInterface, "SendUssd",
                    pack<"(iiis)">(handle->app_id, info->type, info->value_1, text),
-                   {on_response_call_send_ussd, callback, user_data});
-}
-
-static void on_response_call_answer_call(GObject *source, GAsyncResult *outcome, gpointer context) {
-    complete(source, outcome, context);
+                   {answer<"on_response_call_send_ussd">, callback, user_data});
 }
 
 int ims_call_answer_call(ims_h handle, const ims_call_id_info_s *info, ims_response_cb callback,
@@ -74,11 +62,7 @@ int ims_call_answer_call(ims_h handle, const ims_call_id_info_s *info, ims_respo
         return refused;
     return request(handle, kInterface, "AnswerCall",
                    pack<"(iiii)">(handle->app_id, info->session_id, info->value_1, info->value_2),
-                   {on_response_call_answer_call, callback, user_data});
-}
-
-static void on_response_call_end_call(GObject *source, GAsyncResult *outcome, gpointer context) {
-    complete(source, outcome, context);
+                   {answer<"on_response_call_answer_call">, callback, user_data});
 }
 
 int ims_call_end_call(ims_h handle, const ims_call_id_info_s *info, ims_response_cb callback,
@@ -87,11 +71,7 @@ int ims_call_end_call(ims_h handle, const ims_call_id_info_s *info, ims_response
         return refused;
     return request(handle, kInterface, "EndCall",
                    pack<"(iiii)">(handle->app_id, info->session_id, info->value_1, info->value_2),
-                   {on_response_call_end_call, callback, user_data});
-}
-
-static void on_response_call_reject_call(GObject *source, GAsyncResult *outcome, gpointer context) {
-    complete(source, outcome, context);
+                   {answer<"on_response_call_end_call">, callback, user_data});
 }
 
 int ims_call_reject_call(ims_h handle, const ims_call_pair_info_s *info, ims_response_cb callback,
@@ -100,11 +80,7 @@ int ims_call_reject_call(ims_h handle, const ims_call_pair_info_s *info, ims_res
         return refused;
     return request(handle, kInterface, "RejectCall",
                    pack<"(iii)">(handle->app_id, info->session_id, info->value_1),
-                   {on_response_call_reject_call, callback, user_data});
-}
-
-static void on_response_call_hold_call(GObject *source, GAsyncResult *outcome, gpointer context) {
-    complete(source, outcome, context);
+                   {answer<"on_response_call_reject_call">, callback, user_data});
 }
 
 int ims_call_hold_call(ims_h handle, int32_t session_id, ims_response_cb callback,
@@ -112,11 +88,7 @@ int ims_call_hold_call(ims_h handle, int32_t session_id, ims_response_cb callbac
     if (const int refused = admit({handle}))
         return refused;
     return request(handle, kInterface, "HoldCall", pack<"(ii)">(handle->app_id, session_id),
-                   {on_response_call_hold_call, callback, user_data});
-}
-
-static void on_response_call_resume_call(GObject *source, GAsyncResult *outcome, gpointer context) {
-    complete(source, outcome, context);
+                   {answer<"on_response_call_hold_call">, callback, user_data});
 }
 
 int ims_call_resume_call(ims_h handle, int32_t session_id, ims_response_cb callback,
@@ -124,23 +96,14 @@ int ims_call_resume_call(ims_h handle, int32_t session_id, ims_response_cb callb
     if (const int refused = admit({handle}))
         return refused;
     return request(handle, kInterface, "ResumeCall", pack<"(ii)">(handle->app_id, session_id),
-                   {on_response_call_resume_call, callback, user_data});
-}
-
-static void on_response_call_swap_call(GObject *source, GAsyncResult *outcome, gpointer context) {
-    complete(source, outcome, context);
+                   {answer<"on_response_call_resume_call">, callback, user_data});
 }
 
 int ims_call_swap_call(ims_h handle, ims_response_cb callback, void *user_data) {
     if (const int refused = admit({handle}))
         return refused;
     return request(handle, kInterface, "SwapCall", pack<"(i)">(handle->app_id),
-                   {on_response_call_swap_call, callback, user_data});
-}
-
-static void on_response_call_upgrade_call(GObject *source, GAsyncResult *outcome,
-                                          gpointer context) {
-    complete(source, outcome, context);
+                   {answer<"on_response_call_swap_call">, callback, user_data});
 }
 
 int ims_call_upgrade_call(ims_h handle, const ims_call_pair_info_s *info, ims_response_cb callback,
@@ -149,12 +112,7 @@ int ims_call_upgrade_call(ims_h handle, const ims_call_pair_info_s *info, ims_re
         return refused;
     return request(handle, kInterface, "UpgradeCall",
                    pack<"(iii)">(handle->app_id, info->session_id, info->value_1),
-                   {on_response_call_upgrade_call, callback, user_data});
-}
-
-static void on_response_call_downgrade_call(GObject *source, GAsyncResult *outcome,
-                                            gpointer context) {
-    complete(source, outcome, context);
+                   {answer<"on_response_call_upgrade_call">, callback, user_data});
 }
 
 int ims_call_downgrade_call(ims_h handle, const ims_call_pair_info_s *info,
@@ -163,20 +121,17 @@ int ims_call_downgrade_call(ims_h handle, const ims_call_pair_info_s *info,
         return refused;
     return request(handle, kInterface, "DowngradeCall",
                    pack<"(iii)">(handle->app_id, info->session_id, info->value_1),
-                   {on_response_call_downgrade_call, callback, user_data});
+                   {answer<"on_response_call_downgrade_call">, callback, user_data});
 }
 
-static void on_response_call_change_call(GObject *source, GAsyncResult *outcome, gpointer context) {
-    complete<"(iis)">(
-        source, outcome, context,
-        [](const Completion &done, std::int32_t result, std::int32_t value, const char *text) {
-            if (!done.is_wanted())
-                return;
-            // The application takes the copy over.
-            ims_call_change_result_s change{value, g_strdup(text)};
-            done(result, &change);
-        });
-}
+constexpr auto kChange = [](const Completion &done, std::int32_t result, std::int32_t value,
+                            const char *text) {
+    if (!done.is_wanted())
+        return;
+    // The application takes the copy over.
+    ims_call_change_result_s change{value, g_strdup(text)};
+    done(result, &change);
+};
 
 int ims_call_change_call(ims_h handle, const ims_call_pair_info_s *info, ims_response_cb callback,
                          void *user_data) {
@@ -184,12 +139,7 @@ int ims_call_change_call(ims_h handle, const ims_call_pair_info_s *info, ims_res
         return refused;
     return request(handle, kInterface, "ChangeCall",
                    pack<"(iii)">(handle->app_id, info->session_id, info->value_1),
-                   {on_response_call_change_call, callback, user_data});
-}
-
-static void on_response_call_accept_change_request(GObject *source, GAsyncResult *outcome,
-                                                   gpointer context) {
-    complete(source, outcome, context);
+                   {answer<"on_response_call_change_call", "(iis)", kChange>, callback, user_data});
 }
 
 int ims_call_accept_change_request(ims_h handle, int32_t session_id, ims_response_cb callback,
@@ -198,12 +148,7 @@ int ims_call_accept_change_request(ims_h handle, int32_t session_id, ims_respons
         return refused;
     return request(handle, kInterface, "AcceptChangeRequest",
                    pack<"(ii)">(handle->app_id, session_id),
-                   {on_response_call_accept_change_request, callback, user_data});
-}
-
-static void on_response_call_reject_change_request(GObject *source, GAsyncResult *outcome,
-                                                   gpointer context) {
-    complete(source, outcome, context);
+                   {answer<"on_response_call_accept_change_request">, callback, user_data});
 }
 
 int ims_call_reject_change_request(ims_h handle, int32_t session_id, ims_response_cb callback,
@@ -212,11 +157,7 @@ int ims_call_reject_change_request(ims_h handle, int32_t session_id, ims_respons
         return refused;
     return request(handle, kInterface, "RejectChangeRequest",
                    pack<"(ii)">(handle->app_id, session_id),
-                   {on_response_call_reject_change_request, callback, user_data});
-}
-
-static void on_response_call_send_dtmf(GObject *source, GAsyncResult *outcome, gpointer context) {
-    complete(source, outcome, context);
+                   {answer<"on_response_call_reject_change_request">, callback, user_data});
 }
 
 int ims_call_send_dtmf(ims_h handle, const ims_call_dtmf_info_s *info, ims_response_cb callback,
@@ -225,11 +166,7 @@ int ims_call_send_dtmf(ims_h handle, const ims_call_dtmf_info_s *info, ims_respo
         return refused;
     return request(handle, kInterface, "SendDtmf",
                    pack<"(iis)">(handle->app_id, info->session_id, info->digits),
-                   {on_response_call_send_dtmf, callback, user_data});
-}
-
-static void on_response_call_start_dtmf(GObject *source, GAsyncResult *outcome, gpointer context) {
-    complete(source, outcome, context);
+                   {answer<"on_response_call_send_dtmf">, callback, user_data});
 }
 
 int ims_call_start_dtmf(ims_h handle, const ims_call_dtmf_tone_s *info, ims_response_cb callback,
@@ -238,11 +175,7 @@ int ims_call_start_dtmf(ims_h handle, const ims_call_dtmf_tone_s *info, ims_resp
         return refused;
     return request(handle, kInterface, "StartDtmf",
                    pack<"(iiy)">(handle->app_id, info->session_id, info->tone),
-                   {on_response_call_start_dtmf, callback, user_data});
-}
-
-static void on_response_call_stop_dtmf(GObject *source, GAsyncResult *outcome, gpointer context) {
-    complete(source, outcome, context);
+                   {answer<"on_response_call_start_dtmf">, callback, user_data});
 }
 
 int ims_call_stop_dtmf(ims_h handle, int32_t session_id, ims_response_cb callback,
@@ -250,12 +183,7 @@ int ims_call_stop_dtmf(ims_h handle, int32_t session_id, ims_response_cb callbac
     if (const int refused = admit({handle}))
         return refused;
     return request(handle, kInterface, "StopDtmf", pack<"(ii)">(handle->app_id, session_id),
-                   {on_response_call_stop_dtmf, callback, user_data});
-}
-
-static void on_response_call_voice_record(GObject *source, GAsyncResult *outcome,
-                                          gpointer context) {
-    complete(source, outcome, context);
+                   {answer<"on_response_call_stop_dtmf">, callback, user_data});
 }
 
 int ims_call_voice_record(ims_h handle, const ims_call_record_info_s *info,
@@ -264,12 +192,7 @@ int ims_call_voice_record(ims_h handle, const ims_call_record_info_s *info,
         return refused;
     return request(handle, kInterface, "VoiceRecord",
                    pack<"(iiis)">(handle->app_id, info->session_id, info->value_1, info->text_1),
-                   {on_response_call_voice_record, callback, user_data});
-}
-
-static void on_response_call_send_tty_data(GObject *source, GAsyncResult *outcome,
-                                           gpointer context) {
-    complete(source, outcome, context);
+                   {answer<"on_response_call_voice_record">, callback, user_data});
 }
 
 int ims_call_send_tty_data(ims_h handle, const ims_call_tty_data_s *info, ims_response_cb callback,
@@ -279,54 +202,39 @@ int ims_call_send_tty_data(ims_h handle, const ims_call_tty_data_s *info, ims_re
     const Text data = base64_encode(info->data, info->length);
     return request(handle, kInterface, "SendTtyData",
                    pack<"(iis)">(handle->app_id, info->session_id, data.get()),
-                   {on_response_call_send_tty_data, callback, user_data});
-}
-
-static void on_response_call_set_tty_mode(GObject *source, GAsyncResult *outcome,
-                                          gpointer context) {
-    complete(source, outcome, context);
+                   {answer<"on_response_call_send_tty_data">, callback, user_data});
 }
 
 int ims_call_set_tty_mode(ims_h handle, int32_t mode, ims_response_cb callback, void *user_data) {
     if (const int refused = admit({handle}))
         return refused;
     return request(handle, kInterface, "SetTtyMode", pack<"(ii)">(handle->app_id, mode),
-                   {on_response_call_set_tty_mode, callback, user_data});
+                   {answer<"on_response_call_set_tty_mode">, callback, user_data});
 }
 
-static void on_response_call_get_tty_mode(GObject *source, GAsyncResult *outcome,
-                                          gpointer context) {
-    complete<"(iiis)">(source, outcome, context,
-                       [](const Completion &done, std::int32_t result, std::int32_t value_1,
-                          std::int32_t value_2, const char *text) {
-                           const Decoded data = base64_decode(text);
-                           ims_call_tty_mode_s mode{value_1, value_2, data.bytes.get(),
-                                                    static_cast<std::int32_t>(data.count)};
-                           done(result, &mode);
-                       });
-}
+constexpr auto kTtyMode = [](const Completion &done, std::int32_t result, std::int32_t value_1,
+                             std::int32_t value_2, const char *text) {
+    const Decoded data = base64_decode(text);
+    ims_call_tty_mode_s mode{value_1, value_2, data.bytes.get(),
+                             static_cast<std::int32_t>(data.count)};
+    done(result, &mode);
+};
 
 int ims_call_get_tty_mode(ims_h handle, ims_response_cb callback, void *user_data) {
     if (const int refused = admit({handle}))
         return refused;
     // The service tells the caller by its connection: no application id.
-    return request(handle, kInterface, "GetTtyMode", pack<"()">(),
-                   {on_response_call_get_tty_mode, callback, user_data});
-}
-
-static void on_response_call_is_muted(GObject *source, GAsyncResult *outcome, gpointer context) {
-    complete<"(ib)">(source, outcome, context, kSecondByPointer);
+    return request(
+        handle, kInterface, "GetTtyMode", pack<"()">(),
+        {answer<"on_response_call_get_tty_mode", "(iiis)", kTtyMode>, callback, user_data});
 }
 
 int ims_call_is_muted(ims_h handle, int32_t session_id, ims_response_cb callback, void *user_data) {
     if (const int refused = admit({handle}))
         return refused;
-    return request(handle, kInterface, "IsMuted", pack<"(ii)">(handle->app_id, session_id),
-                   {on_response_call_is_muted, callback, user_data});
-}
-
-static void on_response_call_toggle_mute(GObject *source, GAsyncResult *outcome, gpointer context) {
-    complete(source, outcome, context);
+    return request(
+        handle, kInterface, "IsMuted", pack<"(ii)">(handle->app_id, session_id),
+        {answer<"on_response_call_is_muted", "(ib)", kSecondByPointer>, callback, user_data});
 }
 
 int ims_call_toggle_mute(ims_h handle, int32_t session_id, ims_response_cb callback,
@@ -334,12 +242,7 @@ int ims_call_toggle_mute(ims_h handle, int32_t session_id, ims_response_cb callb
     if (const int refused = admit({handle}))
         return refused;
     return request(handle, kInterface, "ToggleMute", pack<"(ii)">(handle->app_id, session_id),
-                   {on_response_call_toggle_mute, callback, user_data});
-}
-
-static void on_response_call_set_speaker_mode(GObject *source, GAsyncResult *outcome,
-                                              gpointer context) {
-    complete(source, outcome, context);
+                   {answer<"on_response_call_toggle_mute">, callback, user_data});
 }
 
 int ims_call_set_speaker_mode(ims_h handle, const ims_call_pair_info_s *info,
@@ -348,11 +251,7 @@ int ims_call_set_speaker_mode(ims_h handle, const ims_call_pair_info_s *info,
         return refused;
     return request(handle, kInterface, "SetSpeakerMode",
                    pack<"(iii)">(handle->app_id, info->session_id, info->value_1),
-                   {on_response_call_set_speaker_mode, callback, user_data});
-}
-
-static void on_response_call_set_volume(GObject *source, GAsyncResult *outcome, gpointer context) {
-    complete(source, outcome, context);
+                   {answer<"on_response_call_set_speaker_mode">, callback, user_data});
 }
 
 int ims_call_set_volume(ims_h handle, const ims_call_pair_info_s *info, ims_response_cb callback,
@@ -361,25 +260,16 @@ int ims_call_set_volume(ims_h handle, const ims_call_pair_info_s *info, ims_resp
         return refused;
     return request(handle, kInterface, "SetVolume",
                    pack<"(iii)">(handle->app_id, info->session_id, info->value_1),
-                   {on_response_call_set_volume, callback, user_data});
-}
-
-static void on_response_call_get_max_volume(GObject *source, GAsyncResult *outcome,
-                                            gpointer context) {
-    complete<"(ii)">(source, outcome, context, kSecondByPointer);
+                   {answer<"on_response_call_set_volume">, callback, user_data});
 }
 
 int ims_call_get_max_volume(ims_h handle, int32_t session_id, ims_response_cb callback,
                             void *user_data) {
     if (const int refused = admit({handle}))
         return refused;
-    return request(handle, kInterface, "GetMaxVolume", pack<"(ii)">(handle->app_id, session_id),
-                   {on_response_call_get_max_volume, callback, user_data});
-}
-
-static void on_response_call_add_user_for_conference_call(GObject *source, GAsyncResult *outcome,
-                                                          gpointer context) {
-    complete(source, outcome, context);
+    return request(
+        handle, kInterface, "GetMaxVolume", pack<"(ii)">(handle->app_id, session_id),
+        {answer<"on_response_call_get_max_volume", "(ii)", kSecondByPointer>, callback, user_data});
 }
 
 int ims_call_add_user_for_conference_call(ims_h handle, const ims_call_conf_user_s *info,
@@ -388,12 +278,7 @@ int ims_call_add_user_for_conference_call(ims_h handle, const ims_call_conf_user
         return refused;
     return request(handle, kInterface, "AddUserForConferenceCall",
                    pack<"(iisi)">(handle->app_id, info->session_id, info->number, info->value_1),
-                   {on_response_call_add_user_for_conference_call, callback, user_data});
-}
-
-static void on_response_call_indicate_srvcc_ho_started(GObject *source, GAsyncResult *outcome,
-                                                       gpointer context) {
-    complete(source, outcome, context);
+                   {answer<"on_response_call_add_user_for_conference_call">, callback, user_data});
 }
 
 int ims_call_indicate_srvcc_ho_started(ims_h handle, int32_t value, ims_response_cb callback,
@@ -402,12 +287,7 @@ int ims_call_indicate_srvcc_ho_started(ims_h handle, int32_t value, ims_response
         return refused;
     return request(handle, kInterface, "IndicateSrvccHoStarted",
                    pack<"(ii)">(handle->app_id, value),
-                   {on_response_call_indicate_srvcc_ho_started, callback, user_data});
-}
-
-static void on_response_call_indicate_srvcc_ho_failed(GObject *source, GAsyncResult *outcome,
-                                                      gpointer context) {
-    complete(source, outcome, context);
+                   {answer<"on_response_call_indicate_srvcc_ho_started">, callback, user_data});
 }
 
 int ims_call_indicate_srvcc_ho_failed(ims_h handle, int32_t value, ims_response_cb callback,
@@ -415,12 +295,7 @@ int ims_call_indicate_srvcc_ho_failed(ims_h handle, int32_t value, ims_response_
     if (const int refused = admit({handle}))
         return refused;
     return request(handle, kInterface, "IndicateSrvccHoFailed", pack<"(ii)">(handle->app_id, value),
-                   {on_response_call_indicate_srvcc_ho_failed, callback, user_data});
-}
-
-static void on_response_call_set_auto_response(GObject *source, GAsyncResult *outcome,
-                                               gpointer context) {
-    complete(source, outcome, context);
+                   {answer<"on_response_call_indicate_srvcc_ho_failed">, callback, user_data});
 }
 
 int ims_call_set_auto_response(ims_h handle, const ims_call_pair_info_s *info,
@@ -429,12 +304,7 @@ int ims_call_set_auto_response(ims_h handle, const ims_call_pair_info_s *info,
         return refused;
     return request(handle, kInterface, "SetAutoResponse",
                    pack<"(iii)">(handle->app_id, info->session_id, info->value_1),
-                   {on_response_call_set_auto_response, callback, user_data});
-}
-
-static void on_response_call_set_emergency_pdn_info(GObject *source, GAsyncResult *outcome,
-                                                    gpointer context) {
-    complete(source, outcome, context);
+                   {answer<"on_response_call_set_auto_response">, callback, user_data});
 }
 
 int ims_call_set_emergency_pdn_info(ims_h handle, const ims_call_emergency_pdn_s *info,
@@ -447,12 +317,7 @@ int ims_call_set_emergency_pdn_info(ims_h handle, const ims_call_emergency_pdn_s
     return request(handle, kInterface, "SetEmergencyPdnInfo",
                    pack<"(isi@vs)">(handle->app_id, info->text_1, info->count,
                                     boxed(texts.finish()), info->text_2),
-                   {on_response_call_set_emergency_pdn_info, callback, user_data});
-}
-
-static void on_response_call_register_emergency_pdn(GObject *source, GAsyncResult *outcome,
-                                                    gpointer context) {
-    complete(source, outcome, context);
+                   {answer<"on_response_call_set_emergency_pdn_info">, callback, user_data});
 }
 
 int ims_call_register_emergency_pdn(ims_h handle, ims_response_cb callback, void *user_data) {
@@ -460,12 +325,7 @@ int ims_call_register_emergency_pdn(ims_h handle, ims_response_cb callback, void
         return refused;
     // The service tells the caller by its connection: no application id.
     return request(handle, kInterface, "RegisterEmergencyPdn", pack<"()">(),
-                   {on_response_call_register_emergency_pdn, callback, user_data});
-}
-
-static void on_response_call_deregister_emergency_pdn(GObject *source, GAsyncResult *outcome,
-                                                      gpointer context) {
-    complete(source, outcome, context);
+                   {answer<"on_response_call_register_emergency_pdn">, callback, user_data});
 }
 
 int ims_call_deregister_emergency_pdn(ims_h handle, ims_response_cb callback, void *user_data) {
@@ -473,12 +333,7 @@ int ims_call_deregister_emergency_pdn(ims_h handle, ims_response_cb callback, vo
         return refused;
     // The service tells the caller by its connection: no application id.
     return request(handle, kInterface, "DeregisterEmergencyPdn", pack<"()">(),
-                   {on_response_call_deregister_emergency_pdn, callback, user_data});
-}
-
-static void on_response_call_start_nway_conference_call(GObject *source, GAsyncResult *outcome,
-                                                        gpointer context) {
-    complete<"(ii)">(source, outcome, context, kSecondByPointer);
+                   {answer<"on_response_call_deregister_emergency_pdn">, callback, user_data});
 }
 
 int ims_call_start_nway_conference_call(ims_h handle, const ims_call_id_info_s *info,
@@ -487,39 +342,26 @@ int ims_call_start_nway_conference_call(ims_h handle, const ims_call_id_info_s *
         return refused;
     return request(handle, kInterface, "StartNwayConferenceCall",
                    pack<"(iiii)">(handle->app_id, info->session_id, info->value_1, info->value_2),
-                   {on_response_call_start_nway_conference_call, callback, user_data});
-}
-
-static void on_response_call_merge_calls(GObject *source, GAsyncResult *outcome, gpointer context) {
-    complete<"(ii)">(source, outcome, context, kSecondByPointer);
+                   {answer<"on_response_call_start_nway_conference_call", "(ii)", kSecondByPointer>,
+                    callback, user_data});
 }
 
 int ims_call_merge_calls(ims_h handle, ims_response_cb callback, void *user_data) {
     if (const int refused = admit({handle}))
         return refused;
-    return request(handle, kInterface, "MergeCalls", pack<"(i)">(handle->app_id),
-                   {on_response_call_merge_calls, callback, user_data});
-}
-
-static void on_response_call_add_participant_to_nway_conference_call(GObject *source,
-                                                                     GAsyncResult *outcome,
-                                                                     gpointer context) {
-    complete(source, outcome, context);
+    return request(
+        handle, kInterface, "MergeCalls", pack<"(i)">(handle->app_id),
+        {answer<"on_response_call_merge_calls", "(ii)", kSecondByPointer>, callback, user_data});
 }
 
 int ims_call_add_participant_to_nway_conference_call(ims_h handle, const ims_call_pair_info_s *info,
                                                      ims_response_cb callback, void *user_data) {
     if (const int refused = admit({handle, info}))
         return refused;
-    return request(handle, kInterface, "AddParticipantToNwayConferenceCall",
-                   pack<"(iii)">(handle->app_id, info->session_id, info->value_1),
-                   {on_response_call_add_participant_to_nway_conference_call, callback, user_data});
-}
-
-static void on_response_call_remove_participant_from_nway_conference_call(GObject *source,
-                                                                          GAsyncResult *outcome,
-                                                                          gpointer context) {
-    complete(source, outcome, context);
+    return request(
+        handle, kInterface, "AddParticipantToNwayConferenceCall",
+        pack<"(iii)">(handle->app_id, info->session_id, info->value_1),
+        {answer<"on_response_call_add_participant_to_nway_conference_call">, callback, user_data});
 }
 
 int ims_call_remove_participant_from_nway_conference_call(ims_h handle,
@@ -528,27 +370,18 @@ int ims_call_remove_participant_from_nway_conference_call(ims_h handle,
                                                           void *user_data) {
     if (const int refused = admit({handle, info}))
         return refused;
-    return request(
-        handle, kInterface, "RemoveParticipantFromNwayConferenceCall",
-        pack<"(iii)">(handle->app_id, info->session_id, info->value_1),
-        {on_response_call_remove_participant_from_nway_conference_call, callback, user_data});
-}
-
-static void on_response_call_is_in_epdg_call(GObject *source, GAsyncResult *outcome,
-                                             gpointer context) {
-    complete<"(ib)">(source, outcome, context, kSecondByPointer);
+    return request(handle, kInterface, "RemoveParticipantFromNwayConferenceCall",
+                   pack<"(iii)">(handle->app_id, info->session_id, info->value_1),
+                   {answer<"on_response_call_remove_participant_from_nway_conference_call">,
+                    callback, user_data});
 }
 
 int ims_call_is_in_epdg_call(ims_h handle, ims_response_cb callback, void *user_data) {
     if (const int refused = admit({handle}))
         return refused;
     return request(handle, kInterface, "IsInEpdgCall", pack<"(i)">(handle->app_id),
-                   {on_response_call_is_in_epdg_call, callback, user_data});
-}
-
-static void on_response_call_update_ssac_info(GObject *source, GAsyncResult *outcome,
-                                              gpointer context) {
-    complete(source, outcome, context);
+                   {answer<"on_response_call_is_in_epdg_call", "(ib)", kSecondByPointer>, callback,
+                    user_data});
 }
 
 int ims_call_update_ssac_info(ims_h handle, const ims_call_ssac_info_s *info,
@@ -558,12 +391,7 @@ int ims_call_update_ssac_info(ims_h handle, const ims_call_ssac_info_s *info,
     return request(handle, kInterface, "UpdateSsacInfo",
                    pack<"(iiiiii)">(handle->app_id, info->value_1, info->value_2, info->value_3,
                                     info->value_4, info->value_5),
-                   {on_response_call_update_ssac_info, callback, user_data});
-}
-
-static void on_response_call_change_epdg_audio_path(GObject *source, GAsyncResult *outcome,
-                                                    gpointer context) {
-    complete(source, outcome, context);
+                   {answer<"on_response_call_update_ssac_info">, callback, user_data});
 }
 
 int ims_call_change_epdg_audio_path(ims_h handle, int32_t value, ims_response_cb callback,
@@ -571,11 +399,7 @@ int ims_call_change_epdg_audio_path(ims_h handle, int32_t value, ims_response_cb
     if (const int refused = admit({handle}))
         return refused;
     return request(handle, kInterface, "ChangeEpdgAudioPath", pack<"(ii)">(handle->app_id, value),
-                   {on_response_call_change_epdg_audio_path, callback, user_data});
-}
-
-static void on_response_start_conference(GObject *source, GAsyncResult *outcome, gpointer context) {
-    complete<"(ii)">(source, outcome, context, kSecondInPlace);
+                   {answer<"on_response_call_change_epdg_audio_path">, callback, user_data});
 }
 
 int ims_call_start_conference(ims_h handle, const ims_call_conference_s *info,
@@ -586,12 +410,7 @@ int ims_call_start_conference(ims_h handle, const ims_call_conference_s *info,
     return request(
         handle, kInterface, "StartConference",
         pack<"(ii@v)">(info->value_1, info->count, participants(info->participants, info->count)),
-        {on_response_start_conference, callback, user_data});
-}
-
-static void on_response_modify_participants_into_conference(GObject *source, GAsyncResult *outcome,
-                                                            gpointer context) {
-    complete<"(ii)">(source, outcome, context, kSecondInPlace);
+        {answer<"on_response_start_conference", "(ii)", kSecondInPlace>, callback, user_data});
 }
 
 int ims_call_modify_participants_in_conference(ims_h handle,
@@ -599,13 +418,13 @@ int ims_call_modify_participants_in_conference(ims_h handle,
                                                ims_response_cb callback, void *user_data) {
     if (const int refused = admit({handle}))
         return refused;
-    return request(handle, kInterface, "ModifyParticipantsInConference",
-                   pack<"(iii@v)">(info->session_id, info->value_1, info->count,
-                                   participants(info->participants, info->count)),
-                   {on_response_modify_participants_into_conference, callback, user_data});
+    return request(
+        handle, kInterface, "ModifyParticipantsInConference",
+        pack<"(iii@v)">(info->session_id, info->value_1, info->count,
+                        participants(info->participants, info->count)),
+        {answer<"on_response_modify_participants_into_conference", "(ii)", kSecondInPlace>,
+         callback, user_data});
 }
-
-namespace {
 
 constexpr auto kCallFields = field_table({
     IMS_FIELD(ims_call_info_s, session_id),
@@ -615,8 +434,6 @@ constexpr auto kCallFields = field_table({
     IMS_FIELD(ims_call_info_s, call_state),
     IMS_FIELD(ims_call_info_s, bconfcall),
 });
-
-} // namespace
 
 int ims_call_get_call_list_info(ims_h handle, ims_call_list_info_s *list) {
     if (const int refused = admit({handle, list}))
@@ -629,10 +446,8 @@ int ims_call_get_call_list_info(ims_h handle, ims_call_list_info_s *list) {
     Variant calls;
     if (!unpack<"(iu@aa{sv})">(reply.get(), result, list->count, calls))
         return IMS_ERROR_OPERATION_FAILED;
-    if (result != 0) {
-        log_error(here(), "Failed to get Call Info: %d", result);
-        return IMS_ERROR_OPERATION_FAILED;
-    }
+    if (result != 0)
+        return operation_failed(here(), "Failed to get Call Info: %d", result);
     list->count = checked_count("Call", list->count, calls.get(), IMS_CALL_LIST_CAPACITY, here());
     read_list(calls.get(), kCallFields, std::span{list->entries, list->count});
     return IMS_ERROR_NONE;
@@ -660,17 +475,16 @@ bool is_believable(std::int32_t claimed, gsize arrived) noexcept {
     return claimed <= kMaxClaimedCount || static_cast<gsize>(claimed) <= arrived;
 }
 
-void emit_conf_notify(const Event &event, Site site) noexcept {
-    if (!event.is_wanted())
-        return;
+void emit_conf_notify(const Event &event) noexcept {
     ims_call_conf_notify_s notify{};
     Variant values;
     Variant texts;
-    if (!event.read<"(i@vi@vi)">(site, notify.session_id, values, notify.value_count, texts,
+    if (!event.is_wanted() ||
+        !event.read<"(i@vi@vi)">(notify.session_id, values, notify.value_count, texts,
                                  notify.text_count))
         return;
     if (!wire::has_type(values.get(), "ai") || !wire::has_type(texts.get(), "as")) {
-        event.drop(site, "(i<ai>i<as>i)");
+        event.drop("(i<ai>i<as>i)");
         return;
     }
     gsize arrived_values = 0;
@@ -679,7 +493,8 @@ void emit_conf_notify(const Event &event, Site site) noexcept {
     const gsize arrived_texts = g_variant_n_children(texts.get());
     if (!is_believable(notify.value_count, arrived_values) ||
         !is_believable(notify.text_count, arrived_texts)) {
-        log_error(site, "Notification dropped - noti_id: [%d], counts %d and %d for %zu and %zu",
+        log_error(event.site(),
+                  "Notification dropped - noti_id: [%d], counts %d and %d for %zu and %zu",
                   event.id(), notify.value_count, notify.text_count, arrived_values, arrived_texts);
         return;
     }
@@ -695,31 +510,31 @@ void emit_conf_notify(const Event &event, Site site) noexcept {
     event.deliver(&notify);
 }
 
-void emit_change_request(const Event &event, Site site) noexcept {
+// Delivers a record whose bytes came as base64 text. They are gone after the callback.
+template <typename Record>
+void deliver_decoded(const Event &event, Record &record, const char *text) noexcept {
+    const Decoded data = base64_decode(text);
+    record.data = data.bytes.get();
+    record.length = static_cast<std::int32_t>(data.count);
+    event.deliver(&record);
+}
+
+void emit_change_request(const Event &event) noexcept {
     ims_call_change_request_s change{};
     const char *text = nullptr;
-    if (!event.is_wanted() || !event.read<"(iis)">(site, change.session_id, change.call_type, text))
-        return;
-    const Decoded data = base64_decode(text);
-    change.data = data.bytes.get();
-    change.length = static_cast<std::int32_t>(data.count);
-    event.deliver(&change);
+    if (event.is_wanted() && event.read<"(iis)">(change.session_id, change.call_type, text))
+        deliver_decoded(event, change, text);
 }
 
-void emit_ussd_indication(const Event &event, Site site) noexcept {
+void emit_ussd_indication(const Event &event) noexcept {
     ims_call_ussd_indication_s ussd{};
     const char *text = nullptr;
-    if (!event.is_wanted() ||
-        !event.read<"(iiis)">(site, ussd.value_1, ussd.value_2, ussd.value_3, text))
-        return;
-    const Decoded data = base64_decode(text);
-    ussd.data = data.bytes.get();
-    ussd.length = static_cast<std::int32_t>(data.count);
-    event.deliver(&ussd);
+    if (event.is_wanted() && event.read<"(iiis)">(ussd.value_1, ussd.value_2, ussd.value_3, text))
+        deliver_decoded(event, ussd, text);
 }
 
-// Shapes of the ids 0x214 to 0x222, which no signal has: the service knows them, and none is ever
-// delivered.
+// The ids 0x214 to 0x222: the service has shapes for them, and no signal.
+constexpr const char *kNoSignal = nullptr;
 struct FlagEvent {
     std::int32_t session_id;
     bool flag_1;
@@ -730,71 +545,56 @@ struct FlagTextEvent {
     char *text_1;
 };
 
+constexpr auto emit_session = emit<"(i)", ims_call_session_s>;
+constexpr auto emit_conference = emit<"(ii)", ims_call_conference_event_s>;
+
+// The members are spelled as the service spells them, "Confernce" included.
+constexpr Notification kEvents[] = {
+    {IMS_NOTI_CALL_INCOMING_IND, "CallIncomingInd", emit<"(isisssssb)", ims_call_incoming_s>},
+    {IMS_NOTI_CALL_IN_PROGRESS, "CallInProgress", emit_session},
+    {IMS_NOTI_CALL_ALERTING, "CallAlerting", emit_session},
+    {IMS_NOTI_CALL_BUSY, "CallBusy", emit_session},
+    {IMS_NOTI_CALL_ESTABLISHED, "CallEstablished", emit<"(iibsb)", ims_call_established_s>},
+    {IMS_NOTI_CALL_HELD, "CallHeld", emit<"(ibi)", ims_call_held_s>},
+    {IMS_NOTI_CALL_RESUMED, "CallResumed", emit<"(ibbi)", ims_call_resumed_s>},
+    {IMS_NOTI_CALL_FORWARDED, "CallForwarded", emit_session},
+    {IMS_NOTI_CALL_ENDED, "CallEnded", emit<"(ii)", ims_call_ended_s>},
+    {IMS_NOTI_CALL_SWITCHED, "CallSwitched", emit<"(ii)", ims_call_switched_s>},
+    {IMS_NOTI_CALL_CHANGE_REQUEST, "CallChangeRequest", emit_change_request},
+    {IMS_NOTI_CALL_CONF_NOTIFY_RECEIVED, "CallConfNotifyReceived", emit_conf_notify},
+    {IMS_NOTI_CALL_EARLY_MEDIA_START, "CallEarlyMediaStart", emit<"(is)", ims_call_early_media_s>},
+    {IMS_NOTI_CALL_STOP_ALERT_TONE, "CallStopAlertTone", emit_session},
+    {IMS_NOTI_CALL_ERROR, "CallError", emit<"(iis)", ims_call_error_s>},
+    {IMS_NOTI_CALL_CONFERENCE_CALL_ESTABLISHED, "CallConfernceCallEstablished", emit_conference},
+    {IMS_NOTI_CALL_CONFERENCE_CALL_PARTICIPANT_ADDED, "CallConfernceCallParticipantAdded",
+     emit_conference},
+    {IMS_NOTI_CALL_CONFERENCE_CALL_PARTICIPANT_REMOVED, "CallConfernceCallParticipantRemoved",
+     emit_conference},
+    {IMS_NOTI_CALL_USSD_INDICATION, "CallUssdIndication", emit_ussd_indication},
+    {0x214, kNoSignal, emit_conference},
+    {0x215, kNoSignal, emit_session},
+    {0x216, kNoSignal, emit_session},
+    {0x217, kNoSignal, emit_conference},
+    {0x218, kNoSignal, emit<"(ibi)", ims_call_held_s>},
+    {0x219, kNoSignal, emit_session},
+    {0x21A, kNoSignal, emit_session},
+    {0x21B, kNoSignal, emit<"(ibs)", FlagTextEvent>},
+    {0x21C, kNoSignal, emit<"(ib)", FlagEvent>},
+    {0x21D, kNoSignal, emit_session},
+    {0x21E, kNoSignal, emit_session},
+    {0x21F, kNoSignal, emit_session},
+    {0x220, kNoSignal, emit_conference},
+    {0x221, kNoSignal, emit_conference},
+    {0x222, kNoSignal, emit_session},
+    {IMS_NOTI_CALL_DTMF_EVENT, "CallDtmfEvent", emit<"(y)", ims_call_dtmf_event_s>},
+};
+
 } // namespace
+
+constexpr Module ims::kCallModule{kInterface, on_call_signal_emit_handler, kEvents};
 
 void ims::on_call_signal_emit_handler(ims_h handle, int noti_id, GVariant *parameters,
                                       const ims_noti_cb_info_s *subscription) {
-    if (handle == nullptr) {
-        log_error(here(), "Ims Handle NULL");
-        return;
-    }
-    const Event event{handle, noti_id, parameters, subscription};
-    switch (noti_id) {
-    case IMS_NOTI_CALL_INCOMING_IND:
-        return event.emit<"(isisssssb)", ims_call_incoming_s>();
-    case IMS_NOTI_CALL_IN_PROGRESS:
-    case IMS_NOTI_CALL_ALERTING:
-    case IMS_NOTI_CALL_BUSY:
-    case IMS_NOTI_CALL_FORWARDED:
-    case IMS_NOTI_CALL_STOP_ALERT_TONE:
-        return event.emit<"(i)", ims_call_session_s>();
-    case IMS_NOTI_CALL_ESTABLISHED:
-        return event.emit<"(iibsb)", ims_call_established_s>();
-    case IMS_NOTI_CALL_HELD:
-        return event.emit<"(ibi)", ims_call_held_s>();
-    case IMS_NOTI_CALL_RESUMED:
-        return event.emit<"(ibbi)", ims_call_resumed_s>();
-    case IMS_NOTI_CALL_ENDED:
-        return event.emit<"(ii)", ims_call_ended_s>();
-    case IMS_NOTI_CALL_SWITCHED:
-        return event.emit<"(ii)", ims_call_switched_s>();
-    case IMS_NOTI_CALL_CHANGE_REQUEST:
-        return emit_change_request(event, here());
-    case IMS_NOTI_CALL_CONF_NOTIFY_RECEIVED:
-        return emit_conf_notify(event, here());
-    case IMS_NOTI_CALL_EARLY_MEDIA_START:
-        return event.emit<"(is)", ims_call_early_media_s>();
-    case IMS_NOTI_CALL_ERROR:
-        return event.emit<"(iis)", ims_call_error_s>();
-    case IMS_NOTI_CALL_CONFERENCE_CALL_ESTABLISHED:
-    case IMS_NOTI_CALL_CONFERENCE_CALL_PARTICIPANT_ADDED:
-    case IMS_NOTI_CALL_CONFERENCE_CALL_PARTICIPANT_REMOVED:
-        return event.emit<"(ii)", ims_call_conference_event_s>();
-    case IMS_NOTI_CALL_USSD_INDICATION:
-        return emit_ussd_indication(event, here());
-    case IMS_NOTI_CALL_DTMF_EVENT:
-        return event.emit<"(y)", ims_call_dtmf_event_s>();
-    case 0x214:
-    case 0x217:
-    case 0x220:
-    case 0x221:
-        return event.emit<"(ii)", ims_call_conference_event_s>();
-    case 0x215:
-    case 0x216:
-    case 0x219:
-    case 0x21A:
-    case 0x21D:
-    case 0x21E:
-    case 0x21F:
-    case 0x222:
-        return event.emit<"(i)", ims_call_session_s>();
-    case 0x218:
-        return event.emit<"(ibi)", ims_call_held_s>();
-    case 0x21B:
-        return event.emit<"(ibs)", FlagTextEvent>();
-    case 0x21C:
-        return event.emit<"(ib)", FlagEvent>();
-    default:
-        return;
-    }
+    if (is_handle(handle))
+        emit_row(kCallModule, {handle, noti_id, parameters, subscription});
 }

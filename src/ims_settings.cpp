@@ -23,17 +23,10 @@ int ims_get_global_settings_info(ims_h handle, const char *name, ims_global_sett
     Variant dictionary;
     if (!unpack<"(i@a{sv})">(reply.get(), result, dictionary))
         return IMS_ERROR_OPERATION_FAILED;
-    if (result != 0) {
-        log_error(here(), "Failed to get global settings Info: %d", result);
-        return IMS_ERROR_OPERATION_FAILED;
-    }
+    if (result != 0)
+        return operation_failed(here(), "Failed to get global settings Info: %d", result);
     read_dictionary(dictionary.get(), kSettingsFields, settings);
     return IMS_ERROR_NONE;
-}
-
-static void on_response_settings_update_global_settings(GObject *source, GAsyncResult *outcome,
-                                                        gpointer context) {
-    complete(source, outcome, context);
 }
 
 int ims_update_global_settings(ims_h handle, const ims_global_settings_s *settings,
@@ -42,12 +35,7 @@ int ims_update_global_settings(ims_h handle, const ims_global_settings_s *settin
         return refused;
     return request(handle, kInterface, "UpdateGlobalSettings",
                    pack<"(@a{sv})">(write_dictionary(kSettingsFields, kSettingsUpdate, settings)),
-                   {on_response_settings_update_global_settings, callback, user_data});
-}
-
-static void on_response_settings_add_global_settings(GObject *source, GAsyncResult *outcome,
-                                                     gpointer context) {
-    complete(source, outcome, context);
+                   {answer<"on_response_settings_update_global_settings">, callback, user_data});
 }
 
 int ims_add_global_settings(ims_h handle, const ims_global_settings_s *settings,
@@ -56,12 +44,7 @@ int ims_add_global_settings(ims_h handle, const ims_global_settings_s *settings,
         return refused;
     return request(handle, kInterface, "AddGlobalSettings",
                    pack<"(@a{sv})">(write_dictionary(kSettingsFields, kSettingsAdd, settings)),
-                   {on_response_settings_add_global_settings, callback, user_data});
-}
-
-static void on_response_settings_delete_global_settings(GObject *source, GAsyncResult *outcome,
-                                                        gpointer context) {
-    complete(source, outcome, context);
+                   {answer<"on_response_settings_add_global_settings">, callback, user_data});
 }
 
 // The record is not checked here, nor in ims_delete_profile().
@@ -70,7 +53,7 @@ int ims_delete_global_settings(ims_h handle, const ims_global_settings_s *settin
     if (const int refused = admit({handle}))
         return refused;
     return request(handle, kInterface, "DeleteGlobalSettings", pack<"(s)">(settings->name),
-                   {on_response_settings_delete_global_settings, callback, user_data});
+                   {answer<"on_response_settings_delete_global_settings">, callback, user_data});
 }
 
 void ims_global_settings_clear(ims_global_settings_s *settings) {
@@ -88,19 +71,12 @@ int ims_get_profile_list_info(ims_h handle, ims_profile_list_s *list) {
     Variant profiles;
     if (!unpack<"(iu@aa{sv})">(reply.get(), result, list->count, profiles))
         return IMS_ERROR_OPERATION_FAILED;
-    if (result != 0) {
-        log_error(here(), "Failed to get profile Info: %d", result);
-        return IMS_ERROR_OPERATION_FAILED;
-    }
+    if (result != 0)
+        return operation_failed(here(), "Failed to get profile Info: %d", result);
     list->count =
         checked_count("profile", list->count, profiles.get(), IMS_PROFILE_LIST_CAPACITY, here());
     read_list(profiles.get(), kProfileFields, std::span{list->profiles, list->count});
     return IMS_ERROR_NONE;
-}
-
-static void on_response_settings_update_profile(GObject *source, GAsyncResult *outcome,
-                                                gpointer context) {
-    complete(source, outcome, context);
 }
 
 int ims_update_profile(ims_h handle, const ims_profile_s *profile, ims_response_cb callback,
@@ -109,12 +85,7 @@ int ims_update_profile(ims_h handle, const ims_profile_s *profile, ims_response_
         return refused;
     return request(handle, kInterface, "UpdateProfile",
                    pack<"(@a{sv})">(write_dictionary(kProfileFields, kProfileWrite, profile)),
-                   {on_response_settings_update_profile, callback, user_data});
-}
-
-static void on_response_settings_add_profile(GObject *source, GAsyncResult *outcome,
-                                             gpointer context) {
-    complete(source, outcome, context);
+                   {answer<"on_response_settings_update_profile">, callback, user_data});
 }
 
 int ims_add_profile(ims_h handle, const ims_profile_s *profile, ims_response_cb callback,
@@ -123,12 +94,7 @@ int ims_add_profile(ims_h handle, const ims_profile_s *profile, ims_response_cb 
         return refused;
     return request(handle, kInterface, "AddProfile",
                    pack<"(@a{sv})">(write_dictionary(kProfileFields, kProfileWrite, profile)),
-                   {on_response_settings_add_profile, callback, user_data});
-}
-
-static void on_response_settings_delete_profile(GObject *source, GAsyncResult *outcome,
-                                                gpointer context) {
-    complete(source, outcome, context);
+                   {answer<"on_response_settings_add_profile">, callback, user_data});
 }
 
 int ims_delete_profile(ims_h handle, const ims_profile_s *profile, ims_response_cb callback,
@@ -136,7 +102,7 @@ int ims_delete_profile(ims_h handle, const ims_profile_s *profile, ims_response_
     if (const int refused = admit({handle}))
         return refused;
     return request(handle, kInterface, "DeleteProfile", pack<"(i)">(profile->id),
-                   {on_response_settings_delete_profile, callback, user_data});
+                   {answer<"on_response_settings_delete_profile">, callback, user_data});
 }
 
 void ims_profile_clear(ims_profile_s *profile) {
@@ -152,17 +118,12 @@ void ims_profile_list_clear(ims_profile_list_s *list) {
     list->count = 0;
 }
 
-static void on_response_settings_set_network_environment(GObject *source, GAsyncResult *outcome,
-                                                         gpointer context) {
-    complete(source, outcome, context);
-}
-
 int ims_set_network_environment(ims_h handle, int32_t environment_type, ims_response_cb callback,
                                 void *user_data) {
     if (const int refused = admit({handle}))
         return refused;
     return request(handle, kInterface, "SetNetworkEnvironment", pack<"(i)">(environment_type),
-                   {on_response_settings_set_network_environment, callback, user_data});
+                   {answer<"on_response_settings_set_network_environment">, callback, user_data});
 }
 
 int ims_get_network_environment(ims_h handle, int32_t *environment_type) {

@@ -23,25 +23,17 @@ Text encode_service_centre(std::uint8_t *sca) noexcept {
 
 } // namespace
 
-static void on_response_sms_send_sms(GObject *source, GAsyncResult *outcome, gpointer context) {
-    complete<"(iiii)">(source, outcome, context, kResultOnly);
-}
-
 int ims_sms_send_sms(ims_h handle, const ims_sms_send_info_s *info, ims_response_cb callback,
                      void *user_data) {
     if (const int refused = admit({handle, info}))
         return refused;
     const Text tpdu = base64_encode(info->tpdu, info->tpdu_length);
     const Text sca = encode_service_centre(info->sca);
-    return request(handle, kInterface, "SendSms",
-                   pack<"(isisi)">(handle->app_id, tpdu.get(), info->tpdu_length, sca.get(),
-                                   info->send_option),
-                   {on_response_sms_send_sms, callback, user_data});
-}
-
-static void on_response_sms_send_deliver_report(GObject *source, GAsyncResult *outcome,
-                                                gpointer context) {
-    complete<"(iiii)">(source, outcome, context, kResultOnly);
+    return request(
+        handle, kInterface, "SendSms",
+        pack<"(isisi)">(handle->app_id, tpdu.get(), info->tpdu_length, sca.get(),
+                        info->send_option),
+        {answer<"on_response_sms_send_sms", "(iiii)", kResultOnly>, callback, user_data});
 }
 
 int ims_sms_send_deliver_report(ims_h handle, const ims_sms_deliver_report_s *report,
@@ -52,7 +44,8 @@ int ims_sms_send_deliver_report(ims_h handle, const ims_sms_deliver_report_s *re
     return request(handle, kInterface, "SendDeliverReport",
                    pack<"(iisii)">(handle->app_id, report->report_code, tpdu.get(),
                                    report->tpdu_length, report->report_option),
-                   {on_response_sms_send_deliver_report, callback, user_data});
+                   {answer<"on_response_sms_send_deliver_report", "(iiii)", kResultOnly>, callback,
+                    user_data});
 }
 
 namespace {
@@ -60,10 +53,10 @@ namespace {
 // Puts a decoded TPDU into the event's record and delivers it; no event without a TPDU. The record
 // has its own length field: the service's is not to be trusted with it.
 template <typename Record>
-void emit_tpdu(const Event &event, Record &record, const char *text, Site site) noexcept {
+void emit_tpdu(const Event &event, Record &record, const char *text) noexcept {
     const Decoded tpdu = base64_decode(text);
     if (tpdu.count == 0) {
-        log_error(site, "base64 decoding of TPDU failed");
+        log_error(event.site(), "base64 decoding of TPDU failed");
         return;
     }
     record.tpdu = tpdu.bytes.get();
@@ -71,40 +64,36 @@ void emit_tpdu(const Event &event, Record &record, const char *text, Site site) 
     event.deliver(&record);
 }
 
-void emit_incoming(const Event &event, Site site) noexcept {
+void emit_incoming(const Event &event) noexcept {
     ims_sms_incoming_s incoming{};
     Skipped length;
     const char *text = nullptr;
-    if (event.read<"(isii)">(site, length, text, incoming.member_3, incoming.member_4))
-        emit_tpdu(event, incoming, text, site);
+    if (event.read<"(isii)">(length, text, incoming.member_3, incoming.member_4))
+        emit_tpdu(event, incoming, text);
 }
 
-void emit_send_ack(const Event &event, Site site) noexcept {
+void emit_send_ack(const Event &event) noexcept {
     ims_sms_send_ack_s ack{};
     const char *text = nullptr;
     Skipped length;
-    if (event.read<"(iiisii)">(site, ack.member_1, ack.member_2, ack.member_3, text, length,
+    if (event.read<"(iiisii)">(ack.member_1, ack.member_2, ack.member_3, text, length,
                                ack.member_6))
-        emit_tpdu(event, ack, text, site);
+        emit_tpdu(event, ack, text);
 }
+
+constexpr Notification kEvents[] = {
+    {IMS_NOTI_SMS_INCOMING_SMS, "IncomingSms", emit_incoming},
+    {IMS_NOTI_SMS_SEND_SMS_ACK, "SendSmsAck", emit_send_ack},
+    {IMS_NOTI_SMS_DELIVERY_REPORT_ACK, "DeliveryReportAck",
+     emit<"(ii)", ims_sms_delivery_report_ack_s>},
+};
 
 } // namespace
 
+constexpr Module ims::kSmsModule{kInterface, on_sms_signal_emit_handler, kEvents};
+
 void ims::on_sms_signal_emit_handler(ims_h handle, int noti_id, GVariant *parameters,
                                      const ims_noti_cb_info_s *subscription) {
-    if (handle == nullptr) {
-        log_error(here(), "Ims Handle NULL");
-        return;
-    }
-    const Event event{handle, noti_id, parameters, subscription};
-    switch (noti_id) {
-    case IMS_NOTI_SMS_INCOMING_SMS:
-        return emit_incoming(event, here());
-    case IMS_NOTI_SMS_SEND_SMS_ACK:
-        return emit_send_ack(event, here());
-    case IMS_NOTI_SMS_DELIVERY_REPORT_ACK:
-        return event.emit<"(ii)", ims_sms_delivery_report_ack_s>();
-    default:
-        return;
-    }
+    if (is_handle(handle))
+        emit_row(kSmsModule, {handle, noti_id, parameters, subscription});
 }

@@ -32,42 +32,33 @@ constexpr auto kBarringFields = field_table({
     IMS_FIELD(ims_ss_cb_info_s, cb_type),
 });
 
-// A service's name as its log lines have it.
-struct Service {
-    const char *name;
-    const char *list;
-};
+using Entries = decltype(ims_ss_status_list_s::entries);
 
-// Ends a get request: a list of entries, or the service's own failure. The texts in the entries are
-// borrowed from the reply.
-template <typename Entry>
-void complete_list(GObject *source, GAsyncResult *outcome, gpointer context, FieldsView fields,
-                   const Entry *decltype(ims_ss_status_list_s::entries)::*entries, Service service,
-                   Site site = here()) noexcept {
-    complete<"(iu@aa{sv})">(
-        source, outcome, context,
-        [=](const Completion &done, std::int32_t result, std::uint32_t count,
-            const Variant &dictionaries) {
-            if (result != 0) {
-                log_error(site, "Failed to get %s status: %d", service.name, result);
-                return done(result);
-            }
-            ims_ss_status_list_s list{
-                checked_count(service.list, count, dictionaries.get(), UINT32_MAX, site), {}};
-            std::vector<Entry> found(list.count);
-            read_list(dictionaries.get(), fields, std::span{found});
-            list.entries.*entries = found.empty() ? nullptr : found.data();
-            done(result, &list);
-        },
-        site);
-}
+// The list of entries that a service answers with, or its own failure: the service's name as the
+// lines about the one and the other have it. The texts in the entries are borrowed from the reply.
+template <Literal Failed, Literal Listed, const auto &Fields, typename Entry,
+          const Entry *Entries::*Member>
+constexpr auto kList = [](const Completion &done, std::int32_t result, std::uint32_t count,
+                          const Variant &dictionaries) {
+    if (result != 0) {
+        log_error(done.site(), "Failed to get %s status: %d", Failed.text, result);
+        return done(result);
+    }
+    ims_ss_status_list_s list{
+        checked_count(Listed.text, count, dictionaries.get(), UINT32_MAX, done.site()), {}};
+    std::vector<Entry> found(list.count);
+    read_list(dictionaries.get(), Fields, std::span{found});
+    list.entries.*Member = found.empty() ? nullptr : found.data();
+    done(result, &list);
+};
+constexpr auto kWaitingList =
+    kList<"waiting", "Waiting status", kWaitingFields, ims_ss_cw_info_s, &Entries::call_waiting>;
+constexpr auto kForwardingList = kList<"forwarding", "Forwarding status", kForwardingFields,
+                                       ims_ss_cf_info_s, &Entries::call_forwarding>;
+constexpr auto kBarringList =
+    kList<"barring", "Barring status", kBarringFields, ims_ss_cb_info_s, &Entries::call_barring>;
 
 } // namespace
-
-static void on_response_ss_set_call_waiting(GObject *source, GAsyncResult *outcome,
-                                            gpointer context) {
-    complete(source, outcome, context);
-}
 
 // Neither call-waiting request checks its handle or its record.
 int ims_ss_set_call_waiting(ims_h handle, const ims_ss_cw_info_s *info, ims_response_cb callback,
@@ -76,14 +67,7 @@ int ims_ss_set_call_waiting(ims_h handle, const ims_ss_cw_info_s *info, ims_resp
         return refused;
     return request(handle, kInterface, "SetCallWaiting",
                    pack<"(iii)">(handle->app_id, info->ss_class, info->ss_status),
-                   {on_response_ss_set_call_waiting, callback, user_data});
-}
-
-static void on_response_ss_get_call_waiting(GObject *source, GAsyncResult *outcome,
-                                            gpointer context) {
-    complete_list(source, outcome, context, kWaitingFields,
-                  &decltype(ims_ss_status_list_s::entries)::call_waiting,
-                  {"waiting", "Waiting status"});
+                   {answer<"on_response_ss_set_call_waiting">, callback, user_data});
 }
 
 int ims_ss_get_call_waiting(ims_h handle, int32_t ss_class, ims_response_cb callback,
@@ -91,12 +75,8 @@ int ims_ss_get_call_waiting(ims_h handle, int32_t ss_class, ims_response_cb call
     if (const int refused = admit())
         return refused;
     return request(handle, kInterface, "GetCallWaiting", pack<"(ii)">(handle->app_id, ss_class),
-                   {on_response_ss_get_call_waiting, callback, user_data});
-}
-
-static void on_response_ss_set_call_forwarding(GObject *source, GAsyncResult *outcome,
-                                               gpointer context) {
-    complete(source, outcome, context);
+                   {answer<"on_response_ss_get_call_waiting", "(iu@aa{sv})", kWaitingList>,
+                    callback, user_data});
 }
 
 int ims_ss_set_call_forwarding(ims_h handle, const ims_ss_cf_info_s *info, ims_response_cb callback,
@@ -107,14 +87,7 @@ int ims_ss_set_call_forwarding(ims_h handle, const ims_ss_cf_info_s *info, ims_r
                    pack<"(iiiiiiis)">(handle->app_id, info->ss_class, info->ss_status,
                                       info->cf_type, info->no_reply_time, info->cf_uri_length,
                                       info->cf_uri_type, info->cf_uri),
-                   {on_response_ss_set_call_forwarding, callback, user_data});
-}
-
-static void on_response_ss_get_call_forwarding(GObject *source, GAsyncResult *outcome,
-                                               gpointer context) {
-    complete_list(source, outcome, context, kForwardingFields,
-                  &decltype(ims_ss_status_list_s::entries)::call_forwarding,
-                  {"forwarding", "Forwarding status"});
+                   {answer<"on_response_ss_set_call_forwarding">, callback, user_data});
 }
 
 int ims_ss_get_call_forwarding(ims_h handle, const ims_ss_query_s *query, ims_response_cb callback,
@@ -123,12 +96,8 @@ int ims_ss_get_call_forwarding(ims_h handle, const ims_ss_query_s *query, ims_re
         return refused;
     return request(handle, kInterface, "GetCallForwarding",
                    pack<"(iii)">(handle->app_id, query->ss_class, query->type),
-                   {on_response_ss_get_call_forwarding, callback, user_data});
-}
-
-static void on_response_ss_set_call_barring(GObject *source, GAsyncResult *outcome,
-                                            gpointer context) {
-    complete(source, outcome, context);
+                   {answer<"on_response_ss_get_call_forwarding", "(iu@aa{sv})", kForwardingList>,
+                    callback, user_data});
 }
 
 int ims_ss_set_call_barring(ims_h handle, const ims_ss_cb_set_s *info, ims_response_cb callback,
@@ -138,14 +107,7 @@ int ims_ss_set_call_barring(ims_h handle, const ims_ss_cb_set_s *info, ims_respo
     return request(handle, kInterface, "SetCallBarring",
                    pack<"(iiiis)">(handle->app_id, info->ss_class, info->ss_status, info->cb_type,
                                    info->cb_password),
-                   {on_response_ss_set_call_barring, callback, user_data});
-}
-
-static void on_response_ss_get_call_barring(GObject *source, GAsyncResult *outcome,
-                                            gpointer context) {
-    complete_list(source, outcome, context, kBarringFields,
-                  &decltype(ims_ss_status_list_s::entries)::call_barring,
-                  {"barring", "Barring status"});
+                   {answer<"on_response_ss_set_call_barring">, callback, user_data});
 }
 
 int ims_ss_get_call_barring(ims_h handle, const ims_ss_query_s *query, ims_response_cb callback,
@@ -154,5 +116,6 @@ int ims_ss_get_call_barring(ims_h handle, const ims_ss_query_s *query, ims_respo
         return refused;
     return request(handle, kInterface, "GetCallBarring",
                    pack<"(iii)">(handle->app_id, query->ss_class, query->type),
-                   {on_response_ss_get_call_barring, callback, user_data});
+                   {answer<"on_response_ss_get_call_barring", "(iu@aa{sv})", kBarringList>,
+                    callback, user_data});
 }

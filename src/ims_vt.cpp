@@ -21,21 +21,12 @@ Variant surface_entries(const ims_vt_surface_s &surface) noexcept {
 
 } // namespace
 
-static void on_response_common_response(GObject *source, GAsyncResult *outcome, gpointer context) {
-    complete(source, outcome, context);
-}
-
-// The zoom is the reply's: gone after the callback.
-static void on_response_vt_get_zoom(GObject *source, GAsyncResult *outcome, gpointer context) {
-    complete<"(ii)">(source, outcome, context, kSecondByPointer);
-}
-
 int ims_vt_start_camera(ims_h handle, const ims_vt_camera_s *info, ims_response_cb callback,
                         void *user_data) {
     if (const int refused = admit({handle, info}))
         return refused;
     return request(handle, kInterface, "StartCamera", pack<"(ii)">(info->session_id, info->value_1),
-                   {on_response_common_response, callback, user_data});
+                   {answer<"on_response_common_response">, callback, user_data});
 }
 
 int ims_vt_stop_camera(ims_h handle, int32_t session_id, ims_response_cb callback,
@@ -43,7 +34,7 @@ int ims_vt_stop_camera(ims_h handle, int32_t session_id, ims_response_cb callbac
     if (const int refused = admit({handle}))
         return refused;
     return request(handle, kInterface, "StopCamera", pack<"(i)">(session_id),
-                   {on_response_common_response, callback, user_data});
+                   {answer<"on_response_common_response">, callback, user_data});
 }
 
 int ims_vt_hide_me(ims_h handle, const ims_vt_hide_me_s *info, ims_response_cb callback,
@@ -51,14 +42,14 @@ int ims_vt_hide_me(ims_h handle, const ims_vt_hide_me_s *info, ims_response_cb c
     if (const int refused = admit({handle, info}))
         return refused;
     return request(handle, kInterface, "HideMe", pack<"(is)">(info->session_id, info->text_1),
-                   {on_response_common_response, callback, user_data});
+                   {answer<"on_response_common_response">, callback, user_data});
 }
 
 int ims_vt_show_me(ims_h handle, int32_t session_id, ims_response_cb callback, void *user_data) {
     if (const int refused = admit({handle}))
         return refused;
     return request(handle, kInterface, "ShowMe", pack<"(i)">(session_id),
-                   {on_response_common_response, callback, user_data});
+                   {answer<"on_response_common_response">, callback, user_data});
 }
 
 int ims_vt_switch_camera(ims_h handle, int32_t session_id, ims_response_cb callback,
@@ -66,7 +57,7 @@ int ims_vt_switch_camera(ims_h handle, int32_t session_id, ims_response_cb callb
     if (const int refused = admit({handle}))
         return refused;
     return request(handle, kInterface, "SwitchCamera", pack<"(i)">(session_id),
-                   {on_response_common_response, callback, user_data});
+                   {answer<"on_response_common_response">, callback, user_data});
 }
 
 int ims_vt_set_video_orientation(ims_h handle, const ims_vt_orientation_s *info,
@@ -75,15 +66,16 @@ int ims_vt_set_video_orientation(ims_h handle, const ims_vt_orientation_s *info,
         return refused;
     return request(handle, kInterface, "SetVideoOrientation",
                    pack<"(ii)">(info->session_id, info->value_1),
-                   {on_response_common_response, callback, user_data});
+                   {answer<"on_response_common_response">, callback, user_data});
 }
 
 int ims_vt_get_zoom(ims_h handle, const ims_vt_zoom_query_s *info, ims_response_cb callback,
                     void *user_data) {
     if (const int refused = admit({handle, info}))
         return refused;
-    return request(handle, kInterface, "GetZoom", pack<"(ii)">(info->session_id, info->value_1),
-                   {on_response_vt_get_zoom, callback, user_data});
+    return request(
+        handle, kInterface, "GetZoom", pack<"(ii)">(info->session_id, info->value_1),
+        {answer<"on_response_vt_get_zoom", "(ii)", kSecondByPointer>, callback, user_data});
 }
 
 int ims_vt_set_zoom(ims_h handle, const ims_vt_zoom_s *info, ims_response_cb callback,
@@ -92,14 +84,14 @@ int ims_vt_set_zoom(ims_h handle, const ims_vt_zoom_s *info, ims_response_cb cal
         return refused;
     return request(handle, kInterface, "SetZoom",
                    pack<"(iii)">(info->session_id, info->value_1, info->value_2),
-                   {on_response_common_response, callback, user_data});
+                   {answer<"on_response_common_response">, callback, user_data});
 }
 
 int ims_vt_hold_video(ims_h handle, int32_t session_id, ims_response_cb callback, void *user_data) {
     if (const int refused = admit({handle}))
         return refused;
     return request(handle, kInterface, "HoldVideo", pack<"(i)">(session_id),
-                   {on_response_common_response, callback, user_data});
+                   {answer<"on_response_common_response">, callback, user_data});
 }
 
 int ims_vt_resume_video(ims_h handle, int32_t session_id, ims_response_cb callback,
@@ -107,7 +99,7 @@ int ims_vt_resume_video(ims_h handle, int32_t session_id, ims_response_cb callba
     if (const int refused = admit({handle}))
         return refused;
     return request(handle, kInterface, "ResumeVideo", pack<"(i)">(session_id),
-                   {on_response_common_response, callback, user_data});
+                   {answer<"on_response_common_response">, callback, user_data});
 }
 
 int ims_vt_capture_surface_image(ims_h handle, const ims_vt_capture_s *info,
@@ -116,7 +108,7 @@ int ims_vt_capture_surface_image(ims_h handle, const ims_vt_capture_s *info,
         return refused;
     return request(handle, kInterface, "CaptureSurfaceImage",
                    pack<"(iis)">(info->session_id, info->value_1, info->text_1),
-                   {on_response_common_response, callback, user_data});
+                   {answer<"on_response_common_response">, callback, user_data});
 }
 
 int ims_vt_start_record_video(ims_h handle, const ims_vt_record_start_s *info,
@@ -126,7 +118,7 @@ int ims_vt_start_record_video(ims_h handle, const ims_vt_record_start_s *info,
     return request(handle, kInterface, "StartRecordVideo",
                    pack<"(iiisi)">(info->session_id, info->value_1, info->value_2, info->text_1,
                                    info->value_3),
-                   {on_response_common_response, callback, user_data});
+                   {answer<"on_response_common_response">, callback, user_data});
 }
 
 int ims_vt_pause_record_video(ims_h handle, const ims_vt_record_s *info, ims_response_cb callback,
@@ -135,7 +127,7 @@ int ims_vt_pause_record_video(ims_h handle, const ims_vt_record_s *info, ims_res
         return refused;
     return request(handle, kInterface, "PauseRecordVideo",
                    pack<"(ii)">(info->session_id, info->value_1),
-                   {on_response_common_response, callback, user_data});
+                   {answer<"on_response_common_response">, callback, user_data});
 }
 
 int ims_vt_resume_record_video(ims_h handle, const ims_vt_record_s *info, ims_response_cb callback,
@@ -144,7 +136,7 @@ int ims_vt_resume_record_video(ims_h handle, const ims_vt_record_s *info, ims_re
         return refused;
     return request(handle, kInterface, "ResumeRecordVideo",
                    pack<"(ii)">(info->session_id, info->value_1),
-                   {on_response_common_response, callback, user_data});
+                   {answer<"on_response_common_response">, callback, user_data});
 }
 
 int ims_vt_cancel_record_video(ims_h handle, const ims_vt_record_s *info, ims_response_cb callback,
@@ -153,7 +145,7 @@ int ims_vt_cancel_record_video(ims_h handle, const ims_vt_record_s *info, ims_re
         return refused;
     return request(handle, kInterface, "CancelRecordVideo",
                    pack<"(ii)">(info->session_id, info->value_1),
-                   {on_response_common_response, callback, user_data});
+                   {answer<"on_response_common_response">, callback, user_data});
 }
 
 int ims_vt_stop_record_video(ims_h handle, const ims_vt_record_s *info, ims_response_cb callback,
@@ -162,7 +154,7 @@ int ims_vt_stop_record_video(ims_h handle, const ims_vt_record_s *info, ims_resp
         return refused;
     return request(handle, kInterface, "StopRecordVideo",
                    pack<"(ii)">(info->session_id, info->value_1),
-                   {on_response_common_response, callback, user_data});
+                   {answer<"on_response_common_response">, callback, user_data});
 }
 
 int ims_vt_start_file_cast(ims_h handle, const ims_vt_file_cast_s *info, ims_response_cb callback,
@@ -171,7 +163,7 @@ int ims_vt_start_file_cast(ims_h handle, const ims_vt_file_cast_s *info, ims_res
         return refused;
     return request(handle, kInterface, "StartFileCast",
                    pack<"(is)">(info->session_id, info->text_1),
-                   {on_response_common_response, callback, user_data});
+                   {answer<"on_response_common_response">, callback, user_data});
 }
 
 int ims_vt_stop_file_cast(ims_h handle, int32_t session_id, ims_response_cb callback,
@@ -179,7 +171,7 @@ int ims_vt_stop_file_cast(ims_h handle, int32_t session_id, ims_response_cb call
     if (const int refused = admit({handle}))
         return refused;
     return request(handle, kInterface, "StopFileCast", pack<"(i)">(session_id),
-                   {on_response_common_response, callback, user_data});
+                   {answer<"on_response_common_response">, callback, user_data});
 }
 
 int ims_vt_swap_video_surface(ims_h handle, int32_t session_id, ims_response_cb callback,
@@ -187,7 +179,7 @@ int ims_vt_swap_video_surface(ims_h handle, int32_t session_id, ims_response_cb 
     if (const int refused = admit({handle}))
         return refused;
     return request(handle, kInterface, "SwapVideoSurface", pack<"(i)">(session_id),
-                   {on_response_common_response, callback, user_data});
+                   {answer<"on_response_common_response">, callback, user_data});
 }
 
 // The record is not checked.
@@ -198,7 +190,7 @@ int ims_vt_swipe_video(ims_h handle, const ims_vt_swipe_s *info, ims_response_cb
     return request(handle, kInterface, "SwipeVideo",
                    pack<"(iiiiii)">(info->session_id, info->value_1, info->value_2, info->value_3,
                                     info->value_4, info->value_5),
-                   {on_response_common_response, callback, user_data});
+                   {answer<"on_response_common_response">, callback, user_data});
 }
 
 int ims_vt_set_near_end_surface(ims_h handle, const ims_vt_surface_s *info,
@@ -207,7 +199,7 @@ int ims_vt_set_near_end_surface(ims_h handle, const ims_vt_surface_s *info,
         return refused;
     return request(handle, kInterface, "SetNearEndSurface",
                    pack<"(iiv)">(info->session_id, info->count, surface_entries(*info)),
-                   {on_response_common_response, callback, user_data});
+                   {answer<"on_response_common_response">, callback, user_data});
 }
 
 int ims_vt_set_far_end_surface(ims_h handle, const ims_vt_surface_s *info, ims_response_cb callback,
@@ -216,7 +208,7 @@ int ims_vt_set_far_end_surface(ims_h handle, const ims_vt_surface_s *info, ims_r
         return refused;
     return request(handle, kInterface, "SetFarEndSurface",
                    pack<"(iiv)">(info->session_id, info->count, surface_entries(*info)),
-                   {on_response_common_response, callback, user_data});
+                   {answer<"on_response_common_response">, callback, user_data});
 }
 
 int ims_vt_set_active_session_id(ims_h handle, int32_t session_id, ims_response_cb callback,
@@ -224,7 +216,7 @@ int ims_vt_set_active_session_id(ims_h handle, int32_t session_id, ims_response_
     if (const int refused = admit({handle}))
         return refused;
     return request(handle, kInterface, "SetActiveSessionId", pack<"(i)">(session_id),
-                   {on_response_common_response, callback, user_data});
+                   {answer<"on_response_common_response">, callback, user_data});
 }
 
 int ims_vt_re_use_pix_map_id(ims_h handle, const ims_vt_pix_map_re_use_s *info,
@@ -233,7 +225,7 @@ int ims_vt_re_use_pix_map_id(ims_h handle, const ims_vt_pix_map_re_use_s *info,
         return refused;
     return request(handle, kInterface, "ReUsePixMapId",
                    pack<"(iii)">(info->session_id, info->value_1, info->value_2),
-                   {on_response_common_response, callback, user_data});
+                   {answer<"on_response_common_response">, callback, user_data});
 }
 
 int ims_vt_release_pix_map_id(ims_h handle, const ims_vt_pix_map_s *info, ims_response_cb callback,
@@ -242,7 +234,7 @@ int ims_vt_release_pix_map_id(ims_h handle, const ims_vt_pix_map_s *info, ims_re
         return refused;
     return request(handle, kInterface, "ReleasePixMapId",
                    pack<"(ii)">(info->session_id, info->value_1),
-                   {on_response_common_response, callback, user_data});
+                   {answer<"on_response_common_response">, callback, user_data});
 }
 
 int ims_vt_set_window_id(ims_h handle, const ims_vt_window_s *info, ims_response_cb callback,
@@ -252,7 +244,7 @@ int ims_vt_set_window_id(ims_h handle, const ims_vt_window_s *info, ims_response
     return request(handle, kInterface, "SetWindowId",
                    pack<"(iiiiii)">(info->session_id, info->value_1, info->value_2, info->value_3,
                                     info->value_4, info->value_5),
-                   {on_response_common_response, callback, user_data});
+                   {answer<"on_response_common_response">, callback, user_data});
 }
 
 int ims_vt_set_camera_buffer(ims_h handle, const ims_vt_buffer_s *info, ims_response_cb callback,
@@ -261,7 +253,7 @@ int ims_vt_set_camera_buffer(ims_h handle, const ims_vt_buffer_s *info, ims_resp
         return refused;
     return request(handle, kInterface, "SetCameraBuffer",
                    pack<"(is)">(info->session_id, info->text_1),
-                   {on_response_common_response, callback, user_data});
+                   {answer<"on_response_common_response">, callback, user_data});
 }
 
 int ims_vt_set_media_buffer(ims_h handle, const ims_vt_buffer_s *info, ims_response_cb callback,
@@ -270,5 +262,5 @@ int ims_vt_set_media_buffer(ims_h handle, const ims_vt_buffer_s *info, ims_respo
         return refused;
     return request(handle, kInterface, "SetMediaBuffer",
                    pack<"(is)">(info->session_id, info->text_1),
-                   {on_response_common_response, callback, user_data});
+                   {answer<"on_response_common_response">, callback, user_data});
 }

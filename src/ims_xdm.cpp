@@ -23,51 +23,43 @@ class Bounded {
     char copy_[Size];
 };
 
-// A line under the name of the part of the document that it is about.
-void log_missing(const char *builder, const char *message, Site site = here()) noexcept {
-    log_error({site.file, builder, site.line}, "%s", message);
-}
-
 // Missing parts are worth a line each and stop nothing.
 void report_missing_parts(const ims_xdm_group_info_s &group) noexcept {
     if (group.group_properties == nullptr)
-        log_missing("__create_group_properties_variant", "group_properties is NULL");
+        log_error(named("__create_group_properties_variant"), "group_properties is NULL");
     else if (group.group_properties->supported_services == nullptr)
-        log_missing("__create_supported_services_variant", "supported_services is NULL");
+        log_error(named("__create_supported_services_variant"), "supported_services is NULL");
     if (group.group_member_list == nullptr)
-        log_missing("__create_group_member_info_variant", "participants is NULL");
+        log_error(named("__create_group_member_info_variant"), "participants is NULL");
 }
 
-void __free_group_info(ims_xdm_group_info_s *group) noexcept {
+void free_group_info(ims_xdm_group_info_s *group) noexcept {
+    const Site site = named("__free_group_info");
     if (group == nullptr) {
-        log_error(here(), "No Group Info Present");
+        log_error(site, "No Group Info Present");
         return;
     }
     if (group->group_properties == nullptr)
-        log_error(here(), "No Group Properties Info Present");
+        log_error(site, "No Group Properties Info Present");
     if (group->group_member_list == nullptr)
-        log_error(here(), "No Group Members List Info Present");
+        log_error(site, "No Group Members List Info Present");
     if (group->group_rule_set == nullptr)
-        log_error(here(), "No Group Rule Info Present");
+        log_error(site, "No Group Rule Info Present");
     release_new(kGroupInfo, group);
 }
 
-// Ends a request whose reply is a result and a record; a result other than 0 brings no record.
-template <typename Deliver>
-void complete_reading(const char *subject, GObject *source, GAsyncResult *outcome, gpointer context,
-                      const Deliver &deliver, Site site = here()) noexcept {
-    const auto check = [&](const Completion &done, std::int32_t result, const Variant &record) {
-        if (result != 0) {
-            log_error(site, "Failed to fetch %s Info: %d", subject, result);
-            done(result);
-        } else {
-            deliver(done, record.get());
-        }
-    };
-    complete<"(i@a{sv})">(source, outcome, context, check, site);
-}
+// A reply of a result and a record; a result other than 0 brings no record, but a line about its
+// subject.
+template <Literal Subject, auto Deliver>
+constexpr auto kFetched = [](const Completion &done, std::int32_t result, const Variant &record) {
+    if (result != 0) {
+        log_error(done.site(), "Failed to fetch %s Info: %d", Subject.text, result);
+        return done(result);
+    }
+    Deliver(done, record.get());
+};
 
-// The same for a record that is released as it was read.
+// A record that is released as it was read.
 template <const auto &Table>
 constexpr auto kRecord = [](const Completion &done, GVariant *dictionary) {
     Received<Table> received{dictionary};
@@ -76,11 +68,6 @@ constexpr auto kRecord = [](const Completion &done, GVariant *dictionary) {
 
 } // namespace
 
-static void on_response_xdm_common_response(GObject *source, GAsyncResult *outcome,
-                                            gpointer context) {
-    complete(source, outcome, context);
-}
-
 int ims_xdm_create_group(ims_h handle, const ims_xdm_group_info_s *group, ims_response_cb callback,
                          void *user_data) {
     if (const int refused = admit({handle, group}))
@@ -88,7 +75,7 @@ int ims_xdm_create_group(ims_h handle, const ims_xdm_group_info_s *group, ims_re
     report_missing_parts(*group);
     return request(handle, kInterface, "XdmCreateGroup",
                    pack<"(@a{sv})">(write_record(kGroupInfo, group)),
-                   {on_response_xdm_common_response, callback, user_data});
+                   {answer<"on_response_xdm_common_response">, callback, user_data});
 }
 
 int ims_xdm_delete_group(ims_h handle, const char *group_uri, ims_response_cb callback,
@@ -96,51 +83,42 @@ int ims_xdm_delete_group(ims_h handle, const char *group_uri, ims_response_cb ca
     if (const int refused = admit({handle, group_uri}))
         return refused;
     return request(handle, kInterface, "XdmDeleteGroup", pack<"(s)">(group_uri),
-                   {on_response_xdm_common_response, callback, user_data});
+                   {answer<"on_response_xdm_common_response">, callback, user_data});
 }
 
-static void on_response_xdm_fetch_shared_group(GObject *source, GAsyncResult *outcome,
-                                               gpointer context) {
-    complete_reading("group", source, outcome, context,
-                     [](const Completion &done, GVariant *dictionary) {
-                         ims_xdm_group_info_s *group = read_new(dictionary, kGroupInfo);
-                         done(0, group);
-                         __free_group_info(group);
-                     });
-}
+constexpr auto kGroup = [](const Completion &done, GVariant *dictionary) {
+    ims_xdm_group_info_s *group = read_new(dictionary, kGroupInfo);
+    done(0, group);
+    free_group_info(group);
+};
 
 int ims_xdm_fetch_shared_group(ims_h handle, const ims_xdm_group_info_s *group,
                                ims_response_cb callback, void *user_data) {
     if (const int refused = admit({handle, group}))
         return refused;
-    return request(handle, kInterface, "XdmFetchSharedGroup",
-                   pack<"(ss)">(Bounded{group->group_uri}.get(), group->channel_id),
-                   {on_response_xdm_fetch_shared_group, callback, user_data});
+    return request(
+        handle, kInterface, "XdmFetchSharedGroup",
+        pack<"(ss)">(Bounded{group->group_uri}.get(), group->channel_id),
+        {answer<"on_response_xdm_fetch_shared_group", "(i@a{sv})", kFetched<"group", kGroup>>,
+         callback, user_data});
 }
 
-static void on_response_xdm_fetch_all_shared_groups(GObject *source, GAsyncResult *outcome,
-                                                    gpointer context) {
-    complete_reading("group", source, outcome, context,
-                     [](const Completion &done, GVariant *dictionary) {
-                         Received<kSharedGroups> received{dictionary};
-                         ims_xdm_shared_group_list_s &list = received.record;
-                         done(0, &list);
-                         for (std::int32_t at = 0; list.groups != nullptr && at < list.count; ++at)
-                             __free_group_info(std::exchange(list.groups[at], nullptr));
-                     });
-}
+constexpr auto kGroups = [](const Completion &done, GVariant *dictionary) {
+    Received<kSharedGroups> received{dictionary};
+    ims_xdm_shared_group_list_s &list = received.record;
+    done(0, &list);
+    for (std::int32_t at = 0; list.groups != nullptr && at < list.count; ++at)
+        free_group_info(std::exchange(list.groups[at], nullptr));
+};
 
 int ims_xdm_fetch_all_shared_groups(ims_h handle, const char *text, ims_response_cb callback,
                                     void *user_data) {
     if (const int refused = admit({handle}))
         return refused;
-    return request(handle, kInterface, "XdmFetchAllSharedGroups", pack<"(s)">(text),
-                   {on_response_xdm_fetch_all_shared_groups, callback, user_data});
-}
-
-static void on_response_xdm_fetch_all_participant_groups(GObject *source, GAsyncResult *outcome,
-                                                         gpointer context) {
-    complete_reading("participant group", source, outcome, context, kRecord<kParticipantGroups>);
+    return request(
+        handle, kInterface, "XdmFetchAllSharedGroups", pack<"(s)">(text),
+        {answer<"on_response_xdm_fetch_all_shared_groups", "(i@a{sv})", kFetched<"group", kGroups>>,
+         callback, user_data});
 }
 
 int ims_xdm_fetch_all_participant_groups(ims_h handle, const char *text, ims_response_cb callback,
@@ -148,12 +126,9 @@ int ims_xdm_fetch_all_participant_groups(ims_h handle, const char *text, ims_res
     if (const int refused = admit({handle}))
         return refused;
     return request(handle, kInterface, "XdmFetchAllParticipantGroups", pack<"(s)">(text),
-                   {on_response_xdm_fetch_all_participant_groups, callback, user_data});
-}
-
-static void on_response_xdm_fetch_shared_user_profile(GObject *source, GAsyncResult *outcome,
-                                                      gpointer context) {
-    complete_reading("shared user profile", source, outcome, context, kRecord<kUserProfile>);
+                   {answer<"on_response_xdm_fetch_all_participant_groups", "(i@a{sv})",
+                           kFetched<"participant group", kRecord<kParticipantGroups>>>,
+                    callback, user_data});
 }
 
 int ims_xdm_fetch_shared_user_profile(ims_h handle, const char *text, ims_response_cb callback,
@@ -161,7 +136,9 @@ int ims_xdm_fetch_shared_user_profile(ims_h handle, const char *text, ims_respon
     if (const int refused = admit({handle}))
         return refused;
     return request(handle, kInterface, "XdmFetchSharedUserProfile", pack<"(s)">(text),
-                   {on_response_xdm_fetch_shared_user_profile, callback, user_data});
+                   {answer<"on_response_xdm_fetch_shared_user_profile", "(i@a{sv})",
+                           kFetched<"shared user profile", kRecord<kUserProfile>>>,
+                    callback, user_data});
 }
 
 int ims_xdm_add_user_to_shared_group(ims_h handle, const char *group_uri,
@@ -171,7 +148,7 @@ int ims_xdm_add_user_to_shared_group(ims_h handle, const char *group_uri,
         return refused;
     return request(handle, kInterface, "XdmAddUserToSharedGroup",
                    pack<"(s@a{sv})">(group_uri, write_record(kMemberList, members)),
-                   {on_response_xdm_common_response, callback, user_data});
+                   {answer<"on_response_xdm_common_response">, callback, user_data});
 }
 
 int ims_xdm_remove_user_from_shared_group(ims_h handle, const char *group_uri,
@@ -181,7 +158,7 @@ int ims_xdm_remove_user_from_shared_group(ims_h handle, const char *group_uri,
         return refused;
     return request(handle, kInterface, "XdmRemoveUserFromSharedGroup",
                    pack<"(s@a{sv})">(group_uri, write_record(kMemberList, members)),
-                   {on_response_xdm_common_response, callback, user_data});
+                   {answer<"on_response_xdm_common_response">, callback, user_data});
 }
 
 int ims_xdm_add_group_rule(ims_h handle, const char *group_uri, const ims_xdm_group_rule_s *rules,
@@ -190,7 +167,7 @@ int ims_xdm_add_group_rule(ims_h handle, const char *group_uri, const ims_xdm_gr
         return refused;
     return request(handle, kInterface, "XdmAddGroupRule",
                    pack<"(s@aa{sv})">(group_uri, write_chain(kGroupRule, rules)),
-                   {on_response_xdm_common_response, callback, user_data});
+                   {answer<"on_response_xdm_common_response">, callback, user_data});
 }
 
 int ims_xdm_modify_group_rule(ims_h handle, const char *group_uri,
@@ -200,7 +177,7 @@ int ims_xdm_modify_group_rule(ims_h handle, const char *group_uri,
         return refused;
     return request(handle, kInterface, "XdmModifyGroupRule",
                    pack<"(s@aa{sv})">(group_uri, write_chain(kGroupRule, rules)),
-                   {on_response_xdm_common_response, callback, user_data});
+                   {answer<"on_response_xdm_common_response">, callback, user_data});
 }
 
 int ims_xdm_delete_group_rule(ims_h handle, const char *group_uri, const char *rule_id,
@@ -208,7 +185,7 @@ int ims_xdm_delete_group_rule(ims_h handle, const char *group_uri, const char *r
     if (const int refused = admit({handle, group_uri, rule_id}))
         return refused;
     return request(handle, kInterface, "XdmDeleteGroupRule", pack<"(ss)">(group_uri, rule_id),
-                   {on_response_xdm_common_response, callback, user_data});
+                   {answer<"on_response_xdm_common_response">, callback, user_data});
 }
 
 int ims_xdm_modify_group_display_name(ims_h handle, const char *group_uri, const char *display_name,
@@ -217,7 +194,7 @@ int ims_xdm_modify_group_display_name(ims_h handle, const char *group_uri, const
         return refused;
     return request(handle, kInterface, "XdmModifyGroupDisplayName",
                    pack<"(ss)">(group_uri, display_name),
-                   {on_response_xdm_common_response, callback, user_data});
+                   {answer<"on_response_xdm_common_response">, callback, user_data});
 }
 
 int ims_xdm_modify_group_subject(ims_h handle, const char *group_uri, const char *subject,
@@ -225,7 +202,7 @@ int ims_xdm_modify_group_subject(ims_h handle, const char *group_uri, const char
     if (const int refused = admit({handle, group_uri, subject}))
         return refused;
     return request(handle, kInterface, "XdmModifyGroupSubject", pack<"(ss)">(group_uri, subject),
-                   {on_response_xdm_common_response, callback, user_data});
+                   {answer<"on_response_xdm_common_response">, callback, user_data});
 }
 
 int ims_xdm_modify_group_searchable(ims_h handle, const char *group_uri, bool searchable,
@@ -234,7 +211,7 @@ int ims_xdm_modify_group_searchable(ims_h handle, const char *group_uri, bool se
         return refused;
     return request(handle, kInterface, "XdmModifyGroupSearchable",
                    pack<"(sb)">(group_uri, searchable),
-                   {on_response_xdm_common_response, callback, user_data});
+                   {answer<"on_response_xdm_common_response">, callback, user_data});
 }
 
 int ims_xdm_modify_group_invite_members(ims_h handle, const char *group_uri, bool invite_members,
@@ -243,7 +220,7 @@ int ims_xdm_modify_group_invite_members(ims_h handle, const char *group_uri, boo
         return refused;
     return request(handle, kInterface, "XdmModifyGroupInviteMembers",
                    pack<"(sb)">(group_uri, invite_members),
-                   {on_response_xdm_common_response, callback, user_data});
+                   {answer<"on_response_xdm_common_response">, callback, user_data});
 }
 
 int ims_xdm_modify_group_max_participants(ims_h handle, const char *group_uri,
@@ -253,7 +230,7 @@ int ims_xdm_modify_group_max_participants(ims_h handle, const char *group_uri,
         return refused;
     return request(handle, kInterface, "XdmModifyGroupMaxParticipants",
                    pack<"(si)">(group_uri, max_participants),
-                   {on_response_xdm_common_response, callback, user_data});
+                   {answer<"on_response_xdm_common_response">, callback, user_data});
 }
 
 int ims_xdm_modify_group_auto_advertisements(ims_h handle, const char *group_uri,
@@ -263,7 +240,7 @@ int ims_xdm_modify_group_auto_advertisements(ims_h handle, const char *group_uri
         return refused;
     return request(handle, kInterface, "XdmModifyGroupAutoAdvertisements",
                    pack<"(sb)">(group_uri, auto_advertisements),
-                   {on_response_xdm_common_response, callback, user_data});
+                   {answer<"on_response_xdm_common_response">, callback, user_data});
 }
 
 int ims_xdm_modify_group_qoe(ims_h handle, const char *group_uri, int32_t qoe,
@@ -271,7 +248,7 @@ int ims_xdm_modify_group_qoe(ims_h handle, const char *group_uri, int32_t qoe,
     if (const int refused = admit({handle, group_uri}))
         return refused;
     return request(handle, kInterface, "XdmModifyGroupQoe", pack<"(si)">(group_uri, qoe),
-                   {on_response_xdm_common_response, callback, user_data});
+                   {answer<"on_response_xdm_common_response">, callback, user_data});
 }
 
 int ims_xdm_modify_group_session_active_policy(ims_h handle, const char *group_uri,
@@ -281,7 +258,7 @@ int ims_xdm_modify_group_session_active_policy(ims_h handle, const char *group_u
         return refused;
     return request(handle, kInterface, "XdmModifyGroupSessionActivePolicy",
                    pack<"(s@a{sv})">(group_uri, write_record(kSessionPolicy, policy)),
-                   {on_response_xdm_common_response, callback, user_data});
+                   {answer<"on_response_xdm_common_response">, callback, user_data});
 }
 
 int ims_xdm_modify_group_session_service_list(ims_h handle, const char *group_uri,
@@ -291,7 +268,7 @@ int ims_xdm_modify_group_session_service_list(ims_h handle, const char *group_ur
         return refused;
     return request(handle, kInterface, "XdmModifyGroupSessionServiceList",
                    pack<"(s@a{sv})">(group_uri, write_record(kSessionService, service)),
-                   {on_response_xdm_common_response, callback, user_data});
+                   {answer<"on_response_xdm_common_response">, callback, user_data});
 }
 
 int ims_xdm_modify_group_age_restriction(ims_h handle, const char *group_uri,
@@ -301,7 +278,7 @@ int ims_xdm_modify_group_age_restriction(ims_h handle, const char *group_uri,
         return refused;
     return request(handle, kInterface, "XdmModifyGroupAgeRestriction",
                    pack<"(s@aa{sv})">(group_uri, write_chain(kAgeRestriction, restrictions)),
-                   {on_response_xdm_common_response, callback, user_data});
+                   {answer<"on_response_xdm_common_response">, callback, user_data});
 }
 
 // Here the type of the member is sent, not its active flag again.
@@ -317,7 +294,7 @@ int ims_xdm_modify_group_attributes(ims_h handle, const ims_xdm_group_attributes
                                            member->disp_name, member->stt, member->active,
                                            member->type, member->auto_join,
                                            write_record(kMemberStatus, &member->status)),
-                   {on_response_xdm_common_response, callback, user_data});
+                   {answer<"on_response_xdm_common_response">, callback, user_data});
 }
 
 int ims_xdm_modify_default_group(ims_h handle, const ims_xdm_default_group_s *default_group,
@@ -327,12 +304,7 @@ int ims_xdm_modify_default_group(ims_h handle, const ims_xdm_default_group_s *de
     return request(handle, kInterface, "XdmModifyDefaultGroup",
                    pack<"(ssb)">(default_group->group_list_name, default_group->group_uri,
                                  default_group->is_default_group),
-                   {on_response_xdm_common_response, callback, user_data});
-}
-
-static void on_response_xdm_get_participant_info(GObject *source, GAsyncResult *outcome,
-                                                 gpointer context) {
-    complete_reading("conf participant", source, outcome, context, kRecord<kParticipantInfo>);
+                   {answer<"on_response_xdm_common_response">, callback, user_data});
 }
 
 int ims_xdm_get_participant_info(ims_h handle, const char *text, ims_response_cb callback,
@@ -340,5 +312,7 @@ int ims_xdm_get_participant_info(ims_h handle, const char *text, ims_response_cb
     if (const int refused = admit({handle, text}))
         return refused;
     return request(handle, kInterface, "XdmGetParticipantInfo", pack<"(s)">(text),
-                   {on_response_xdm_get_participant_info, callback, user_data});
+                   {answer<"on_response_xdm_get_participant_info", "(i@a{sv})",
+                           kFetched<"conf participant", kRecord<kParticipantInfo>>>,
+                    callback, user_data});
 }

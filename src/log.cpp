@@ -4,17 +4,11 @@
 #include "wire/glib.hpp"
 
 #include <cstdarg>
-#include <string_view>
 
 namespace ims {
 namespace {
 
 constexpr const char *kTag = "MEGORE";
-
-const char *file_name(std::string_view path) noexcept {
-    const auto slash = path.rfind('/');
-    return path.data() + (slash == std::string_view::npos ? 0 : slash + 1);
-}
 
 __attribute__((format(printf, 3, 0))) void write(int priority, Site site, const char *format,
                                                  std::va_list arguments) noexcept {
@@ -37,6 +31,14 @@ void log_warning(Site site, const char *format, ...) noexcept {
     va_start(arguments, format);
     write(IMS_PLATFORM_LOG_WARNING, site, format, arguments);
     va_end(arguments);
+}
+
+int operation_failed(Site site, const char *format, ...) noexcept {
+    std::va_list arguments;
+    va_start(arguments, format);
+    write(IMS_PLATFORM_LOG_ERROR, site, format, arguments);
+    va_end(arguments);
+    return IMS_ERROR_OPERATION_FAILED;
 }
 
 } // namespace ims

@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Asking for notifications and ending them.
+#include "src/notifications.hpp"
 #include "tests/library/ims/notification_table.hpp"
 #include "tests/support/bus_observer.hpp"
 #include "tests/support/expectations.hpp"
@@ -17,6 +18,11 @@ const ims_notification_cb kCallback = NotificationRecorder::callback;
 
 std::string signal_string(const NotificationRow &row) {
     return std::string{row.interface} + ":" + row.member;
+}
+
+// What the library keeps of a subscription, and is given with each of its signals.
+const ims_noti_cb_info_s &kept_of(const ObservedSubscription &subscription) {
+    return *static_cast<const ims_noti_cb_info_s *>(subscription.user_data);
 }
 
 class Registry : public WithPeer {
@@ -53,7 +59,12 @@ TEST_P(Notifications, AreSubscribedToExactlyTheirSignal) {
     EXPECT_EQ(subscriptions[0].path, kPath);
     EXPECT_FALSE(subscriptions[0].has_argument_filter);
     EXPECT_EQ(subscriptions[0].flags, G_DBUS_SIGNAL_FLAGS_NONE);
-    EXPECT_EQ(subscriptions[0].user_data, handle_);
+    const ims_noti_cb_info_s &kept = kept_of(subscriptions[0]);
+    EXPECT_EQ(kept.subscription_id, subscriptions[0].id);
+    EXPECT_EQ(kept.callback, kCallback);
+    EXPECT_EQ(kept.user_data, nullptr);
+    EXPECT_EQ(kept.handle, handle_);
+    EXPECT_EQ(kept.noti_id, row.id);
     EXPECT_FALSE(subscriptions[0].has_free_function);
     EXPECT_FALSE(subscriptions[0].is_ended);
     EXPECT_TRUE(take_log().empty());
@@ -178,7 +189,8 @@ TEST_F(Registry, EachHandleHasItsOwnNotifications) {
     EXPECT_EQ(ims_unset_notification_cb(other, 0x209), IMS_ERROR_INVALID_PARAMETER);
     take_log();
     EXPECT_EQ(ims_set_notification_cb(other, 0x209, kCallback, nullptr), IMS_ERROR_NONE);
-    EXPECT_EQ(observed_subscriptions()[1].user_data, other);
+    EXPECT_EQ(kept_of(observed_subscriptions()[0]).handle, handle_);
+    EXPECT_EQ(kept_of(observed_subscriptions()[1]).handle, other);
 }
 
 } // namespace

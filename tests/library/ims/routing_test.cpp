@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // The signal callback called as the bus never calls it, and a table that fails.
-#include "src/client.hpp"
+#include "src/notifications.hpp"
 #include "tests/support/bus_observer.hpp"
 #include "tests/support/expectations.hpp"
 #include "tests/support/with_peer.hpp"
@@ -22,63 +22,50 @@ class Routing : public WithPeer {
         listen(IMS_NOTI_CALL_ENDED, recorder_);
     }
 
-    // What the subscription would be called with.
-    void route(const char *interface, const char *member, void *user_data) {
+    // As the bus does with every signal that the subscription is for.
+    void route(void *user_data) {
         const GDBusSignalCallback callback = observed_subscriptions().at(0).callback;
         const Variant parameters = parse("(ii)", "(3, 16)");
-        callback(nullptr, ":1.1", kPath, interface, member, parameters.get(), user_data);
+        callback(nullptr, ":1.1", kPath, kInterface, "CallEnded", parameters.get(), user_data);
     }
 
-    // An entry that no id leads to.
-    void insert(const char *noti_str) {
-        auto *entry = g_new0(ims_noti_cb_info_s, 1);
-        entry->callback = NotificationRecorder::callback;
-        entry->user_data = &recorder_;
-        g_hash_table_insert(handle_->noti_table.get(), g_strdup(noti_str), entry);
-    }
-
-    void remove(const char *noti_str) {
-        EXPECT_TRUE(g_hash_table_remove(handle_->noti_table.get(), noti_str));
+    // What the bus keeps for it.
+    static ims_noti_cb_info_s &subscription() {
+        return *static_cast<ims_noti_cb_info_s *>(observed_subscriptions().at(0).user_data);
     }
 
     NotificationRecorder recorder_;
 };
 
-TEST_F(Routing, FindsTheCallbackOfTheSignal) {
-    route(kInterface, "CallEnded", handle_);
+TEST_F(Routing, GivesASignalToTheCallbackOfItsSubscription) {
+    route(&subscription());
     ASSERT_EQ(recorder_.count(), 1U);
+    EXPECT_EQ(recorder_.all()[0].handle, handle_);
     EXPECT_EQ(recorder_.all()[0].id, 0x209);
     EXPECT_TRUE(take_log().empty());
 }
 
-TEST_F(Routing, LogsANullHandle) {
-    route(kInterface, "CallEnded", nullptr);
+TEST_F(Routing, LooksNothingUpInTheTable) {
+    ims_noti_cb_info_s elsewhere = subscription();
+    EXPECT_EQ(ims_unset_notification_cb(handle_, IMS_NOTI_CALL_ENDED), IMS_ERROR_NONE);
+    route(&elsewhere);
+    EXPECT_EQ(recorder_.count(), 1U);
+    EXPECT_TRUE(take_log().empty());
+}
+
+TEST_F(Routing, LogsASignalOfNoSubscription) {
+    route(nullptr);
     EXPECT_EQ(recorder_.count(), 0U);
     expect_one_line("ims.cpp", "on_signal_callback", "Invalid parameter");
 }
 
-TEST_F(Routing, LogsASignalWithoutAnEntry) {
-    route(kInterface, "CallBusy", handle_);
-    EXPECT_EQ(recorder_.count(), 0U);
-    expect_one_line("ims.cpp", "on_signal_callback",
-                    "can't find noti_str(org.kelvo.ims.Call:CallBusy) callback info");
-}
-
-TEST_F(Routing, LogsASignalOfAnUnknownInterface) {
-    insert("org.kelvo.ims.Other:CallEnded");
-    route("org.kelvo.ims.Other", "CallEnded", handle_);
-    EXPECT_EQ(recorder_.count(), 0U);
-    expect_one_line("ims.cpp", "on_signal_callback", "unhandled signal!!");
-    remove("org.kelvo.ims.Other:CallEnded");
-}
-
-// It gets the id 0, which the call decoder returns for without a line.
-TEST_F(Routing, GivesAnEntryThatNoNotificationHasTheIdZero) {
-    insert("org.kelvo.ims.Call:CallUnheardOf");
-    route(kInterface, "CallUnheardOf", handle_);
+// The call decoder returns for it without a line.
+TEST_F(Routing, GivesTheDecoderAnIdThatNoEventHas) {
+    ims_noti_cb_info_s unheard_of = subscription();
+    unheard_of.noti_id = 0;
+    route(&unheard_of);
     EXPECT_EQ(recorder_.count(), 0U);
     EXPECT_TRUE(take_log().empty());
-    remove("org.kelvo.ims.Call:CallUnheardOf");
 }
 
 TEST_F(Routing, ReportsAnEntryThatCannotBeRemoved) {
