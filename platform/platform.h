@@ -70,6 +70,7 @@ int system_info_get_custom_bool(const char *key, bool *value);
  * @param format    the line as for printf(), with what it names behind it
  * @return not looked at
  */
+/* NOLINTNEXTLINE(bugprone-reserved-identifier): the name is the device's. */
 int __dlog_print(int log_id, int priority, const char *tag, const char *format, ...)
     __attribute__((format(printf, 4, 5)));
 
