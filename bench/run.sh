@@ -122,6 +122,7 @@ sides=(library bare)
 heading "${sides[@]}"
 instructions request "instructions per request, caller's thread" '<=' 1.02
 instructions query "instructions per query, caller's thread" '<=' 1.02
+instructions callback "instructions in a signal's callback" '' ''
 memory
 rate request_1 'requests/s, 1 outstanding' '>=' 0.97
 rate request_64 'requests/s, 64 outstanding' '>=' 0.97
