@@ -95,7 +95,7 @@ class SignalTable {
     }
     template <typename... Events>
     Signal signal_of(const std::variant<Events...> &event) const {
-        return std::visit([this](const auto &content) { return signal_of(content); }, event);
+        return std::visit([this](const auto &content) { return this->signal_of(content); }, event);
     }
 
   private:

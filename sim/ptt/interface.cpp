@@ -15,6 +15,7 @@ using enum Caller;
 
 std::vector<PttPeer> peers_of(const std::vector<PttUser> &users) {
     std::vector<PttPeer> peers;
+    peers.reserve(users.size());
     for (const auto &user : users)
         peers.push_back(user.peer);
     return peers;
