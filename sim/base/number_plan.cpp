@@ -128,6 +128,14 @@ bool same_number(std::string_view a, std::string_view b) {
     return bare(a) == bare(b);
 }
 
+bool same_user(std::string_view a, std::string_view b) {
+    if (a == b)
+        return true;
+    const auto number = parse_number(a);
+    const auto other = parse_number(b);
+    return number && other && same_number(*number, *other);
+}
+
 std::string NumberPlan::default_slot_number(int slot) {
     return fmt::format("+155501{:02}", slot);
 }

@@ -56,6 +56,8 @@ bool is_emergency(std::string_view number);
 Answer<std::string> parse_number(std::string_view text);
 std::string to_uri(std::string_view number);
 bool same_number(std::string_view a, std::string_view b);
+// Users are the same when their uris are, or the telephone numbers in them.
+bool same_user(std::string_view a, std::string_view b);
 
 // Which number reaches whom.
 class NumberPlan {

@@ -1,14 +1,13 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
+#include "sim/base/call_type.hpp"
 #include "sim/base/enum_format.hpp"
 
 #include <cstdint>
 
 // The values that stand in the integers of org.kelvo.ims.Call as the stand-in defines them.
 namespace sim {
-
-enum class CallType : std::int32_t { kVoice = 0, kVideo = 1, kEmergency = 2 };
 
 enum class CallState : std::int32_t {
     kDialing = 1,

@@ -1,12 +1,16 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "sim/group/lists.hpp"
 
+#include "sim/base/number_plan.hpp"
+
 #include <algorithm>
 
 namespace sim {
 
 namespace {
 
+// The list of the groups that a user has put nowhere.
+constexpr std::string_view kFirstList = "default";
 constexpr std::int32_t kTelUri = 0;
 constexpr std::int32_t kSipUri = 1;
 
@@ -57,7 +61,7 @@ ParticipantGroups list_groups(const GroupState &state, std::string_view user) {
             });
         const bool placed = placement != state.placements.end();
         entry.is_default_group = placed && placement->is_default;
-        list_named(listed.lists, placed ? placement->list : std::string(GroupModel::kFirstList))
+        list_named(listed.lists, placed ? placement->list : std::string(kFirstList))
             .entries.push_back(std::move(entry));
     }
     return listed;

@@ -1,7 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/group/model.hpp"
+#include "sim/group/answers.hpp"
+#include "sim/group/state.hpp"
+
+#include <string_view>
 
 // The lists in which a user finds the groups that it is a member of.
 namespace sim {

@@ -1,7 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "sim/group/model.hpp"
 
-#include "sim/base/number_plan.hpp"
 #include "sim/group/edits.hpp"
 #include "sim/group/lists.hpp"
 #include "sim/group/writer.hpp"
@@ -54,14 +53,6 @@ Refusal unknown_group(std::string_view uri) {
 }
 
 } // namespace
-
-bool same_user(std::string_view a, std::string_view b) {
-    if (a == b)
-        return true;
-    const auto number = parse_number(a);
-    const auto other = parse_number(b);
-    return number && other && same_number(*number, *other);
-}
 
 Status GroupModel::commit(GroupState next) {
     std::erase_if(next.placements, [&](const GroupPlacement &placement) {

@@ -3,28 +3,15 @@
 
 #include "sim/base/result.hpp"
 #include "sim/group/answers.hpp"
+#include "sim/group/state.hpp"
 
 #include <functional>
 #include <optional>
+#include <string>
+#include <string_view>
+#include <vector>
 
 namespace sim {
-
-// Where a user has put a group that it is a member of.
-struct GroupPlacement {
-    std::string user{};
-    std::string group_uri{};
-    std::string list{};
-    bool is_default = false;
-    bool operator==(const GroupPlacement &) const = default;
-};
-
-// All that is kept about groups.
-struct GroupState {
-    std::int32_t revision = 0; // counts the changes
-    std::vector<GroupDocument> groups;
-    std::vector<GroupPlacement> placements;
-    bool operator==(const GroupState &) const = default;
-};
 
 // The group documents of the network, the same for every slot. A request changes all that it names
 // or nothing.
@@ -38,8 +25,6 @@ class GroupModel {
     // As large as all groups together may be, about as they travel: an answer has to fit into a
     // message of the bus.
     static constexpr std::size_t kLargestState = 32 << 20;
-    // The list of the groups that a user has put nowhere.
-    static constexpr std::string_view kFirstList = "default";
 
     const GroupState &state() const { return state_; }
     void restore(GroupState state) { state_ = std::move(state); }
@@ -72,8 +57,5 @@ class GroupModel {
 
 // What makes kept state impossible, or nothing.
 std::optional<std::string> find_contradiction(const GroupState &state);
-
-// Users are the same when their uris are, or the telephone numbers in them.
-bool same_user(std::string_view a, std::string_view b);
 
 } // namespace sim

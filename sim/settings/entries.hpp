@@ -1,7 +1,15 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/settings/model.hpp"
+#include "sim/base/result.hpp"
+#include "sim/settings/fields.hpp"
+#include "sim/settings/offered.hpp"
+
+#include <cstdint>
+#include <optional>
+#include <string_view>
+#include <utility>
+#include <vector>
 
 namespace sim {
 

@@ -1,20 +1,18 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/base/foreign_value.hpp"
 #include "sim/base/result.hpp"
 #include "sim/settings/fields.hpp"
+#include "sim/settings/offered.hpp"
 
+#include <cstdint>
 #include <functional>
+#include <optional>
+#include <string>
+#include <string_view>
+#include <vector>
 
 namespace sim {
-
-// An entry of a dictionary as it came.
-struct OfferedEntry {
-    std::string key;
-    std::variant<std::int32_t, bool, std::string, ForeignValue> value;
-};
-using OfferedEntries = std::vector<OfferedEntry>;
 
 // All that one slot keeps.
 struct SlotSettings {

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
+#include "sim/base/call_type.hpp"
 #include "sim/base/number_plan.hpp"
 #include "sim/base/result.hpp"
-#include "sim/call/values.hpp"
 #include "sim/registration/registrations.hpp"
 
 #include <array>
