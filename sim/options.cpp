@@ -2,6 +2,7 @@
 #include "sim/options.hpp"
 
 #include "sim/base/number_plan.hpp"
+#include "sim/call/parties.hpp"
 
 #include <CLI/CLI.hpp>
 #include <algorithm>

@@ -71,7 +71,7 @@ void CallModel::forward(Session &caller, const std::string &target) {
     emit(caller.ref.slot, CallForwarded{caller.ref.id});
     caller.route = target;
     caller.peer_uri = to_uri(target);
-    caller.party = &plan_.party(caller.ref.slot, target);
+    caller.party = &party_at(plan_, caller.ref.slot, target);
     caller.next_step = kStepAfterProceeding;
     schedule_step(caller);
 }

@@ -2,8 +2,8 @@
 #pragma once
 
 #include "sim/base/clock.hpp"
-#include "sim/base/number_plan.hpp"
 #include "sim/call/events.hpp"
+#include "sim/call/parties.hpp"
 #include "sim/call/values.hpp"
 
 #include <cstdint>

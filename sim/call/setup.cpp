@@ -186,7 +186,7 @@ Session &CallModel::dial(int slot, std::string_view number, const DialRequest &r
     session.route = number;
     session.peer_uri = to_uri(number);
     session.texts = request.texts;
-    session.party = &plan_.party(slot, number);
+    session.party = &party_at(plan_, slot, number);
     schedule_step(session);
     return session;
 }

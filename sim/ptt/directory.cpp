@@ -7,29 +7,6 @@ namespace sim {
 
 namespace {
 
-// The same people as on the telephone.
-constexpr PttParty kNobody{"+15550211", PttWelcome::kNobody};
-constexpr PttParty kParties[] = {
-    {"+15550200", PttWelcome::kBusy},
-    {"+15550201", PttWelcome::kNeverAnswers},
-    {"+15550202", PttWelcome::kFails},
-    {"+15550204", PttWelcome::kTakes, PttHabit::kLeaves},
-    {"+15550206", PttWelcome::kDeclines},
-    {"+15550207", PttWelcome::kNeverAnswers},
-    {"+15550209", PttWelcome::kTakes, PttHabit::kAsksVideo},
-    {"+15550210", PttWelcome::kTakes, PttHabit::kRefusesChanges},
-    kNobody,
-    {"+15550213", PttWelcome::kTakes, PttHabit::kEchoes},
-    {"+15550214", PttWelcome::kTakes, PttHabit::kTalks},
-};
-constexpr PttParty kAnybody{};
-
-const PttParty &party_of(std::string_view number) {
-    const auto found = std::ranges::find_if(
-        kParties, [&](const PttParty &party) { return same_number(party.number, number); });
-    return found == std::end(kParties) ? kAnybody : *found;
-}
-
 constexpr std::string_view kSimulatedMembers[] = {"tel:+15550221", "tel:+15550222",
                                                   "tel:+15550214"};
 
@@ -72,7 +49,7 @@ Answer<PttContact> PttDirectory::contact(std::string_view uri, std::string_view 
         contact.slot = *slot;
         contact.uri = uri_of(*slot);
     } else
-        contact.party = &party_of(*number);
+        contact.party = &ptt_party_at(*number);
     return contact;
 }
 
@@ -85,7 +62,7 @@ Answer<std::vector<PttContact>> PttDirectory::members(int slot,
     for (const auto &uri : *listed) {
         const auto found = contact(uri, {});
         // A group may list names that no number belongs to.
-        PttContact member = found ? *found : PttContact{uri, {}, -1, &kNobody, {}, false, 0};
+        PttContact member = found ? *found : PttContact{uri, {}, -1, &ptt_nobody(), {}, false, 0};
         member.group_uri = group_uri;
         if (member.slot != slot && std::ranges::find(members, member) == members.end())
             members.push_back(std::move(member));

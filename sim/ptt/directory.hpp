@@ -3,6 +3,7 @@
 
 #include "sim/base/number_plan.hpp"
 #include "sim/base/result.hpp"
+#include "sim/ptt/parties.hpp"
 #include "sim/ptt/values.hpp"
 
 #include <cstdint>
@@ -13,17 +14,6 @@
 #include <vector>
 
 namespace sim {
-
-// How a party of the network takes an invitation, a message or a file.
-enum class PttWelcome { kTakes, kBusy, kDeclines, kNeverAnswers, kNobody, kFails };
-// What it does once it takes part.
-enum class PttHabit { kListens, kLeaves, kTalks, kAsksVideo, kRefusesChanges, kEchoes };
-
-struct PttParty {
-    std::string_view number; // empty: any number
-    PttWelcome welcome = PttWelcome::kTakes;
-    PttHabit habit = PttHabit::kListens;
-};
 
 // Whom a uri reaches: a slot, or a party of the network.
 struct PttContact {

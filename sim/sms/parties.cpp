@@ -29,13 +29,13 @@ constexpr MessageParty kAnybody{"", MessageFate::kReceived};
 
 } // namespace
 
-const MessageParty &message_party(std::string_view number) {
+const MessageParty &message_party_at(std::string_view number) {
     const auto found = std::ranges::find_if(
         kParties, [&](const MessageParty &party) { return same_number(party.number, number); });
     return found == std::end(kParties) ? kAnybody : *found;
 }
 
-const MessageParty &nobody() {
+const MessageParty &message_nobody() {
     return kNobody;
 }
 

@@ -4,6 +4,7 @@
 #include <cstdint>
 #include <string_view>
 
+// The network's side of a message: who has a number, and what becomes of messages to it.
 namespace sim {
 
 // Why the service centre does not take a message.
@@ -28,8 +29,8 @@ struct MessageParty {
     SubmitRefusal refusal{};
 };
 
-const MessageParty &message_party(std::string_view number);
+const MessageParty &message_party_at(std::string_view number);
 // For a destination that is no number.
-const MessageParty &nobody();
+const MessageParty &message_nobody();
 
 } // namespace sim

@@ -151,7 +151,7 @@ void ServiceCentre::acknowledge(Id id) {
     const auto number = parse_number(tpdu::to_text(message.submit.destination));
     if (number && plan_.slot_of(*number))
         return accept(message, nullptr);
-    const MessageParty &party = number ? message_party(*number) : nobody();
+    const MessageParty &party = number ? message_party_at(*number) : message_nobody();
     if (party.fate == MessageFate::kRefusedByCentre)
         return refuse_message(id, party.refusal);
     accept(message, &party);

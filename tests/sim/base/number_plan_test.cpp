@@ -3,9 +3,6 @@
 
 #include "tests/sim/network.hpp"
 
-#include <algorithm>
-#include <set>
-
 namespace sim {
 namespace {
 
@@ -61,15 +58,6 @@ TEST(NumberPlanTest, FindsTheSlotOfANumber) {
     EXPECT_EQ(plan.slot_of("+15550101"), std::nullopt);
     EXPECT_EQ(NumberPlan::default_slot_number(0), "+15550100");
     EXPECT_EQ(NumberPlan::default_slot_number(12), "+15550112");
-}
-
-TEST(NumberPlanTest, NoTwoPartiesShareANumberAndNoneIsASlots) {
-    std::set<std::string_view> numbers;
-    for (const auto &party : parties()) {
-        EXPECT_TRUE(numbers.insert(party.number).second) << party.number;
-        for (int slot = 0; slot < 64; ++slot)
-            EXPECT_FALSE(same_number(party.number, NumberPlan::default_slot_number(slot)));
-    }
 }
 
 } // namespace

@@ -1,6 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 // The numbers with a meaning.
+#include "sim/call/parties.hpp"
+
 #include "tests/sim/network.hpp"
+
+#include <set>
 
 namespace sim::test {
 namespace {
@@ -158,6 +162,15 @@ TEST_F(Parties, DoNothingMoreOnceTheCallHasEnded) {
     advance(1min);
     EXPECT_THAT(take(0), IsEmpty());
     EXPECT_EQ(timers_.next_due(), std::nullopt);
+}
+
+TEST(NumberPlanTest, NoTwoPartiesShareANumberAndNoneIsASlots) {
+    std::set<std::string_view> numbers;
+    for (const auto &party : parties()) {
+        EXPECT_TRUE(numbers.insert(party.number).second) << party.number;
+        for (int slot = 0; slot < 64; ++slot)
+            EXPECT_FALSE(same_number(party.number, NumberPlan::default_slot_number(slot)));
+    }
 }
 
 } // namespace
