@@ -81,7 +81,7 @@ std::string NumberPlan::default_slot_number(int slot) {
 }
 
 const std::string &NumberPlan::number_of(int slot) const {
-    return slot_numbers_.at(static_cast<std::size_t>(slot));
+    return slot_numbers_[slot];
 }
 
 std::optional<int> NumberPlan::slot_of(std::string_view number) const {

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
+#include "sim/base/per_slot.hpp"
 #include "sim/base/result.hpp"
 
 #include <optional>
@@ -28,12 +29,12 @@ class NumberPlan {
 
     static std::string default_slot_number(int slot);
 
-    int slots() const { return static_cast<int>(slot_numbers_.size()); }
+    int slots() const { return slot_numbers_.slots(); }
     const std::string &number_of(int slot) const;
     std::optional<int> slot_of(std::string_view number) const;
 
   private:
-    std::vector<std::string> slot_numbers_;
+    PerSlot<std::string> slot_numbers_;
 };
 
 } // namespace sim

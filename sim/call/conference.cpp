@@ -41,7 +41,7 @@ Session *CallModel::conference_session(const Session &member) {
 std::vector<SessionRef> CallModel::member_refs(const Session &conference) const {
     std::vector<SessionRef> found;
     if (conference.is_conference)
-        for (const auto &[id, session] : line(conference.ref.slot).sessions)
+        for (const auto &[id, session] : lines_[conference.ref.slot].sessions)
             if (session.conference == conference.ref.id)
                 found.push_back(session.ref);
     return found;
@@ -220,7 +220,7 @@ CallModel::new_participants(int slot, const Session &conference,
         return *refusal;
     std::vector<std::string> taken;
     for (const SessionRef ref : member_refs(conference))
-        taken.push_back(line(slot).sessions.at(ref.id).number);
+        taken.push_back(lines_[slot].sessions.at(ref.id).number);
     std::vector<std::string> numbers;
     for (const auto &text : called) {
         auto number = parse_number(text);
@@ -312,7 +312,7 @@ CallModel::participants(int slot, const Session &conference,
             return number.refusal();
         const auto refs = member_refs(conference);
         const auto match = std::ranges::find_if(refs, [&](SessionRef ref) {
-            const Session &member = line(slot).sessions.at(ref.id);
+            const Session &member = lines_[slot].sessions.at(ref.id);
             return same_number(member.number, *number) || same_number(member.route, *number);
         });
         if (match == refs.end())

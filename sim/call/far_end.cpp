@@ -104,7 +104,7 @@ void CallModel::ask_video(Session &session) {
 
 void CallModel::call_back(const Session &session, std::chrono::milliseconds later) {
     const auto slot = session.ref.slot;
-    line(slot).callback_timer =
+    lines_[slot].callback_timer =
         timers_.after(later, [this, slot, number = session.route, type = session.type] {
             static_cast<void>(call_from_network(slot, number, type));
         });

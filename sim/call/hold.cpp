@@ -64,7 +64,7 @@ Status CallModel::resume(int slot, int id) {
     if (auto refusal = cannot_hold(**session))
         return *refusal;
     // A call that rings here can wait, and one into a conference joins whatever state it is in.
-    for (const auto &[other, state] : line(slot).sessions)
+    for (const auto &[other, state] : lines_[slot].sessions)
         if (!state.established() && state.mobile_originated && state.conference == 0)
             return refuse(Result::kLineInUse, "call {} is still being set up", other);
     if (const Session *active = context(slot, false))

@@ -21,7 +21,7 @@ std::vector<SessionRef> CallModel::far_ends(const Session &session) const {
     if (session.peer)
         ends.push_back(*session.peer);
     for (const SessionRef ref : member_refs(session))
-        if (const auto &member = line(ref.slot).sessions.at(ref.id);
+        if (const auto &member = lines_[ref.slot].sessions.at(ref.id);
             member.peer && member.established())
             ends.push_back(*member.peer);
     return ends;
@@ -135,28 +135,28 @@ Status CallModel::set_tty_mode(int slot, TtyMode mode) {
                       "a mode is 0 (off), 1 (full), 2 (hearing carry over) or 3 (voice carry "
                       "over), not {}",
                       mode);
-    line(slot).tty_mode = mode;
+    lines_[slot].tty_mode = mode;
     return Done{};
 }
 
 TtyState CallModel::tty(int slot) const {
-    return {line(slot).tty_mode, line(slot).tty_received};
+    return {lines_[slot].tty_mode, lines_[slot].tty_received};
 }
 
 Status CallModel::send_tty(int slot, int id, const std::string &bytes) {
     const auto session = talking(slot, id);
     if (!session)
         return session.refusal();
-    if (line(slot).tty_mode == TtyMode::kOff)
+    if (lines_[slot].tty_mode == TtyMode::kOff)
         return refuse(Result::kWrongState, "text telephony is off: set a mode first");
     if (bytes.empty())
         return refuse(Result::kInvalidArgument, "there is no text to send");
     const auto ends = far_ends(**session);
     for (const SessionRef end : ends)
-        line(end.slot).tty_received = bytes;
+        lines_[end.slot].tty_received = bytes;
     // A party of the network types back what it reads.
     if (ends.empty())
-        line(slot).tty_received = bytes;
+        lines_[slot].tty_received = bytes;
     return Done{};
 }
 

@@ -3,6 +3,7 @@
 
 #include "sim/base/clock.hpp"
 #include "sim/base/number_plan.hpp"
+#include "sim/base/per_slot.hpp"
 #include "sim/base/result.hpp"
 #include "sim/call/events.hpp"
 #include "sim/call/session.hpp"
@@ -111,8 +112,6 @@ class CallModel {
     Status deregister_emergency_pdn(int slot);
 
   private:
-    Line &line(int slot) { return lines_[static_cast<std::size_t>(slot)]; }
-    const Line &line(int slot) const { return lines_[static_cast<std::size_t>(slot)]; }
     Session *find(SessionRef ref);
     void emit(int slot, const CallEvent &event) const { sink_(slot, event); }
 
@@ -201,7 +200,7 @@ class CallModel {
     const SupplementaryServices &services_;
     std::chrono::nanoseconds ring_time_;
     Sink sink_;
-    std::vector<Line> lines_;
+    PerSlot<Line> lines_;
 };
 
 } // namespace sim

@@ -53,7 +53,7 @@ Status CallModel::handover_failed(int slot, int id) {
 }
 
 bool CallModel::in_epdg_call(int slot) const {
-    const auto &here = line(slot);
+    const auto &here = lines_[slot];
     return here.audio_path == AudioPath::kEpdg && has_established(slot);
 }
 
@@ -62,7 +62,7 @@ Status CallModel::set_audio_path(int slot, AudioPath path) {
         return refuse(Result::kInvalidArgument, "a path is 0 (cellular) or 1 (ePDG), not {}", path);
     if (!has_established(slot))
         return refuse(Result::kWrongState, "there is no established call whose path could change");
-    line(slot).audio_path = path;
+    lines_[slot].audio_path = path;
     return Done{};
 }
 
@@ -71,14 +71,14 @@ Status CallModel::set_ssac(int slot, std::int32_t apply, const Ssac &ssac) {
         return refuse(Result::kInvalidArgument, "barring is 1 (applies) or 0 (lifted), not {}",
                       apply);
     if (apply == 0) {
-        line(slot).ssac.reset();
+        lines_[slot].ssac.reset();
         return Done{};
     }
     if (auto refusal = bad_barring("voice", ssac.voice_factor, ssac.voice_time))
         return *refusal;
     if (auto refusal = bad_barring("video", ssac.video_factor, ssac.video_time))
         return *refusal;
-    line(slot).ssac = ssac;
+    lines_[slot].ssac = ssac;
     return Done{};
 }
 
@@ -95,7 +95,7 @@ Status CallModel::set_emergency_pdn(int slot, EmergencyPdn info) {
                       info.local_address);
     if (registrations_.emergency_bearer(slot))
         return refuse(Result::kWrongState, "the emergency PDN is registered: deregister it first");
-    line(slot).emergency_pdn = std::move(info);
+    lines_[slot].emergency_pdn = std::move(info);
     return Done{};
 }
 
@@ -104,7 +104,7 @@ Status CallModel::register_emergency_pdn(int slot) {
         return *refusal;
     if (registrations_.emergency_bearer(slot))
         return refuse(Result::kWrongState, "the emergency PDN is registered already");
-    if (!line(slot).emergency_pdn)
+    if (!lines_[slot].emergency_pdn)
         return refuse(Result::kWrongState, "nothing is known of the emergency PDN: call "
                                            "SetEmergencyPdnInfo first");
     registrations_.set_emergency_bearer(slot, true);

@@ -102,7 +102,7 @@ void CallModel::give_up_ringing(SessionRef ref) {
 }
 
 void CallModel::drop_calls(int slot) {
-    Line &here = line(slot);
+    Line &here = lines_[slot];
     here.callback_timer.cancel();
     const auto is_conference = [](const auto &entry) { return entry.second.is_conference; };
     while (!here.sessions.empty()) {

@@ -25,13 +25,12 @@ CallModel::CallModel(const NumberPlan &plan, Timers &timers, Registrations &regi
                      const SupplementaryServices &services, std::chrono::nanoseconds ring_time,
                      Sink sink)
     : plan_(plan), timers_(timers), registrations_(registrations), services_(services),
-      ring_time_(ring_time), sink_(std::move(sink)),
-      lines_(static_cast<std::size_t>(plan.slots())) {
+      ring_time_(ring_time), sink_(std::move(sink)), lines_(plan.slots()) {
     registrations.when_lost([this](int slot) { drop_calls(slot); });
 }
 
 Session *CallModel::find(SessionRef ref) {
-    auto &sessions = line(ref.slot).sessions;
+    auto &sessions = lines_[ref.slot].sessions;
     const auto found = sessions.find(ref.id);
     return found == sessions.end() ? nullptr : &found->second;
 }
@@ -39,7 +38,8 @@ Session *CallModel::find(SessionRef ref) {
 Answer<Session *> CallModel::existing(int slot, int id) {
     if (Session *session = find({slot, id}))
         return session;
-    return refuse(Result::kUnknownSession, "there is no call {}: {}", id, session_ids(line(slot)));
+    return refuse(Result::kUnknownSession, "there is no call {}: {}", id,
+                  session_ids(lines_[slot]));
 }
 
 Answer<Session *> CallModel::established(int slot, int id) {
@@ -57,7 +57,7 @@ Answer<Session *> CallModel::talking(int slot, int id) {
 }
 
 const Session *CallModel::context(int slot, bool held) const {
-    for (const auto &[id, session] : line(slot).sessions)
+    for (const auto &[id, session] : lines_[slot].sessions)
         if (session.established() && session.conference == 0 && session.held_here == held)
             return &session;
     return nullptr;
@@ -69,7 +69,7 @@ Session *CallModel::context(int slot, bool held) {
 }
 
 const Session *CallModel::being_set_up(int slot) const {
-    for (const auto &[id, session] : line(slot).sessions)
+    for (const auto &[id, session] : lines_[slot].sessions)
         if (!session.established())
             return &session;
     return nullptr;
@@ -92,20 +92,20 @@ CallState CallModel::state_of(const Session &session) const {
 }
 
 bool CallModel::has_established(int slot) const {
-    return std::ranges::any_of(line(slot).sessions,
+    return std::ranges::any_of(lines_[slot].sessions,
                                [](const auto &entry) { return entry.second.established(); });
 }
 
 std::vector<CallInfo> CallModel::list(int slot) const {
     std::vector<CallInfo> calls;
-    for (const auto &[id, session] : line(slot).sessions)
+    for (const auto &[id, session] : lines_[slot].sessions)
         calls.push_back({id, session.peer_uri, session.type, session.mobile_originated,
                          state_of(session), session.is_conference || session.conference != 0});
     return calls;
 }
 
 Session &CallModel::add_session(int slot, CallType type, Phase phase) {
-    Line &here = line(slot);
+    Line &here = lines_[slot];
     const int id = here.next_session++;
     Session &session = here.sessions[id];
     session.ref = {slot, id};
@@ -124,7 +124,7 @@ std::optional<Refusal> CallModel::cannot_dial(int slot, std::string_view number,
         return refuse(Result::kInvalidArgument, "{} is no emergency number (112, 911 are)", number);
     if (auto refusal = registrations_.radio_off(slot))
         return refusal;
-    const auto &ssac = line(slot).ssac;
+    const auto &ssac = lines_[slot].ssac;
     const bool video = type == CallType::kVideo;
     if (!emergency && ssac && (video ? ssac->video_factor : ssac->voice_factor) == 0)
         return refuse(Result::kBarred, "the cell bars {} calls (UpdateSsacInfo set the factor 0)",
@@ -132,7 +132,7 @@ std::optional<Refusal> CallModel::cannot_dial(int slot, std::string_view number,
     if (!emergency)
         if (auto refusal = services_.bars_outgoing(slot, number, type))
             return refusal;
-    for (const auto &[id, session] : line(slot).sessions)
+    for (const auto &[id, session] : lines_[slot].sessions)
         if (session.type == CallType::kEmergency)
             return refuse(Result::kLineInUse, "call {} is an emergency call", id);
     return std::nullopt;
@@ -210,7 +210,7 @@ Answer<Session *> CallModel::offer(int slot, std::string_view from, CallType typ
     const bool waiting = state_of(session) == CallState::kWaiting;
     emit(slot,
          CallIncomingInd{session.ref.id, session.peer_uri, type, to_uri(called), texts, waiting});
-    const Line &here = line(slot);
+    const Line &here = lines_[slot];
     const bool responds = here.auto_response != AutoResponse::kOff &&
                           !(waiting && here.auto_response == AutoResponse::kAnswer);
     if (responds)
@@ -225,7 +225,7 @@ void CallModel::respond_automatically(SessionRef ref) {
     // A call that has come to wait meanwhile is the user's to answer.
     if (!session || state_of(*session) != CallState::kIncoming)
         return;
-    switch (line(ref.slot).auto_response) {
+    switch (lines_[ref.slot].auto_response) {
     case AutoResponse::kOff:
         return;
     case AutoResponse::kAnswer:
@@ -261,7 +261,7 @@ Status CallModel::answer(int slot, int id, CallType type) {
         return refuse(Result::kInvalidArgument,
                       "call {} is of type {}; it can be answered as that or as voice, not as {}",
                       id, session.type, type);
-    for (const auto &[other, state] : line(slot).sessions)
+    for (const auto &[other, state] : lines_[slot].sessions)
         if (other != id && !state.established() && state.conference == 0)
             return refuse(Result::kLineInUse, "call {} is still being set up", other);
     if (Session *active = context(slot, false)) {
@@ -317,8 +317,8 @@ Status CallModel::set_auto_response(int slot, AutoResponse mode, std::int32_t de
     if (delay_seconds < 0 || delay_seconds > kMaxAutoResponseDelay)
         return refuse(Result::kInvalidArgument, "a delay is 0 to {} seconds, not {}",
                       kMaxAutoResponseDelay, delay_seconds);
-    line(slot).auto_response = mode;
-    line(slot).auto_response_delay = delay_seconds;
+    lines_[slot].auto_response = mode;
+    lines_[slot].auto_response_delay = delay_seconds;
     return Done{};
 }
 
@@ -341,7 +341,7 @@ void CallModel::establish(Session &session) {
 }
 
 void CallModel::finish(SessionRef ref, EndReason here, EndReason there) {
-    const auto node = line(ref.slot).sessions.extract(ref.id);
+    const auto node = lines_[ref.slot].sessions.extract(ref.id);
     if (node.empty())
         return;
     const Session &session = node.mapped();
@@ -354,8 +354,8 @@ void CallModel::finish(SessionRef ref, EndReason here, EndReason there) {
     if (Session *conference = conference_session(session);
         conference && member_refs(*conference).empty())
         finish(conference->ref, EndReason::kConferenceOver, EndReason::kConferenceOver);
-    if (line(ref.slot).sessions.empty())
-        line(ref.slot).tty_received.clear();
+    if (lines_[ref.slot].sessions.empty())
+        lines_[ref.slot].tty_received.clear();
 }
 
 } // namespace sim

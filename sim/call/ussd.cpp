@@ -38,9 +38,9 @@ bool is_code(std::string_view text) {
 UssdService::UssdService(const NumberPlan &plan, Timers &timers, Registrations &registrations,
                          Sink sink)
     : plan_(plan), timers_(timers), registrations_(registrations), sink_(std::move(sink)),
-      dialogues_(static_cast<std::size_t>(plan.slots())) {
+      dialogues_(plan.slots()) {
     registrations.when_lost([this](int slot) {
-        if (dialogue(slot).state != State::kIdle)
+        if (dialogues_[slot].state != State::kIdle)
             release(slot, "Flight mode");
     });
 }
@@ -57,10 +57,10 @@ Status UssdService::send(int slot, UssdRequest type, int coding_scheme, const st
     case UssdRequest::kReply:
         return reply(slot, coding_scheme, text);
     case UssdRequest::kCancel:
-        if (dialogue(slot).state == State::kIdle)
+        if (dialogues_[slot].state == State::kIdle)
             return refuse(Result::kWrongState, "there is no USSD dialogue to cancel");
-        dialogue(slot).state = State::kIdle;
-        dialogue(slot).timer.cancel();
+        dialogues_[slot].state = State::kIdle;
+        dialogues_[slot].timer.cancel();
         return Done{};
     }
     return refuse(Result::kInvalidArgument,
@@ -68,7 +68,7 @@ Status UssdService::send(int slot, UssdRequest type, int coding_scheme, const st
 }
 
 Status UssdService::start(int slot, int coding_scheme, const std::string &code) {
-    Dialogue &here = dialogue(slot);
+    Dialogue &here = dialogues_[slot];
     if (here.state != State::kIdle)
         return refuse(Result::kWrongState, "USSD dialogue {} is open: reply or cancel it first",
                       here.number);
@@ -83,7 +83,7 @@ Status UssdService::start(int slot, int coding_scheme, const std::string &code) 
 }
 
 Status UssdService::reply(int slot, int coding_scheme, const std::string &text) {
-    Dialogue &here = dialogue(slot);
+    Dialogue &here = dialogues_[slot];
     if (here.state != State::kUserAnswers)
         return refuse(Result::kWrongState, "the network has asked nothing by USSD");
     if (text.empty())
@@ -96,12 +96,12 @@ Status UssdService::reply(int slot, int coding_scheme, const std::string &text) 
 }
 
 void UssdService::await_network(int slot) {
-    dialogue(slot).state = State::kNetworkAnswers;
-    dialogue(slot).timer = timers_.after(kNetworkTime, [this, slot] { turn_page(slot); });
+    dialogues_[slot].state = State::kNetworkAnswers;
+    dialogues_[slot].timer = timers_.after(kNetworkTime, [this, slot] { turn_page(slot); });
 }
 
 void UssdService::turn_page(int slot) {
-    Dialogue &here = dialogue(slot);
+    Dialogue &here = dialogues_[slot];
     const auto page = std::ranges::find(kPages, here.path, &Page::path);
     here.state = State::kIdle;
     if (page == std::end(kPages))
@@ -115,13 +115,13 @@ void UssdService::turn_page(int slot) {
 }
 
 void UssdService::release(int slot, std::string why) {
-    dialogue(slot).state = State::kIdle;
-    dialogue(slot).timer.cancel();
+    dialogues_[slot].state = State::kIdle;
+    dialogues_[slot].timer.cancel();
     indicate(slot, UssdAnswer::kReleased, std::move(why));
 }
 
 void UssdService::indicate(int slot, UssdAnswer type, std::string text) {
-    const Dialogue &here = dialogue(slot);
+    const Dialogue &here = dialogues_[slot];
     sink_(slot, CallUssdIndication{type, here.coding_scheme, here.number, std::move(text)});
 }
 

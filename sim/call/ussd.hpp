@@ -3,13 +3,13 @@
 
 #include "sim/base/clock.hpp"
 #include "sim/base/number_plan.hpp"
+#include "sim/base/per_slot.hpp"
 #include "sim/base/result.hpp"
 #include "sim/call/events.hpp"
 #include "sim/registration/registrations.hpp"
 
 #include <functional>
 #include <string>
-#include <vector>
 
 namespace sim {
 
@@ -38,13 +38,12 @@ class UssdService {
     void turn_page(int slot);
     void indicate(int slot, UssdAnswer type, std::string text);
     void release(int slot, std::string why);
-    Dialogue &dialogue(int slot) { return dialogues_[static_cast<std::size_t>(slot)]; }
 
     const NumberPlan &plan_;
     Timers &timers_;
     const Registrations &registrations_;
     Sink sink_;
-    std::vector<Dialogue> dialogues_;
+    PerSlot<Dialogue> dialogues_;
 };
 
 } // namespace sim

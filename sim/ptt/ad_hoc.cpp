@@ -154,7 +154,7 @@ PttGroupAdvertisement PttCalls::advertisement_of(const PttCall &call,
 }
 
 void PttCalls::advertise(int slot, PttGroupAdvertisement advertisement) {
-    advertisement.number = line(slot).next_advertisement++;
+    advertisement.number = lines_[slot].next_advertisement++;
     sink_(slot, advertisement);
 }
 

@@ -13,7 +13,7 @@ Status PttCalls::set_channel(int slot, std::int32_t channel, PttChannelMode mode
     if (mode != PttChannelMode::kTalkAndListen && mode != PttChannelMode::kListenOnly)
         return refuse(Result::kInvalidArgument,
                       "a mode is 0 (talk and listen) or 1 (listen), not {}", mode);
-    Line &here = line(slot);
+    Line &here = lines_[slot];
     here.channel_mode = mode;
     if (channel == here.channel) {
         for (const auto &[session, ref] : here.sessions)
@@ -40,7 +40,7 @@ Status PttCalls::set_channel(int slot, std::int32_t channel, PttChannelMode mode
 }
 
 void PttCalls::leave_channel(int slot) {
-    for (const auto &[session, ref] : line(slot).sessions)
+    for (const auto &[session, ref] : lines_[slot].sessions)
         if (find(ref.call)->type == PttCallType::kChannel)
             return leave(ref, PttEndReason::kEndedHere, PttEndReason::kEndedByPeer);
 }

@@ -31,7 +31,7 @@ Part part_of(const PttFileAttributes &attributes) {
 PttFiles::PttFiles(const PttDirectory &directory, PttCalls &calls, Timers &timers,
                    Registrations &registrations, PttCalls::Sink sink)
     : directory_(directory), calls_(calls), timers_(timers), registrations_(registrations),
-      sink_(std::move(sink)), next_number_(static_cast<std::size_t>(directory.slots()), 1) {
+      sink_(std::move(sink)), next_number_(directory.slots(), 1) {
     registrations.when_lost([this](int slot) { drop(slot); });
 }
 
@@ -77,7 +77,7 @@ Answer<PttFileReceipt> PttFiles::offer(int slot, PttFileOffer offer) {
     const int id = next_transfer_++;
     Transfer &transfer = transfers_[id];
     transfer.sender = slot;
-    transfer.number = next_number_[static_cast<std::size_t>(slot)]++;
+    transfer.number = next_number_[slot]++;
     transfer.originator = to_peer(calls_.uri_in(slot, offer.session), {});
     transfer.attributes = std::move(offer.attributes);
     if (transfer.attributes.transfer_id.empty())
@@ -111,7 +111,7 @@ void PttFiles::present_to_slot(LegRef ref) {
     const Transfer &transfer = transfers_.at(ref.transfer);
     if (!registrations_.registered(leg.to.slot))
         return finish(ref, PttFileEnd::kUnreachable, PttFileEnd::kUnreachable);
-    leg.number = next_number_[static_cast<std::size_t>(leg.to.slot)]++;
+    leg.number = next_number_[leg.to.slot]++;
     sink_(leg.to.slot, PttIncomingFile{leg.number, transfer.originator, transfer.attributes,
                                        leg.to.session, to_peer(leg.to.uri, leg.to.display_name)});
     expect_answer(ref);

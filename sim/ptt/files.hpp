@@ -2,6 +2,7 @@
 #pragma once
 
 #include "sim/base/clock.hpp"
+#include "sim/base/per_slot.hpp"
 #include "sim/base/result.hpp"
 #include "sim/ptt/directory.hpp"
 #include "sim/ptt/events.hpp"
@@ -84,7 +85,7 @@ class PttFiles {
     Timers &timers_;
     const Registrations &registrations_;
     PttCalls::Sink sink_;
-    std::vector<std::int32_t> next_number_; // by slot
+    PerSlot<std::int32_t> next_number_;
     std::map<int, Transfer> transfers_;
     int next_transfer_ = 1;
 };

@@ -42,7 +42,7 @@ void PttCalls::invite_slot(PttCall &call, PttParticipant &participant) {
     const int slot = participant.contact.slot;
     if (!registrations_.registered(slot))
         return leave(participant.ref, PttEndReason::kUnreachable, PttEndReason::kUnreachable);
-    if (line(slot).sessions.size() >= kMostSessions)
+    if (lines_[slot].sessions.size() >= kMostSessions)
         return leave(participant.ref, PttEndReason::kBusy, PttEndReason::kBusy);
     open_session(call, participant);
     const PttParticipant *owner = call.find(call.owner);

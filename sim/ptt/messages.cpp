@@ -46,7 +46,7 @@ std::int32_t sip_status(PttWelcome welcome) {
 PttMessages::PttMessages(const PttDirectory &directory, PttCalls &calls, Timers &timers,
                          const Registrations &registrations, PttCalls::Sink sink)
     : directory_(directory), calls_(calls), registrations_(registrations), sink_(std::move(sink)),
-      errands_(timers), boxes_(static_cast<std::size_t>(directory.slots())) {}
+      errands_(timers), boxes_(directory.slots()) {}
 
 Answer<std::vector<PttContact>> PttMessages::receivers(int slot, const PttMessage &message) {
     if (message.session == 0)
@@ -80,7 +80,7 @@ Answer<PttMessageReceipt> PttMessages::send(int slot, PttMessage message) {
         message.content_type = "text/plain";
     message.originator =
         to_peer(calls_.uri_in(slot, message.session), message.originator.display_name);
-    const std::int32_t number = box(slot).next_sent++;
+    const std::int32_t number = boxes_[slot].next_sent++;
     const auto session = message.session;
     const auto sent = std::make_shared<const Sent>(Sent{slot, number, std::move(message)});
     for (const auto &contact : *contacts)
@@ -120,7 +120,7 @@ void PttMessages::deliver_to_slot(const Sent &sent, const PttContact &to) {
 }
 
 void PttMessages::receive(int slot, PttIncomingMessage message, Received received) {
-    Box &here = box(slot);
+    Box &here = boxes_[slot];
     message.number = here.next_received++;
     here.received[message.number] = std::move(received);
     if (here.received.size() > kMostKept)
@@ -175,8 +175,8 @@ Answer<std::int32_t> PttMessages::notify(int slot, const PttNoticeRequest &reque
     if (request.notice != PttNotice::kDelivered && request.notice != PttNotice::kRead)
         return refuse(Result::kInvalidArgument, "a notice is 1 (delivered) or 2 (read), not {}",
                       request.notice);
-    const auto found = box(slot).received.find(request.number);
-    if (found == box(slot).received.end())
+    const auto found = boxes_[slot].received.find(request.number);
+    if (found == boxes_[slot].received.end())
         return refuse(Result::kUnknownRecord, "slot {} has received no message {}", slot,
                       request.number);
     Received &received = found->second;

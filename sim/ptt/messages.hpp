@@ -2,6 +2,7 @@
 #pragma once
 
 #include "sim/base/errands.hpp"
+#include "sim/base/per_slot.hpp"
 #include "sim/base/result.hpp"
 #include "sim/ptt/directory.hpp"
 #include "sim/ptt/events.hpp"
@@ -74,7 +75,6 @@ class PttMessages {
         std::map<std::int32_t, Received> received;
     };
 
-    Box &box(int slot) { return boxes_[static_cast<std::size_t>(slot)]; }
     Answer<std::vector<PttContact>> receivers(int slot, const PttMessage &message);
     void deliver(const Sent &sent, const PttContact &to);
     void deliver_to_slot(const Sent &sent, const PttContact &to);
@@ -89,7 +89,7 @@ class PttMessages {
     const Registrations &registrations_;
     PttCalls::Sink sink_;
     Errands errands_;
-    std::vector<Box> boxes_;
+    PerSlot<Box> boxes_;
     std::uint64_t next_id_ = 1;
 };
 

@@ -11,10 +11,10 @@ namespace sim {
 PttCalls::PttCalls(const PttDirectory &directory, Timers &timers, Registrations &registrations,
                    Sink sink)
     : directory_(directory), timers_(timers), registrations_(registrations), sink_(std::move(sink)),
-      lines_(static_cast<std::size_t>(directory.slots())) {
+      lines_(directory.slots()) {
     registrations.when_lost([this](int slot) {
         leave_all(slot, PttEndReason::kEndedHere);
-        line(slot).keep_alive.cancel();
+        lines_[slot].keep_alive.cancel();
     });
 }
 
@@ -36,11 +36,11 @@ PttCall *PttCalls::running_call(std::string_view uri) {
 }
 
 Answer<PttCalls::Place> PttCalls::existing(int slot, std::int32_t session) {
-    const auto found = line(slot).sessions.find(session);
-    if (found != line(slot).sessions.end())
+    const auto found = lines_[slot].sessions.find(session);
+    if (found != lines_[slot].sessions.end())
         return Place{*find(found->second.call), *find(found->second)};
     std::string ids;
-    for (const auto &[id, ref] : line(slot).sessions)
+    for (const auto &[id, ref] : lines_[slot].sessions)
         ids += fmt::format("{}{}", ids.empty() ? "" : ", ", id);
     return refuse(Result::kUnknownSession, "there is no push-to-talk session {}: {}", session,
                   ids.empty() ? "there is none" : "the sessions are " + ids);
@@ -82,7 +82,7 @@ std::string PttCalls::others_text(const PttCall &call, const PttParticipant &exc
 
 std::vector<PttRunningCall> PttCalls::running(int slot) const {
     std::vector<PttRunningCall> running;
-    for (const auto &[session, ref] : line(slot).sessions) {
+    for (const auto &[session, ref] : lines_[slot].sessions) {
         const PttCall &call = calls_.at(ref.call);
         const PttParticipant &self = call.participants.at(ref.who);
         if (!call.is_group() || !self.connected())
@@ -145,7 +145,7 @@ void PttCalls::leave(PttRef ref, PttEndReason here, PttEndReason there) {
     const PttParticipant &gone = node.mapped();
     const bool owner_left = call->owner == ref.who;
     if (gone.is_slot() && gone.session != 0) {
-        line(gone.contact.slot).sessions.erase(gone.session);
+        lines_[gone.contact.slot].sessions.erase(gone.session);
         emit(gone, PttCallEnded{gone.session, here});
     }
     if (call->established)
@@ -180,8 +180,8 @@ void PttCalls::wind_up(int id, bool owner_left, PttEndReason there) {
 }
 
 void PttCalls::leave_all(int slot, PttEndReason reason) {
-    while (!line(slot).sessions.empty())
-        leave(line(slot).sessions.begin()->second, reason, PttEndReason::kNetworkFailure);
+    while (!lines_[slot].sessions.empty())
+        leave(lines_[slot].sessions.begin()->second, reason, PttEndReason::kNetworkFailure);
 }
 
 Status PttCalls::keep_alive(int slot, std::int32_t seconds) {
@@ -189,11 +189,12 @@ Status PttCalls::keep_alive(int slot, std::int32_t seconds) {
         return *refusal;
     if (auto refusal = bad_seconds(seconds, "the time until the next keep-alive"))
         return *refusal;
-    line(slot).keep_alive.cancel();
+    lines_[slot].keep_alive.cancel();
     if (seconds > 0)
-        line(slot).keep_alive = timers_.after_unscaled(std::chrono::seconds(seconds), [this, slot] {
-            leave_all(slot, PttEndReason::kKeepAliveMissed);
-        });
+        lines_[slot].keep_alive =
+            timers_.after_unscaled(std::chrono::seconds(seconds), [this, slot] {
+                leave_all(slot, PttEndReason::kKeepAliveMissed);
+            });
     return Done{};
 }
 
@@ -232,7 +233,7 @@ Answer<std::vector<PttContact>> PttCalls::others(int slot, std::int32_t session,
 }
 
 std::string PttCalls::uri_in(int slot, std::int32_t session) {
-    const auto &sessions = line(slot).sessions;
+    const auto &sessions = lines_[slot].sessions;
     const auto found = sessions.find(session);
     return found == sessions.end() ? directory_.uri_of(slot) : find(found->second)->uri();
 }

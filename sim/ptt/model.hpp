@@ -2,6 +2,7 @@
 #pragma once
 
 #include "sim/base/clock.hpp"
+#include "sim/base/per_slot.hpp"
 #include "sim/base/result.hpp"
 #include "sim/ptt/call.hpp"
 #include "sim/ptt/directory.hpp"
@@ -152,8 +153,6 @@ class PttCalls {
         PttParticipant &self;
     };
 
-    Line &line(int slot) { return lines_[static_cast<std::size_t>(slot)]; }
-    const Line &line(int slot) const { return lines_[static_cast<std::size_t>(slot)]; }
     PttCall *find(int call);
     PttParticipant *find(PttRef ref);
     PttCall *running_call(std::string_view uri);
@@ -224,7 +223,7 @@ class PttCalls {
     Timers &timers_;
     const Registrations &registrations_;
     Sink sink_;
-    std::vector<Line> lines_;
+    PerSlot<Line> lines_;
     std::map<int, PttCall> calls_;
     int next_call_ = 1;
     int next_ad_hoc_ = 1;

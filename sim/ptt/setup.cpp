@@ -21,7 +21,7 @@ std::optional<Refusal> PttCalls::cannot_place(int slot, const PttOffer &offer) {
         return refusal;
     if (auto refusal = bad_seconds(offer.answer_time, "the time to answer"))
         return refusal;
-    if (line(slot).sessions.size() >= kMostSessions)
+    if (lines_[slot].sessions.size() >= kMostSessions)
         return refuse(Result::kTooMany, "slot {} has {} push-to-talk sessions, and no more can be",
                       slot, kMostSessions);
     return std::nullopt;
@@ -66,7 +66,7 @@ PttParticipant &PttCalls::add_participant(PttCall &call, const PttContact &conta
 }
 
 void PttCalls::open_session(PttCall &call, PttParticipant &participant) {
-    Line &here = line(participant.contact.slot);
+    Line &here = lines_[participant.contact.slot];
     participant.session = here.next_session++;
     participant.listens_only =
         call.type == PttCallType::kChannel && here.channel_mode == PttChannelMode::kListenOnly;
@@ -112,7 +112,7 @@ Answer<std::vector<PttContact>> PttCalls::called_by(int slot, const PttCallReque
         return members;
     }
     case PttCallType::kChannel: {
-        const auto channel = line(slot).channel;
+        const auto channel = lines_[slot].channel;
         if (channel == 0)
             return refuse(Result::kWrongState, "slot {} is on no channel: PocSetChannel tunes it",
                           slot);
@@ -120,7 +120,7 @@ Answer<std::vector<PttContact>> PttCalls::called_by(int slot, const PttCallReque
         call.name = fmt::format("Channel {}", channel);
         std::vector<PttContact> tuned;
         for (int other = 0; other < directory_.slots(); ++other)
-            if (other != slot && line(other).channel == channel)
+            if (other != slot && lines_[other].channel == channel)
                 tuned.push_back({directory_.uri_of(other), {}, other, nullptr, call.uri, false, 0});
         return tuned;
     }

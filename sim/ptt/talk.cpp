@@ -225,7 +225,7 @@ Answer<std::vector<PttFloorStatus>>
 PttCalls::floor_status(int slot, const std::vector<std::int32_t> &sessions) {
     std::vector<std::int32_t> wanted = sessions;
     if (wanted.empty())
-        for (const auto &[session, ref] : line(slot).sessions)
+        for (const auto &[session, ref] : lines_[slot].sessions)
             wanted.push_back(session);
     std::vector<PttFloorStatus> found;
     for (const std::int32_t session : wanted) {

@@ -20,13 +20,16 @@ std::optional<Refusal> no_such_kind(LoginKind kind) {
 } // namespace
 
 Logins::Logins(int slots, Timers &timers, Registrations &registrations, Sink sink)
-    : timers_(timers), registrations_(registrations), sink_(std::move(sink)),
-      slots_(static_cast<std::size_t>(slots)) {
+    : timers_(timers), registrations_(registrations), sink_(std::move(sink)), slots_(slots) {
     registrations.when_lost([this](int slot) { leave_all(slot, LoginReason::kFlightMode); });
 }
 
 Logins::Login &Logins::at(int slot, LoginKind kind) {
-    return slots_[static_cast<std::size_t>(slot)].logins[static_cast<std::size_t>(kind)];
+    return slots_[slot].logins[static_cast<std::size_t>(kind)];
+}
+
+const Logins::Login &Logins::at(int slot, LoginKind kind) const {
+    return slots_[slot].logins[static_cast<std::size_t>(kind)];
 }
 
 Status Logins::login(int slot, std::string_view user, std::string_view password, LoginKind kind) {
@@ -44,7 +47,7 @@ Status Logins::login(int slot, std::string_view user, std::string_view password,
         return refuse(Result::kWrongPassword,
                       "the password of {} is wrong: any but an empty one and \"{}\" is right", user,
                       kWrongPassword);
-    const auto number = slots_[static_cast<std::size_t>(slot)].next_number++;
+    const auto number = slots_[slot].next_number++;
     enter(slot, kind, LoginPhase::kLoggingIn, number);
     at(slot, kind).timer = timers_.after(kLoginTime, [this, slot, kind, number] {
         enter(slot, kind, LoginPhase::kLoggedIn, number);
@@ -61,7 +64,7 @@ Status Logins::logout(int slot) {
 Answer<LoginState> Logins::state(int slot, LoginKind kind) const {
     if (auto refusal = no_such_kind(kind))
         return *refusal;
-    return slots_[static_cast<std::size_t>(slot)].logins[static_cast<std::size_t>(kind)].state;
+    return at(slot, kind).state;
 }
 
 void Logins::enter(int slot, LoginKind kind, LoginPhase phase, std::uint32_t number,

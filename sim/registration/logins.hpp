@@ -2,6 +2,7 @@
 #pragma once
 
 #include "sim/base/clock.hpp"
+#include "sim/base/per_slot.hpp"
 #include "sim/base/result.hpp"
 #include "sim/registration/registrations.hpp"
 
@@ -9,7 +10,6 @@
 #include <cstdint>
 #include <functional>
 #include <string_view>
-#include <vector>
 
 namespace sim {
 
@@ -51,11 +51,12 @@ class Logins {
                LoginReason reason = LoginReason::kAskedFor);
     bool leave_all(int slot, LoginReason reason);
     Login &at(int slot, LoginKind kind);
+    const Login &at(int slot, LoginKind kind) const;
 
     Timers &timers_;
     const Registrations &registrations_;
     Sink sink_;
-    std::vector<Slot> slots_;
+    PerSlot<Slot> slots_;
 };
 
 } // namespace sim

@@ -19,15 +19,15 @@ constexpr std::int32_t kGrantedSeconds = 3600;
 } // namespace
 
 Registrations::Registrations(int slots, Timers &timers, Sink sink)
-    : timers_(timers), sink_(std::move(sink)), slots_(static_cast<std::size_t>(slots)) {}
+    : timers_(timers), sink_(std::move(sink)), slots_(slots) {}
 
 void Registrations::start() {
-    for (int slot = 0; slot < static_cast<int>(slots_.size()); ++slot)
+    for (int slot = 0; slot < slots_.slots(); ++slot)
         begin(slot);
 }
 
 RegistrationInfo Registrations::info(int slot) const {
-    switch (at(slot).state) {
+    switch (slots_[slot].state) {
     case State::kRegistered:
         return {true, kLte, kVoice | kVideo | kShortMessages | kUssd, {}, kSipOk, kGrantedSeconds};
     case State::kFlightMode:
@@ -39,7 +39,7 @@ RegistrationInfo Registrations::info(int slot) const {
 }
 
 std::optional<Refusal> Registrations::radio_off(int slot) const {
-    if (at(slot).state != State::kFlightMode)
+    if (slots_[slot].state != State::kFlightMode)
         return std::nullopt;
     return refuse(Result::kWrongState,
                   "slot {} is in flight mode: RegisterApplication without "
@@ -51,8 +51,8 @@ Status Registrations::enable_flight_mode(int slot) {
     if (auto refusal = radio_off(slot))
         return *refusal;
     const bool announced = registered(slot);
-    at(slot).timer.cancel();
-    at(slot).state = State::kFlightMode;
+    slots_[slot].timer.cancel();
+    slots_[slot].state = State::kFlightMode;
     for (const auto &listener : lost_)
         listener(slot);
     if (emergency_bearer(slot))
@@ -63,24 +63,24 @@ Status Registrations::enable_flight_mode(int slot) {
 }
 
 void Registrations::switch_on(int slot) {
-    if (at(slot).state == State::kFlightMode)
+    if (slots_[slot].state == State::kFlightMode)
         begin(slot);
 }
 
 void Registrations::begin(int slot) {
-    at(slot).state = State::kRegistering;
-    at(slot).timer = timers_.after(kRegistrationTime, [this, slot] { complete(slot); });
+    slots_[slot].state = State::kRegistering;
+    slots_[slot].timer = timers_.after(kRegistrationTime, [this, slot] { complete(slot); });
 }
 
 void Registrations::complete(int slot) {
-    at(slot).state = State::kRegistered;
+    slots_[slot].state = State::kRegistered;
     sink_(slot, info(slot));
     for (const auto &listener : registered_)
         listener(slot);
 }
 
 void Registrations::set_bearer(int slot, bool registered, RegistrationReason reason) {
-    at(slot).emergency_bearer = registered;
+    slots_[slot].emergency_bearer = registered;
     sink_(slot, EmergencyRegistrationStatus{registered, registered ? kLte : kNoNetwork, reason});
 }
 

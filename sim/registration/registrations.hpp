@@ -2,6 +2,7 @@
 #pragma once
 
 #include "sim/base/clock.hpp"
+#include "sim/base/per_slot.hpp"
 #include "sim/base/result.hpp"
 
 #include <cstdint>
@@ -45,7 +46,7 @@ class Registrations {
     // Every slot begins to register.
     void start();
 
-    bool registered(int slot) const { return at(slot).state == State::kRegistered; }
+    bool registered(int slot) const { return slots_[slot].state == State::kRegistered; }
     RegistrationInfo info(int slot) const;
     // Why nothing can be sent, when the radio is off.
     std::optional<Refusal> radio_off(int slot) const;
@@ -54,7 +55,7 @@ class Registrations {
     // Leaves flight mode. Without effect when the radio is on.
     void switch_on(int slot);
 
-    bool emergency_bearer(int slot) const { return at(slot).emergency_bearer; }
+    bool emergency_bearer(int slot) const { return slots_[slot].emergency_bearer; }
     void set_emergency_bearer(int slot, bool registered) {
         set_bearer(slot, registered, RegistrationReason::kNone);
     }
@@ -72,15 +73,13 @@ class Registrations {
         bool emergency_bearer = false;
     };
 
-    Slot &at(int slot) { return slots_[static_cast<std::size_t>(slot)]; }
-    const Slot &at(int slot) const { return slots_[static_cast<std::size_t>(slot)]; }
     void begin(int slot);
     void complete(int slot);
     void set_bearer(int slot, bool registered, RegistrationReason reason);
 
     Timers &timers_;
     Sink sink_;
-    std::vector<Slot> slots_;
+    PerSlot<Slot> slots_;
     std::vector<Listener> lost_;
     std::vector<Listener> registered_;
 };

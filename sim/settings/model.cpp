@@ -92,11 +92,10 @@ SlotSettings SlotSettings::shipped() {
     return {0, {global_settings_fields().shipped()}, shipped_profiles()};
 }
 
-SettingsModel::SettingsModel(int slots)
-    : slots_(static_cast<std::size_t>(slots), SlotSettings::shipped()) {}
+SettingsModel::SettingsModel(int slots) : slots_(slots, SlotSettings::shipped()) {}
 
 void SettingsModel::restore(int slot, SlotSettings settings) {
-    slots_[static_cast<std::size_t>(slot)] = std::move(settings);
+    slots_[slot] = std::move(settings);
 }
 
 Status SettingsModel::commit(int slot, SlotSettings next) {

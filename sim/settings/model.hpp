@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
+#include "sim/base/per_slot.hpp"
 #include "sim/base/result.hpp"
 #include "sim/settings/fields.hpp"
 #include "sim/settings/offered.hpp"
@@ -35,8 +36,8 @@ class SettingsModel {
 
     explicit SettingsModel(int slots);
 
-    int slots() const { return static_cast<int>(slots_.size()); }
-    const SlotSettings &of(int slot) const { return slots_[static_cast<std::size_t>(slot)]; }
+    int slots() const { return slots_.slots(); }
+    const SlotSettings &of(int slot) const { return slots_[slot]; }
     void restore(int slot, SlotSettings settings);
     void keep_with(Keeper keeper) { keeper_ = std::move(keeper); }
 
@@ -55,7 +56,7 @@ class SettingsModel {
     // Becomes the slot's state once it is durable.
     Status commit(int slot, SlotSettings next);
 
-    std::vector<SlotSettings> slots_;
+    PerSlot<SlotSettings> slots_;
     Keeper keeper_;
 };
 

@@ -21,11 +21,11 @@ void ServiceCentre::post(int slot, Mail mail) {
     if (registrations_.registered(slot))
         deliver(slot, std::move(mail));
     else
-        box(slot).stored.push_back(std::move(mail));
+        boxes_[slot].stored.push_back(std::move(mail));
 }
 
 void ServiceCentre::deliver(int slot, Mail mail) {
-    Mailbox &here = box(slot);
+    Mailbox &here = boxes_[slot];
     const std::int32_t number = here.next_received++;
     const bool more = mail.more_follow || !here.stored.empty();
     const auto octets = std::visit(
@@ -36,7 +36,7 @@ void ServiceCentre::deliver(int slot, Mail mail) {
         mail.content);
     const IncomingKind kind = kind_of(mail.content);
     mail.patience = timers_.after_unscaled(kReportTime, [this, slot, number] {
-        const auto node = box(slot).delivered.extract(number);
+        const auto node = boxes_[slot].delivered.extract(number);
         if (node.mapped().message)
             conclude(*node.mapped().message, message_status::kNoResponse);
     });
@@ -45,7 +45,7 @@ void ServiceCentre::deliver(int slot, Mail mail) {
 }
 
 void ServiceCentre::deliver_stored(int slot) {
-    auto &stored = box(slot).stored;
+    auto &stored = boxes_[slot].stored;
     while (!stored.empty()) {
         Mail mail = std::move(stored.front());
         stored.pop_front();
@@ -55,7 +55,7 @@ void ServiceCentre::deliver_stored(int slot) {
 
 // The device may have lost what it has not reported on.
 void ServiceCentre::take_back(int slot) {
-    Mailbox &here = box(slot);
+    Mailbox &here = boxes_[slot];
     auto delivered = std::exchange(here.delivered, {});
     std::deque<Mail> again;
     for (auto &[number, mail] : delivered) {

@@ -57,7 +57,7 @@ bool single_shot(const tpdu::Validity &validity) {
 ServiceCentre::ServiceCentre(const NumberPlan &plan, Timers &timers, Registrations &registrations,
                              std::int64_t epoch, Sink sink)
     : plan_(plan), timers_(timers), registrations_(registrations), epoch_(epoch),
-      sink_(std::move(sink)), boxes_(static_cast<std::size_t>(plan.slots())), errands_(timers) {
+      sink_(std::move(sink)), boxes_(plan.slots()), errands_(timers) {
     registrations.when_lost([this](int slot) { take_back(slot); });
     registrations.when_registered([this](int slot) { deliver_stored(slot); });
 }
@@ -96,7 +96,7 @@ Answer<SubmitReceipt> ServiceCentre::submit(int slot, const SubmitRequest &reque
     Message &message = held_[id];
     message.id = id;
     message.sender = slot;
-    message.number = box(slot).next_sent++;
+    message.number = boxes_[slot].next_sent++;
     message.submit = *submit;
     message.more_follow = request.option == 1;
     message.taken = now();
@@ -266,7 +266,7 @@ Answer<std::int32_t> ServiceCentre::report(int slot, const ReportRequest &reques
         if (const auto decoded = tpdu::decode_deliver_report(request.tpdu, kind); !decoded)
             return refuse(Result::kInvalidArgument, "this is no SMS-DELIVER-REPORT of {}: {}",
                           request.code == 0 ? "success" : "failure", decoded.error().message);
-    auto &waiting = box(slot).delivered;
+    auto &waiting = boxes_[slot].delivered;
     const auto found = request.option == 0 ? waiting.begin() : waiting.find(request.option);
     if (found == waiting.end())
         return request.option == 0 ? refuse(Result::kWrongState, "no message waits for a report")

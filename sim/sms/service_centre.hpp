@@ -4,6 +4,7 @@
 #include "sim/base/clock.hpp"
 #include "sim/base/errands.hpp"
 #include "sim/base/number_plan.hpp"
+#include "sim/base/per_slot.hpp"
 #include "sim/base/result.hpp"
 #include "sim/registration/registrations.hpp"
 #include "sim/sms/parties.hpp"
@@ -16,7 +17,6 @@
 #include <optional>
 #include <string>
 #include <variant>
-#include <vector>
 
 namespace sim {
 
@@ -116,7 +116,6 @@ class ServiceCentre {
         std::map<std::int32_t, Mail> delivered; // those that wait for a report, by number
     };
 
-    Mailbox &box(int slot) { return boxes_[static_cast<std::size_t>(slot)]; }
     tpdu::Timestamp now() const;
     std::int64_t now_in_seconds() const;
 
@@ -143,7 +142,7 @@ class ServiceCentre {
     const Registrations &registrations_;
     std::int64_t epoch_;
     Sink sink_;
-    std::vector<Mailbox> boxes_;
+    PerSlot<Mailbox> boxes_;
     Id next_id_ = 1;
     std::map<Id, Message> held_;
     Errands errands_;

@@ -94,11 +94,11 @@ std::string_view name_of(CallType type) {
 
 SupplementaryServices::SupplementaryServices(const NumberPlan &plan,
                                              const Registrations &registrations)
-    : plan_(plan), registrations_(registrations), slots_(static_cast<std::size_t>(plan.slots())) {}
+    : plan_(plan), registrations_(registrations), slots_(plan.slots()) {}
 
 const SupplementaryServices::Services &SupplementaryServices::services(int slot,
                                                                        CallType type) const {
-    return slots_[static_cast<std::size_t>(slot)][type == CallType::kVideo ? 1 : 0];
+    return slots_[slot][type == CallType::kVideo ? 1 : 0];
 }
 
 std::optional<Refusal> SupplementaryServices::bad_query(int slot, ServiceClass service) const {
@@ -125,7 +125,7 @@ Status SupplementaryServices::set_waiting(int slot, const WaitingEntry &wanted) 
     if (auto refusal = bad_change(slot, wanted.service, wanted.status))
         return *refusal;
     for (const auto position : classes_of(wanted.service))
-        slots_[static_cast<std::size_t>(slot)][position].waiting = wanted.status == 1;
+        slots_[slot][position].waiting = wanted.status == 1;
     return Done{};
 }
 
@@ -135,8 +135,7 @@ Answer<std::vector<WaitingEntry>> SupplementaryServices::waiting(int slot,
         return *refusal;
     std::vector<WaitingEntry> entries;
     for (const auto position : classes_of(service))
-        entries.push_back(
-            {kClasses[position], slots_[static_cast<std::size_t>(slot)][position].waiting ? 1 : 0});
+        entries.push_back({kClasses[position], slots_[slot][position].waiting ? 1 : 0});
     return entries;
 }
 
@@ -183,8 +182,7 @@ Status SupplementaryServices::set_forwarding(int slot, const ForwardingEntry &wa
     std::vector<Forwarding *> places;
     for (const auto position : classes_of(wanted.service))
         for (const auto condition : conditions)
-            places.push_back(
-                &slots_[static_cast<std::size_t>(slot)][position].forwarding[condition]);
+            places.push_back(&slots_[slot][position].forwarding[condition]);
     const bool keeps = !forwarding->active || forwarding->uri.empty();
     if (forwarding->active && keeps &&
         std::ranges::any_of(places, [](const auto *place) { return place->uri.empty(); }))
@@ -208,7 +206,7 @@ SupplementaryServices::forwarding(int slot, ServiceClass service,
     std::vector<ForwardingEntry> entries;
     for (const auto position : classes_of(service))
         for (const auto index : conditions) {
-            const auto &place = slots_[static_cast<std::size_t>(slot)][position].forwarding[index];
+            const auto &place = slots_[slot][position].forwarding[index];
             const auto which = static_cast<ForwardCondition>(index);
             const bool timed = which == ForwardCondition::kNoReply;
             entries.push_back(
@@ -231,7 +229,7 @@ Status SupplementaryServices::set_barring(int slot, const BarringEntry &wanted,
         return refuse(Result::kWrongPassword, "that is not the barring password");
     for (const auto position : classes_of(wanted.service))
         for (const auto type : types)
-            slots_[static_cast<std::size_t>(slot)][position].barring[type] = wanted.status == 1;
+            slots_[slot][position].barring[type] = wanted.status == 1;
     return Done{};
 }
 
@@ -245,10 +243,8 @@ Answer<std::vector<BarringEntry>> SupplementaryServices::barring(int slot, Servi
     std::vector<BarringEntry> entries;
     for (const auto position : classes_of(service))
         for (const auto index : types)
-            entries.push_back(
-                {kClasses[position],
-                 slots_[static_cast<std::size_t>(slot)][position].barring[index] ? 1 : 0,
-                 static_cast<BarringType>(index)});
+            entries.push_back({kClasses[position], slots_[slot][position].barring[index] ? 1 : 0,
+                               static_cast<BarringType>(index)});
     return entries;
 }
 

@@ -3,6 +3,7 @@
 
 #include "sim/base/call_type.hpp"
 #include "sim/base/number_plan.hpp"
+#include "sim/base/per_slot.hpp"
 #include "sim/base/result.hpp"
 #include "sim/registration/registrations.hpp"
 
@@ -107,7 +108,7 @@ class SupplementaryServices {
 
     const NumberPlan &plan_;
     const Registrations &registrations_;
-    std::vector<Slot> slots_;
+    PerSlot<Slot> slots_;
 };
 
 } // namespace sim

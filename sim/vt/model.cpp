@@ -34,14 +34,14 @@ void VideoTelephony::hear(int slot, const CallEvent &event) {
 }
 
 void VideoTelephony::drop(int slot, int id) {
-    at(slot).videos.erase(id);
-    if (at(slot).active == id)
-        at(slot).active = 0;
+    slots_[slot].videos.erase(id);
+    if (slots_[slot].active == id)
+        slots_[slot].active = 0;
 }
 
 const Video *VideoTelephony::find(int slot, int id) const {
-    const auto found = at(slot).videos.find(id);
-    return found == at(slot).videos.end() ? nullptr : &found->second;
+    const auto found = slots_[slot].videos.find(id);
+    return found == slots_[slot].videos.end() ? nullptr : &found->second;
 }
 
 Answer<Video *> VideoTelephony::video(int slot, int id) {
@@ -51,7 +51,7 @@ Answer<Video *> VideoTelephony::video(int slot, int id) {
     if (call->type != CallType::kVideo)
         return refuse(Result::kWrongState, "call {} is no video call but of type {}", id,
                       call->type);
-    return &at(slot).videos[id];
+    return &slots_[slot].videos[id];
 }
 
 Answer<Video *> VideoTelephony::streaming(int slot, int id) {
@@ -65,7 +65,7 @@ Status VideoTelephony::set_active(int slot, int id) {
     const auto found = video(slot, id);
     if (!found)
         return found.refusal();
-    at(slot).active = id;
+    slots_[slot].active = id;
     return Done{};
 }
 

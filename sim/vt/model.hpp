@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
+#include "sim/base/per_slot.hpp"
 #include "sim/base/result.hpp"
 #include "sim/call/events.hpp"
 #include "sim/call/model.hpp"
@@ -77,7 +78,7 @@ struct Swipe {
 // no sense in the present state is refused and changes nothing.
 class VideoTelephony {
   public:
-    VideoTelephony(const CallModel &calls, int slots) : calls_(calls), slots_(slots_of(slots)) {}
+    VideoTelephony(const CallModel &calls, int slots) : calls_(calls), slots_(slots) {}
 
     // A call that ends, or is a voice call from now on, loses its video.
     void hear(int slot, const CallEvent &event);
@@ -117,18 +118,13 @@ class VideoTelephony {
 
     // For whoever looks: the video of a call that has one, the call whose video is active or 0.
     const Video *find(int slot, int id) const;
-    int active(int slot) const { return at(slot).active; }
+    int active(int slot) const { return slots_[slot].active; }
 
   private:
     struct Slot {
         std::map<int, Video> videos;
         int active = 0;
     };
-    static std::vector<Slot> slots_of(int count) {
-        return std::vector<Slot>(static_cast<std::size_t>(count));
-    }
-    Slot &at(int slot) { return slots_[static_cast<std::size_t>(slot)]; }
-    const Slot &at(int slot) const { return slots_[static_cast<std::size_t>(slot)]; }
     void drop(int slot, int id);
 
     // What requests stand on: the video in the state that they need, or the refusal.
@@ -139,7 +135,7 @@ class VideoTelephony {
     Answer<VideoRecording *> recording(int slot, int id, VideoEnd end);
 
     const CallModel &calls_;
-    std::vector<Slot> slots_;
+    PerSlot<Slot> slots_;
 };
 
 // Why an integer names neither end, or nothing.

@@ -112,7 +112,7 @@ Status VideoTelephony::resume_recording(int slot, int id, VideoEnd end) {
 Status VideoTelephony::end_recording(int slot, int id, VideoEnd end) {
     if (const auto found = recording(slot, id, end); !found)
         return found.refusal();
-    at(slot).videos.at(id).recordings.erase(end);
+    slots_[slot].videos.at(id).recordings.erase(end);
     return Done{};
 }
 
