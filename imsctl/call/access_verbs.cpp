@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // How calls are responded to and what the radio side reports: not about one call's sound or
 // parties.
+#include "imsctl/call/values.hpp"
 #include "imsctl/line/requests.hpp"
 
 namespace imsctl {
@@ -65,7 +66,7 @@ constexpr Verb kVerbs[] = {
      }},
     {"call epdg status", "show whether a call runs over the evolved packet data gateway",
      "call epdg status",
-     [](Arguments &) { return plain(ims_call_is_in_epdg_call, decode_in_epdg_call); }},
+     [](Arguments &) { return plain(ims_call_is_in_epdg_call, flag_as("in_epdg_call")); }},
     {"call epdg audio-path", "change the audio path", "call epdg audio-path epdg",
      [](Arguments &arguments) {
          return with_number(arguments.choice("PATH", "the audio path", kAudioPaths),

@@ -1,5 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Calls with more than two parties.
+#include "imsctl/call/session_value.hpp"
+#include "imsctl/call/values.hpp"
 #include "imsctl/line/requests.hpp"
 
 namespace imsctl {
@@ -26,7 +28,8 @@ Action prepare_start(Arguments &arguments) {
     return [=](Invocation &run) {
         const ParticipantChain chain(*numbers);
         const ims_call_conference_s info{*type, chain.count(), chain.head()};
-        run.request({}, with_record(ims_call_start_conference, info), decode_session_id_in_place);
+        run.request({}, with_record(ims_call_start_conference, info),
+                    number_in_place_as("session_id"));
     };
 }
 
@@ -40,7 +43,7 @@ Action prepare_modify(Arguments &arguments) {
                                                 chain.count(), chain.head()};
         run.request(session_id_field(info.session_id),
                     with_record(ims_call_modify_participants_in_conference, info),
-                    decode_value_in_place);
+                    number_in_place_as("value_1"));
     };
 }
 
@@ -62,7 +65,8 @@ Action prepare_nway_start(Arguments &arguments) {
     return [=](Invocation &run) {
         const std::int32_t first_id = first.resolve(run.client());
         const ims_call_id_info_s info{first_id, second.resolve(run.client()), *type};
-        run.request({}, with_record(ims_call_start_nway_conference_call, info), decode_session_id);
+        run.request({}, with_record(ims_call_start_nway_conference_call, info),
+                    number_as("session_id"));
     };
 }
 
@@ -77,7 +81,7 @@ constexpr Verb kVerbs[] = {
     {"call conference modify", "add parties to a conference, or remove them",
      "call conference modify add +15550151", prepare_modify},
     {"call conference merge", "merge the active and the held call", "call conference merge",
-     [](Arguments &) { return plain(ims_call_merge_calls, decode_session_id); }},
+     [](Arguments &) { return plain(ims_call_merge_calls, number_as("session_id")); }},
     {"call conference add-user", "invite one party into a conference",
      "call conference add-user +15550151", prepare_add_user},
     {"call conference nway start", "make a conference of two calls",

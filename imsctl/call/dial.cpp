@@ -2,6 +2,7 @@
 // Placing a call, and following it until it is established or over.
 #include "imsctl/call/dial.hpp"
 
+#include "imsctl/call/values.hpp"
 #include "imsctl/line/requests.hpp"
 
 #include <array>
@@ -29,7 +30,7 @@ Fields place_call(Client &client, const DialArguments &given) {
     const ims_call_make_info_s info{given.number->c_str(),   *given.type,
                                     given.texts[0]->c_str(), given.texts[1]->c_str(),
                                     given.texts[2]->c_str(), given.texts[3]->c_str()};
-    return client.request(with_record(ims_call_make_call, info), decode_session_id);
+    return client.request(with_record(ims_call_make_call, info), number_as("session_id"));
 }
 
 // Follows one call. Shows each event to people as it comes and keeps them for programs.

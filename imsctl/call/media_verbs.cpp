@@ -1,5 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Sound, tones, recording and text telephony inside a call.
+#include "imsctl/call/session_value.hpp"
+#include "imsctl/call/values.hpp"
 #include "imsctl/line/requests.hpp"
 
 namespace imsctl {
@@ -76,6 +78,18 @@ Action prepare_tty_send(Arguments &arguments) {
     };
 }
 
+Fields decode_tty_mode(void *data) {
+    if (data == nullptr)
+        return {};
+    const auto &mode = *static_cast<const ims_call_tty_mode_s *>(data);
+    Bytes bytes;
+    if (mode.data != nullptr && mode.length > 0)
+        bytes.assign(mode.data, mode.data + mode.length);
+    return {{"value_1", std::int64_t{mode.value_1}},
+            {"value_2", std::int64_t{mode.value_2}},
+            {"data", bytes}};
+}
+
 Action prepare_volume(Arguments &arguments) {
     const auto volume = arguments.number("VOLUME", "from 0 to what 'call volume max' says");
     return on_session(arguments.session_option(kEstablished), volume, ims_call_set_volume);
@@ -99,7 +113,7 @@ constexpr Verb kVerbs[] = {
      }},
     {"call mute status", "show whether a call is muted", "call mute status",
      [](Arguments &arguments) {
-         return on_session(arguments, kEstablished, ims_call_is_muted, decode_muted);
+         return on_session(arguments, kEstablished, ims_call_is_muted, flag_as("muted"));
      }},
     {"call mute toggle", "mute a call, or unmute it", "call mute toggle",
      [](Arguments &arguments) {
@@ -108,7 +122,8 @@ constexpr Verb kVerbs[] = {
     {"call volume set", "set a call's volume", "call volume set 5", prepare_volume},
     {"call volume max", "show a call's greatest volume", "call volume max",
      [](Arguments &arguments) {
-         return on_session(arguments, kEstablished, ims_call_get_max_volume, decode_max_volume);
+         return on_session(arguments, kEstablished, ims_call_get_max_volume,
+                           number_as("max_volume"));
      }},
     {"call speaker", "switch the speaker", "call speaker on", prepare_speaker},
 };

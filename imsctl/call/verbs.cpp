@@ -1,8 +1,11 @@
 // SPDX-License-Identifier: Apache-2.0
 // Placing, answering, ending and changing calls.
 #include "imsctl/call/dial.hpp"
+#include "imsctl/call/session_value.hpp"
+#include "imsctl/call/values.hpp"
 #include "imsctl/line/requests.hpp"
 
+#include <cstdlib>
 #include <fmt/format.h>
 #include <nlohmann/json.hpp>
 
@@ -33,6 +36,18 @@ Action prepare_reject(Arguments &arguments) {
     const auto session = arguments.session_place(kRingingHere);
     return on_session(session, arguments.choice("--reason", "why", kRejectReasons, 0),
                       ims_call_reject_call);
+}
+
+// The text in it is taken over and released.
+Fields decode_change_result(void *data) {
+    if (data == nullptr)
+        return {};
+    const auto &result = *static_cast<const ims_call_change_result_s *>(data);
+    Value text;
+    if (result.text_1 != nullptr)
+        text = std::string(result.text_1);
+    std::free(result.text_1);
+    return {{"value_1", std::int64_t{result.value_1}}, {"text_1", text}};
 }
 
 Action prepare_change_to(Arguments &arguments, std::int32_t usual_type, PairRequest request,

@@ -3,15 +3,9 @@
 #pragma once
 
 #include "imsctl/client/main_loop.hpp"
-
-#include <string>
+#include "imsctl/output/output.hpp"
 
 namespace imsctl {
-
-struct LastWords {
-    std::string to_stdout;
-    std::string to_stderr;
-};
 
 // A time limit for the library's blocking calls, which take none themselves: while it lives, the
 // process says its last words and ends with status 1 once the time is over.

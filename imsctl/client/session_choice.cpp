@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "imsctl/client/session_choice.hpp"
 
-#include "imsctl/output/values.hpp"
+#include "imsctl/client/call_values.hpp"
 
 #include <fmt/format.h>
 #include <fmt/ranges.h>

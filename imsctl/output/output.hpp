@@ -2,7 +2,6 @@
 // The two forms of everything that imsctl says: lines for people, JSON objects for programs.
 #pragma once
 
-#include "imsctl/client/last_words.hpp"
 #include "imsctl/output/events.hpp"
 #include "imsctl/output/failure.hpp"
 
@@ -32,6 +31,12 @@ std::string to_text(const EventRow &row, const Fields &fields);
 // "12:34:56.789 call-ended session_id=1 reason=16"
 std::string to_text(const Event &event);
 Json to_json(const Event &event, int slot);
+
+// Texts made beforehand, to be written from where nothing else can be done any more.
+struct LastWords {
+    std::string to_stdout;
+    std::string to_stderr;
+};
 
 class Output {
   public:

@@ -50,7 +50,7 @@ Action prepare_call(Arguments &arguments) {
         store(*given.media, info.int_set_1);
         store(given.terms.set(), info.int_set_2);
         info.value_2 = *given.answer_time;
-        run.request({}, with_record(ims_poc_call_make_call, info), decode_session_id);
+        run.request({}, with_record(ims_poc_call_make_call, info), number_as("session_id"));
     };
 }
 
@@ -67,7 +67,7 @@ void start_ad_hoc(Invocation &run, const Offer &given, const std::string &subjec
     info.flag_3 = *given.floor;
     info.value_1 = *given.answer_time;
     info.user_list = users.head();
-    run.request({}, with_record(ims_poc_make_ad_hoc_call, info), decode_session_id);
+    run.request({}, with_record(ims_poc_make_ad_hoc_call, info), number_as("session_id"));
 }
 
 // The session whose users change; 0 when it is left out.

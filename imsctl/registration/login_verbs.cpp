@@ -5,6 +5,8 @@
 namespace imsctl {
 namespace {
 
+constexpr NamedValue kLoginKinds[] = {{"ims", 0}, {"push-to-talk", 1}};
+
 Action prepare_login(Arguments &arguments) {
     const auto user = arguments.text("USER", "who logs in");
     const auto password = arguments.text("PASSWORD", "the user's password");

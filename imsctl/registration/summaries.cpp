@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "imsctl/registration/summaries.hpp"
 
-#include "imsctl/sms/short_message.hpp"
+#include "imsctl/output/values.hpp"
 
 #include <fmt/format.h>
 #include <fmt/ranges.h>
@@ -63,10 +63,6 @@ std::string summarise_login(const Fields &fields) {
     if (get<std::int64_t>(fields, "value_1") == kLoggedOut)
         return fmt::format("{}: {}", state, named(kUnregisteredReasons, fields, "value_3"));
     return state;
-}
-
-std::string summarise_tpdu(const Fields &fields) {
-    return describe(get<Binary>(fields, "tpdu").bytes);
 }
 
 } // namespace imsctl

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-// What the fields of some events come to, in words.
+// What the fields of the events come to, in words.
 #pragma once
 
 #include "imsctl/output/fields.hpp"
@@ -9,6 +9,5 @@ namespace imsctl {
 std::string summarise_registration(const Fields &fields);
 std::string summarise_emergency_registration(const Fields &fields);
 std::string summarise_login(const Fields &fields);
-std::string summarise_tpdu(const Fields &fields);
 
 } // namespace imsctl

@@ -31,19 +31,13 @@ Action prepare_watch(Arguments &arguments) {
     };
 }
 
-Fields decode_application_id(void *data) {
-    if (data == nullptr)
-        return {};
-    return {{"application_id", std::int64_t{*static_cast<const std::int32_t *>(data)}}};
-}
-
 constexpr Verb kVerbs[] = {
     {"registration show", "show whether the device is registered", "registration show",
      [](Arguments &) -> Action { return show_registration; }},
     {"registration watch", "show changes of the registration as they happen",
      "registration watch --count 1", prepare_watch},
     {"registration register", "register this program and the device again", "registration register",
-     [](Arguments &) { return plain(ims_register_application, decode_application_id); }},
+     [](Arguments &) { return plain(ims_register_application, number_as("application_id")); }},
     {"flight-mode", "enter flight mode; 'registration register' leaves it", "flight-mode",
      [](Arguments &) { return plain(ims_enable_flight_mode); }},
 };

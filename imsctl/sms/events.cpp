@@ -1,10 +1,14 @@
 // SPDX-License-Identifier: Apache-2.0
 // What tells of short messages.
 #include "imsctl/output/event_fields.hpp"
-#include "imsctl/registration/summaries.hpp"
+#include "imsctl/sms/short_message.hpp"
 
 namespace imsctl {
 namespace {
+
+std::string summarise_tpdu(const Fields &fields) {
+    return describe(get<Binary>(fields, "tpdu").bytes);
+}
 
 constexpr FieldRow kIncomingSms[] = {
     tpdu_bytes<&ims_sms_incoming_s::tpdu, &ims_sms_incoming_s::tpdu_length>("tpdu"),

@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "imsctl/ss/list.hpp"
 
+#include "imsctl/ss/values.hpp"
+
 #include <algorithm>
 #include <fmt/format.h>
 #include <memory>

@@ -2,6 +2,7 @@
 // Supplementary services: call waiting, forwarding and barring.
 #include "imsctl/line/requests.hpp"
 #include "imsctl/ss/list.hpp"
+#include "imsctl/ss/values.hpp"
 
 namespace imsctl {
 namespace {

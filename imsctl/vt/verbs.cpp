@@ -5,6 +5,13 @@
 namespace imsctl {
 namespace {
 
+constexpr std::int32_t kFrontCamera = 0;
+constexpr NamedValue kCameras[] = {{"front", kFrontCamera}, {"back", 1}};
+constexpr std::int32_t kFarEnd = 1;
+constexpr NamedValue kVideoEnds[] = {{"near", 0}, {"far", kFarEnd}};
+constexpr std::int32_t kMp4 = 1;
+constexpr NamedValue kVideoFormats[] = {{"3gp", 0}, {"mp4", kMp4}};
+
 // What a verb about a video call does: `record` makes the request's record for the session.
 template <class Record, class Make>
 Action about(SessionChoice session, int (*request)(ims_h, const Record *, ims_response_cb, void *),
@@ -62,7 +69,7 @@ Action prepare_get_zoom(Arguments &arguments) {
         [=](std::int32_t id) {
             return ims_vt_zoom_query_s{id, *camera};
         },
-        decode_zoom);
+        number_as("zoom"));
 }
 
 Action prepare_set_zoom(Arguments &arguments) {

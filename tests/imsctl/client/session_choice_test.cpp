@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
+#include "imsctl/client/call_values.hpp"
 #include "imsctl/client/session_choice.hpp"
-#include "imsctl/output/values.hpp"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Numbers, named values and suggestions.
+#include "imsctl/client/call_values.hpp"
 #include "imsctl/line/suggestions.hpp"
 #include "imsctl/output/values.hpp"
 
