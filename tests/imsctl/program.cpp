@@ -20,8 +20,7 @@ Environment strict_environment() {
 }
 
 std::vector<std::string> imsctl_command(std::vector<std::string> words) {
-    words.insert(words.begin(), program("imsctl"));
-    return words;
+    return program("imsctl", std::move(words));
 }
 
 Outcome run_imsctl(std::vector<std::string> words, const Environment &more) {

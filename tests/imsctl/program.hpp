@@ -2,14 +2,15 @@
 // imsctl as a child process, and what it writes.
 #pragma once
 
-#include "tests/imsctl/process.hpp"
 #include "tests/programs/programs.hpp"
+#include "tests/support/process.hpp"
 
 #include <nlohmann/json.hpp>
 
 namespace test {
 
 using Json = nlohmann::ordered_json;
+using Environment = Process::Environment;
 
 // What ran to its end.
 struct Outcome {

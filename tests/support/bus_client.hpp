@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
-// A raw connection to the private bus: signals of any kind, from anybody.
+// A connection to a message bus that is the test's alone. Who makes a BusClient owns the
+// connection; it is closed at the end, or by close().
 #pragma once
 
 #include "tests/support/variant.hpp"
@@ -17,6 +18,8 @@ class BusClient {
     BusClient(const BusClient &) = delete;
     BusClient &operator=(const BusClient &) = delete;
 
+    void close();
+
     // No body: a signal without parameters. A destination: sent to that connection alone.
     void emit_signal(const char *path, const char *interface, const char *member,
                      const Variant &body, const char *destination = nullptr);
@@ -32,9 +35,18 @@ class BusClient {
     bool own_name(const char *name);
     void release_name(const char *name);
 
+    // Whether anybody has it; the waits run the thread-default main context until somebody or
+    // nobody does. A connection's unique name is had until the connection has left the bus.
+    bool has_owner(const std::string &name);
+    void wait_until_owned(const std::string &name) { wait_for_owner(name, true); }
+    void wait_until_gone(const std::string &name) { wait_for_owner(name, false); }
+
+    std::string unique_name() const { return g_dbus_connection_get_unique_name(connection_); }
     GDBusConnection *connection() const { return connection_; }
 
   private:
+    void wait_for_owner(const std::string &name, bool owned);
+
     GDBusConnection *connection_ = nullptr;
 };
 

@@ -1,18 +1,21 @@
 // SPDX-License-Identifier: Apache-2.0
-// A dbus-daemon of the test's own that plays the system bus.
+// A message bus of the test's own. Who makes a PrivateBus owns its daemon, which ends with it, and
+// its directory, which is gone then. As long as it lives it is the system bus of this process and
+// of the programs that it runs; two that overlap end in the other order.
 #pragma once
 
+#include "tests/support/process.hpp"
+
+#include <optional>
 #include <string>
 #include <string_view>
-
-#include <sys/types.h>
 
 namespace test {
 
 class PrivateBus {
   public:
-    // Listens, and is the process's system bus, when this returns. The rules are put behind those
-    // that allow everything, so they can forbid something; the elements behind everything else.
+    // Listens when this returns. The rules are put behind those that allow everything, so they can
+    // forbid something; the elements behind everything else.
     explicit PrivateBus(std::string_view policy_rules = {}, std::string_view elements = {});
     ~PrivateBus();
     PrivateBus(const PrivateBus &) = delete;
@@ -29,7 +32,8 @@ class PrivateBus {
 
     std::string directory_;
     std::string address_;
-    pid_t daemon_ = -1;
+    std::optional<std::string> system_bus_before_;
+    std::optional<Process> daemon_;
 };
 
 } // namespace test

@@ -4,11 +4,16 @@
 #include "tests/support/glib_watch.hpp"
 #include "tests/support/malformed.hpp"
 #include "tests/support/platform_capture.hpp"
+#include "tests/support/process.hpp"
 #include "tests/support/with_peer.hpp"
 
+#include <gmock/gmock.h>
 #include <gtest/gtest-spi.h>
 
+#include <csignal>
+#include <cstdlib>
 #include <set>
+#include <system_error>
 
 namespace test {
 namespace {
@@ -68,6 +73,76 @@ TEST(Malformed, LeavesOutTheShapeThatIsExpected) {
     EXPECT_EQ(types.count("(ii)"), 0U);
     EXPECT_EQ(types.count("(i)"), 1U);
     EXPECT_EQ(types.count(""), 1U);
+}
+
+TEST(ProcessRunner, TellsWhatAChildWroteAndHowItEnded) {
+    Process child{{"sh", "-c", "echo $GREETING; echo two; echo three >&2; exit 3"},
+                  {{"GREETING", "one"}}};
+    EXPECT_EQ(child.read_line(), "one");
+    child.wait_for_error("three");
+    EXPECT_EQ(child.wait(), 3);
+    EXPECT_EQ(child.output(), "one\ntwo\n");
+    EXPECT_EQ(child.read_errors(), "three\n");
+    Process killed{{"sh", "-c", "kill -TERM $$"}};
+    EXPECT_EQ(killed.wait(), 128 + SIGTERM);
+}
+
+TEST(ProcessRunner, SaysWhatDoesNotCome) {
+    Process child{{"echo", "something"}};
+    try {
+        child.wait_for_output("something else");
+        FAIL() << "it came";
+    } catch (const std::runtime_error &why) {
+        EXPECT_STREQ(why.what(), "ended without \"something else\"; output: something\nerror: ");
+    }
+    EXPECT_THROW(Process{{"/nonexistent/program"}}, std::system_error);
+}
+
+TEST(ProcessRunner, HasNoInputUnlessItIsAskedFor) {
+    EXPECT_EQ(Process{{"cat"}}.wait(), 0);
+    Process reader{{"sh", "-c", "read line; exit 5"}, {}, {.has_input = true}};
+    reader.close_input();
+    EXPECT_EQ(reader.wait(), 5);
+}
+
+TEST(ProcessRunner, LeavesNoChildBehind) {
+    pid_t pid = -1;
+    {
+        const Process child{{"sleep", "1000"}};
+        pid = child.pid();
+        EXPECT_EQ(kill(pid, 0), 0);
+    }
+    EXPECT_EQ(kill(pid, 0), -1);
+}
+
+TEST(PrivateBusOfATest, IsTheSystemBusWhileItLives) {
+    const auto system_bus = [] {
+        const char *address = std::getenv("DBUS_SYSTEM_BUS_ADDRESS");
+        return std::string{address != nullptr ? address : "none"};
+    };
+    EXPECT_EQ(system_bus(), "none");
+    {
+        const PrivateBus first;
+        EXPECT_EQ(system_bus(), first.address());
+        {
+            const PrivateBus second;
+            EXPECT_EQ(system_bus(), second.address());
+        }
+        EXPECT_EQ(system_bus(), first.address());
+    }
+    EXPECT_EQ(system_bus(), "none");
+}
+
+TEST(BusClientOfATest, SeesNamesComeAndGo) {
+    const PrivateBus bus;
+    BusClient one{bus.address()};
+    BusClient other{bus.address()};
+    EXPECT_FALSE(one.has_owner(kServiceName));
+    EXPECT_TRUE(other.own_name(kServiceName));
+    one.wait_until_owned(kServiceName);
+    other.close();
+    one.wait_until_gone(kServiceName);
+    EXPECT_FALSE(one.has_owner(other.unique_name()));
 }
 
 class Peer : public WithPeer {};

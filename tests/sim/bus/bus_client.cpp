@@ -3,6 +3,7 @@
 
 #include "sim/bus/service.hpp"
 #include "tests/programs/programs.hpp"
+#include "tests/support/pump.hpp"
 
 #include <algorithm>
 #include <csignal>
@@ -15,104 +16,20 @@ namespace {
 
 constexpr guint kPatienceMilliseconds = 20000;
 
-// Ends the test, and it alone: what it holds is let go of.
-template <typename... Args>
-[[noreturn]] void give_up(fmt::format_string<Args...> text, Args &&...args) {
-    throw std::runtime_error(fmt::format(text, std::forward<Args>(args)...));
-}
-
-GObjectPtr<GDataInputStream> lines_of(GInputStream *stream) {
-    return GObjectPtr<GDataInputStream>(g_data_input_stream_new(stream));
-}
-
-std::optional<std::string> next_line(GDataInputStream *stream) {
-    const GText line(g_data_input_stream_read_line(stream, nullptr, nullptr, nullptr));
-    return line ? std::optional<std::string>(line.get()) : std::nullopt;
-}
-
 } // namespace
 
 std::string slot_path(int slot) {
     return Service::slot_path(slot);
 }
 
-Program::Program(const std::vector<std::string> &arguments, const Environment &environment) {
-    const GObjectPtr<GSubprocessLauncher> launcher(
-        g_subprocess_launcher_new(static_cast<GSubprocessFlags>(G_SUBPROCESS_FLAGS_STDIN_PIPE |
-                                                                G_SUBPROCESS_FLAGS_STDOUT_PIPE |
-                                                                G_SUBPROCESS_FLAGS_STDERR_PIPE)));
-    g_subprocess_launcher_setenv(launcher.get(), "G_DEBUG", "fatal-warnings", TRUE);
-    for (const auto &[name, value] : environment)
-        g_subprocess_launcher_setenv(launcher.get(), name.c_str(), value.c_str(), TRUE);
-    const std::string path = ::test::program("ims-sim");
-    std::vector<const char *> argv{path.c_str()};
-    for (const auto &argument : arguments)
-        argv.push_back(argument.c_str());
-    argv.push_back(nullptr);
-    ErrorSlot error;
-    process_.reset(g_subprocess_launcher_spawnv(launcher.get(), argv.data(), &error.raw));
-    if (!process_)
-        give_up("cannot start {}: {}", path, error.message());
-    output_ = lines_of(g_subprocess_get_stdout_pipe(process_.get()));
-    errors_ = lines_of(g_subprocess_get_stderr_pipe(process_.get()));
-}
+Program::Program(const std::vector<std::string> &arguments, Environment environment)
+    : Process{::test::program("ims-sim", arguments),
+              (environment.emplace("G_DEBUG", "fatal-warnings"), environment),
+              {.has_input = true}} {}
 
-Program::~Program() {
-    if (g_subprocess_get_identifier(process_.get())) {
-        g_subprocess_force_exit(process_.get());
-        g_subprocess_wait(process_.get(), nullptr, nullptr);
-    }
-}
-
-pid_t Program::pid() const {
-    const char *text = g_subprocess_get_identifier(process_.get());
-    return text ? std::atoi(text) : -1;
-}
-
-void Program::signal(int number) const {
-    g_subprocess_send_signal(process_.get(), number);
-}
-
-std::string Program::read_line() {
-    const auto line = next_line(output_.get());
-    EXPECT_TRUE(line) << "no more output";
-    return line.value_or("");
-}
-
-std::string Program::read_errors(const std::string &until) {
-    std::string text;
-    while (const auto line = next_line(errors_.get())) {
-        text += *line + "\n";
-        if (!until.empty() && line->find(until) != std::string::npos)
-            return text;
-    }
-    EXPECT_TRUE(until.empty()) << "\"" << until << "\" does not come; what came is\n" << text;
-    return text;
-}
-
-void Program::close_input() {
-    g_output_stream_close(g_subprocess_get_stdin_pipe(process_.get()), nullptr, nullptr);
-}
-
-int Program::wait() {
-    g_subprocess_wait(process_.get(), nullptr, nullptr);
-    return g_subprocess_get_if_exited(process_.get())
-               ? g_subprocess_get_exit_status(process_.get())
-               : 128 + g_subprocess_get_term_sig(process_.get());
-}
-
-Client::Client(const std::string &address) {
-    ErrorSlot error;
-    connection_.reset(g_dbus_connection_new_for_address_sync(
-        address.c_str(),
-        static_cast<GDBusConnectionFlags>(G_DBUS_CONNECTION_FLAGS_AUTHENTICATION_CLIENT |
-                                          G_DBUS_CONNECTION_FLAGS_MESSAGE_BUS_CONNECTION),
-        nullptr, nullptr, &error.raw));
-    if (!connection_)
-        give_up("cannot connect to {}: {}", address, error.message());
-    subscriptions_[0] = g_dbus_connection_signal_subscribe(
-        connection_.get(), kServiceName, nullptr, nullptr, nullptr, nullptr,
-        G_DBUS_SIGNAL_FLAGS_NONE,
+Client::Client(const std::string &address) : bus_{address} {
+    subscription_ = g_dbus_connection_signal_subscribe(
+        connection(), kServiceName, nullptr, nullptr, nullptr, nullptr, G_DBUS_SIGNAL_FLAGS_NONE,
         [](GDBusConnection *, const gchar *, const gchar *path, const gchar *, const gchar *member,
            GVariant *body, gpointer self) {
             const GText text(g_variant_print(body, FALSE));
@@ -121,31 +38,12 @@ Client::Client(const std::string &address) {
                 fmt::format("{} {} {}", object.substr(object.rfind('/') + 1), member, text.get()));
         },
         this, nullptr);
-    // Heard only so that waiting for a name wakes up.
-    subscriptions_[1] = g_dbus_connection_signal_subscribe(
-        connection_.get(), "org.freedesktop.DBus", "org.freedesktop.DBus", "NameOwnerChanged",
-        nullptr, nullptr, G_DBUS_SIGNAL_FLAGS_NONE,
-        [](GDBusConnection *, const gchar *, const gchar *, const gchar *, const gchar *,
-           GVariant *, gpointer) {},
-        nullptr, nullptr);
-    // The bus has to know of the subscriptions before anybody says what is to be heard: to ask for
-    // them waits for nothing.
-    has_owner(kServiceName);
+    // The bus has to know of the subscription before anybody says what is to be heard.
+    bus_.settle();
 }
 
 Client::~Client() {
-    for (const guint subscription : subscriptions_)
-        g_dbus_connection_signal_unsubscribe(connection_.get(), subscription);
-    close();
-}
-
-void Client::close() {
-    if (!g_dbus_connection_is_closed(connection_.get()))
-        g_dbus_connection_close_sync(connection_.get(), nullptr, nullptr);
-}
-
-std::string Client::unique_name() const {
-    return g_dbus_connection_get_unique_name(connection_.get());
+    g_dbus_connection_signal_unsubscribe(connection(), subscription_);
 }
 
 Reply Client::call(int slot, const char *interface, const char *method,
@@ -166,8 +64,8 @@ Reply Client::call(const std::string &path, const char *interface, const char *m
     g_dbus_message_set_body(message.get(), body.get());
     ErrorSlot error;
     const GObjectPtr<GDBusMessage> answer(g_dbus_connection_send_message_with_reply_sync(
-        connection_.get(), message.get(), G_DBUS_SEND_MESSAGE_FLAGS_NONE, kPatienceMilliseconds,
-        nullptr, nullptr, &error.raw));
+        connection(), message.get(), G_DBUS_SEND_MESSAGE_FLAGS_NONE, kPatienceMilliseconds, nullptr,
+        nullptr, &error.raw));
     if (!answer) {
         ADD_FAILURE() << method << ": " << error.message();
         return {};
@@ -197,30 +95,12 @@ int Client::register_application(int slot) {
     return id;
 }
 
-void Client::iterate(const std::string &awaited) {
-    bool late = false;
-    GSource *limit = g_timeout_source_new(kPatienceMilliseconds);
-    g_source_set_callback(
-        limit,
-        [](gpointer data) -> gboolean {
-            *static_cast<bool *>(data) = true;
-            return G_SOURCE_REMOVE;
-        },
-        &late, nullptr);
-    g_source_attach(limit, nullptr);
-    const GSourceGuard guard(limit);
-    g_main_context_iteration(nullptr, TRUE);
-    if (late)
-        give_up("waited in vain for {}", awaited);
-}
-
 std::string Client::next_signal() {
     return next_signal("any signal");
 }
 
 std::string Client::next_signal(const std::string &awaited) {
-    while (signals_.empty())
-        iterate(awaited);
+    ::test::pump_until([this] { return !signals_.empty(); }, awaited);
     std::string signal = signals_.front();
     signals_.pop_front();
     return signal;
@@ -235,30 +115,7 @@ std::string Client::wait_for(int slot, const std::string &member) {
     }
 }
 
-void Client::wait_until_gone(const std::string &name) {
-    while (has_owner(name))
-        iterate(name + " to leave the bus");
-}
-
-void Client::wait_until_owned(const std::string &name) {
-    while (!has_owner(name))
-        iterate(name + " to come to the bus");
-}
-
-bool Client::has_owner(const std::string &name) {
-    const auto reply = Variant::adopt(g_dbus_connection_call_sync(
-        connection_.get(), "org.freedesktop.DBus", "/org/freedesktop/DBus", "org.freedesktop.DBus",
-        "NameHasOwner", g_variant_new("(s)", name.c_str()), G_VARIANT_TYPE("(b)"),
-        G_DBUS_CALL_FLAGS_NONE, -1, nullptr, nullptr));
-    gboolean owned = FALSE;
-    if (reply)
-        g_variant_get(reply.get(), "(b)", &owned);
-    return owned != FALSE;
-}
-
 Served::Served(std::vector<std::string> options) {
-    if (const auto error = bus_.start())
-        give_up("{}", *error);
     options.insert(options.begin(), {"serve", "--verbose", "--address", bus_.address()});
     client_ = std::make_unique<Client>(bus_.address());
     program_ = std::make_unique<Program>(options);
@@ -269,7 +126,7 @@ Served::Served(std::vector<std::string> options) {
 }
 
 Served::~Served() {
-    program_->signal(SIGTERM);
+    program_->send_signal(SIGTERM);
     EXPECT_EQ(program_->wait(), 0) << program_->read_errors();
 }
 

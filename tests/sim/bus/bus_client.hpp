@@ -2,9 +2,9 @@
 #pragma once
 
 #include "sim/base/glib_ref.hpp"
-#include "sim/base/private_bus.hpp"
+#include "tests/support/bus_client.hpp"
+#include "tests/support/private_bus.hpp"
 
-#include <array>
 #include <deque>
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
@@ -27,29 +27,11 @@ constexpr const char *kServiceName = "org.kelvo.ims";
 
 std::string slot_path(int slot);
 
-// ims-sim as a process of its own. What it says on standard error is kept; a warning or critical
-// of GLib aborts it.
-class Program {
-  public:
-    using Environment = std::vector<std::pair<std::string, std::string>>;
-    explicit Program(const std::vector<std::string> &arguments,
-                     const Environment &environment = {});
-    ~Program();
+using ::test::PrivateBus;
 
-    pid_t pid() const;
-    void signal(int number) const;
-    // The next line of its output, without the line end.
-    std::string read_line();
-    // Lines of standard error up to one with this text, that one included. Without it, all.
-    std::string read_errors(const std::string &until = {});
-    void close_input();
-    // 128 + N when a signal ended it.
-    int wait();
-
-  private:
-    GObjectPtr<GSubprocess> process_;
-    GObjectPtr<GDataInputStream> output_;
-    GObjectPtr<GDataInputStream> errors_;
+// ims-sim as a process of its own. A warning or critical of GLib aborts it.
+struct Program : ::test::Process {
+    explicit Program(const std::vector<std::string> &arguments, Environment environment = {});
 };
 
 struct Reply {
@@ -77,22 +59,19 @@ class Client {
     std::string next_signal();
     // Takes signals up to the one with this member on this slot.
     std::string wait_for(int slot, const std::string &member);
-    // Until this connection has left the bus.
-    void wait_until_gone(const std::string &name);
-    void wait_until_owned(const std::string &name);
+    void wait_until_gone(const std::string &name) { bus_.wait_until_gone(name); }
+    void wait_until_owned(const std::string &name) { bus_.wait_until_owned(name); }
 
-    std::string unique_name() const;
-    GDBusConnection *connection() const { return connection_.get(); }
-    void close();
+    std::string unique_name() const { return bus_.unique_name(); }
+    GDBusConnection *connection() const { return bus_.connection(); }
+    void close() { bus_.close(); }
 
   private:
-    bool has_owner(const std::string &name);
     std::string next_signal(const std::string &awaited);
-    void iterate(const std::string &awaited);
 
-    GObjectPtr<GDBusConnection> connection_;
+    ::test::BusClient bus_;
     std::deque<std::string> signals_;
-    std::array<guint, 2> subscriptions_{};
+    guint subscription_ = 0;
 };
 
 // `ims-sim serve` with two slots, both registered, on a bus of its own, with one client that knows

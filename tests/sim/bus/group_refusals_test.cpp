@@ -116,7 +116,7 @@ TEST_F(XdmBus, WhatCannotBeKeptIsRefused) {
 
 TEST_F(XdmBus, ADamagedFileKeepsTheProgramFromStarting) {
     ASSERT_EQ(create(sample_group()), "(0,)");
-    program_->signal(SIGTERM);
+    program_->send_signal(SIGTERM);
     program_->wait();
     const auto path = directory_.file("groups.json");
     const auto whole = content_of(path);

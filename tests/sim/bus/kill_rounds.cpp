@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "tests/sim/bus/kill_rounds.hpp"
 
+#include "tests/support/pump.hpp"
+
 #include <csignal>
 #include <poll.h>
 #include <sys/inotify.h>
@@ -80,17 +82,11 @@ struct Stream {
 
     // Until every one is answered, by the program or by the bus.
     void settle() const {
-        while (open > 0)
-            g_main_context_iteration(nullptr, TRUE);
+        ::test::pump_until([this] { return open == 0; }, "the answers to all changes");
     }
 };
 
 } // namespace
-
-void KillTest::SetUp() {
-    ASSERT_EQ(bus_.start(), std::nullopt);
-    client_ = std::make_unique<Client>(bus_.address());
-}
 
 std::unique_ptr<Program> KillTest::start() {
     auto program = std::make_unique<Program>(std::vector<std::string>{
@@ -113,7 +109,7 @@ void KillTest::kill_while_keeping(const KeptNumber &kept, int rounds) {
         stream.send(*client_);
         stream.settle();
         ASSERT_EQ(stream.last_acknowledged, 1);
-        program->signal(SIGKILL);
+        program->send_signal(SIGKILL);
         program->wait();
         client_->wait_until_gone(kServiceName);
     }
@@ -128,7 +124,7 @@ void KillTest::kill_while_keeping(const KeptNumber &kept, int rounds) {
         for (int i = 0; i < kUpdatesARound; ++i)
             stream.send(*client_);
         watch.wait_for(kMoments[round % std::size(kMoments)], 1 + round % 5);
-        program->signal(SIGKILL);
+        program->send_signal(SIGKILL);
         EXPECT_EQ(program->wait(), 128 + SIGKILL);
         stream.settle();
         client_->wait_until_gone(kServiceName);

@@ -25,15 +25,13 @@ struct KeptNumber {
 
 class KillTest : public testing::Test {
   protected:
-    void SetUp() override;
-
     std::unique_ptr<Program> start();
     // Kills the program again and again while it keeps numbers.
     void kill_while_keeping(const KeptNumber &kept, int rounds);
 
     TemporaryDirectory directory_;
     PrivateBus bus_;
-    std::unique_ptr<Client> client_;
+    std::unique_ptr<Client> client_ = std::make_unique<Client>(bus_.address());
 
   private:
     int stored(const KeptNumber &kept);

@@ -44,7 +44,7 @@ TEST_F(KillTest, NoAcknowledgedChangeOfGroupsIsLost) {
         const auto program = start();
         ASSERT_EQ(client_->call(0, kXdm, "XdmCreateGroup", "({'group_uri': <'sip:g@x'>},)").body,
                   "(0,)");
-        program->signal(SIGKILL);
+        program->send_signal(SIGKILL);
         program->wait();
         client_->wait_until_gone(kServiceName);
     }

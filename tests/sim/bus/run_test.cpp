@@ -135,14 +135,14 @@ TEST_F(Running, LeavesNothingBehind) {
 }
 
 TEST_F(Running, PassesSignalsOn) {
-    program_.signal(SIGTERM);
+    program_.send_signal(SIGTERM);
     EXPECT_EQ(program_.wait(), 128 + SIGTERM);
     EXPECT_FALSE(exists(daemon_));
     EXPECT_FALSE(exists(command_));
 }
 
 TEST_F(Running, LeavesNothingBehindWhenItIsKilled) {
-    program_.signal(SIGKILL);
+    program_.send_signal(SIGKILL);
     EXPECT_EQ(program_.wait(), 128 + SIGKILL);
     wait_for_end(daemon_);
     wait_for_end(command_);
@@ -161,7 +161,7 @@ TEST(Run, TheCommandDecidesWhatASignalMeans) {
         Program program({"run", "--", "sh", "-c",
                          fmt::format("trap 'exit 42' {}; sleep 1000 & echo $!; wait", name)});
         const pid_t left_over = std::stoi(program.read_line());
-        program.signal(number);
+        program.send_signal(number);
         EXPECT_EQ(program.wait(), 42) << name;
         EXPECT_FALSE(exists(left_over));
     }
@@ -173,7 +173,7 @@ TEST(Run, EndsWhatTheCommandLeftRunning) {
          "sh -c 'trap \"\" TERM; echo $$; exec sleep 1000' & sleep 1000 & echo $!; wait %2"});
     const pid_t one = std::stoi(program.read_line());
     const pid_t other = std::stoi(program.read_line());
-    program.signal(SIGTERM);
+    program.send_signal(SIGTERM);
     EXPECT_EQ(program.wait(), 128 + SIGTERM);
     EXPECT_FALSE(exists(one));
     EXPECT_FALSE(exists(other));
@@ -274,7 +274,6 @@ TEST(Serve, SaysWhenThereIsNoBus) {
 
 TEST(Serve, SaysWhenTheNameIsTaken) {
     PrivateBus bus;
-    ASSERT_EQ(bus.start(), std::nullopt);
     Client client(bus.address());
     Program first({"serve", "--address", bus.address()});
     client.wait_until_owned(kServiceName);
@@ -285,14 +284,13 @@ TEST(Serve, SaysWhenTheNameIsTaken) {
 
 TEST(Serve, EndsOnRequest) {
     PrivateBus bus;
-    ASSERT_EQ(bus.start(), std::nullopt);
     for (const int number : {SIGINT, SIGTERM, SIGHUP}) {
         Program program({"serve"}, {{"DBUS_SYSTEM_BUS_ADDRESS", bus.address()}});
         EXPECT_THAT(program.read_errors("is ready"),
                     HasSubstr("/org/kelvo/ims/sub1 has the number +15550101"));
         Client client(bus.address());
         client.wait_until_owned(kServiceName);
-        program.signal(number);
+        program.send_signal(number);
         EXPECT_EQ(program.wait(), 0);
         client.wait_until_gone(kServiceName);
     }
@@ -300,7 +298,6 @@ TEST(Serve, EndsOnRequest) {
 
 TEST(Serve, EndsWithAFailureWhenItsBusGoes) {
     auto bus = std::make_unique<PrivateBus>();
-    ASSERT_EQ(bus->start(), std::nullopt);
     Program program({"serve", "--address", bus->address()});
     program.read_errors("is ready");
     bus.reset();

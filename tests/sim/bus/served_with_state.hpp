@@ -22,7 +22,7 @@ class ServedWithState : StateDirectory, public Served {
         return {"serve", "--address", bus_.address(), "--state", directory_.path()};
     }
     void restart(int signal) {
-        program_->signal(signal);
+        program_->send_signal(signal);
         program_->wait();
         client_->wait_until_gone(kServiceName);
         program_ = std::make_unique<Program>(arguments());
