@@ -3,7 +3,6 @@
 
 #include "sim/call/signals.hpp"
 #include "sim/group/store.hpp"
-#include "sim/ptt/participants.hpp"
 #include "sim/ptt/signals.hpp"
 #include "sim/settings/store.hpp"
 
@@ -24,42 +23,26 @@ auto sink_of(Service &service) {
 } // namespace
 
 StandIn::StandIn(const Options &options, const Log &log, MainLoop &loop)
-    : log_(log), plan_(options.numbers), timers_(options.speed, &MainLoop::now),
-      service_(bus_, log_, applications_, plan_.slots()),
-      registrations_(plan_.slots(), timers_, sink_of<RegistrationInterface>(service_)),
-      services_(plan_, registrations_),
-      calls_(plan_, timers_, registrations_, services_,
-             std::chrono::duration_cast<std::chrono::nanoseconds>(options.ring_time),
-             [this](int slot, const CallEvent &event) {
-                 sink_of<CallInterface>(service_)(slot, event);
-                 video_.hear(slot, event);
-             }),
-      video_(calls_, plan_.slots()),
-      ussd_(plan_, timers_, registrations_, sink_of<CallInterface>(service_)),
-      logins_(plan_.slots(), timers_, registrations_, sink_of<LoginInterface>(service_)),
-      centre_(plan_, timers_, registrations_, std::time(nullptr), sink_of<SmsInterface>(service_)),
-      ptt_directory_(plan_), ptt_calls_(ptt_directory_, timers_, registrations_,
-                                        [this](int slot, const PttEvent &event) {
-                                            ptt_recorder_.hear(slot, event);
-                                            sink_of<PttInterface>(service_)(slot, event);
-                                        }),
-      ptt_recorder_(ptt_calls_, timers_),
-      ptt_messages_(ptt_directory_, ptt_calls_, timers_, registrations_,
-                    sink_of<PttInterface>(service_)),
-      ptt_files_(ptt_directory_, ptt_calls_, timers_, registrations_,
-                 sink_of<PttInterface>(service_)),
-      settings_(plan_.slots()), registration_interface_(applications_, registrations_),
-      login_interface_(logins_), call_interface_(calls_, ussd_), sms_interface_(centre_),
-      ss_interface_(services_), settings_interface_(settings_), vt_interface_(video_),
-      ptt_interface_(ptt_calls_, ptt_recorder_, ptt_messages_, ptt_files_),
-      group_interface_(groups_, plan_, registrations_, [this](int slot) {
-          std::vector<ParticipantInfo> sessions;
-          for (const PttRunningCall &call : ptt_calls_.running(slot))
-              sessions.push_back(participant_info(call));
-          return sessions;
-      }) {
-    ptt_directory_.add_groups(
-        [this](std::string_view uri) { return groups_.participants_of(uri); });
+    : log_(log), timers_(options.speed, &MainLoop::now),
+      service_(bus_, log_, applications_, static_cast<int>(options.numbers.size())),
+      network_(
+          {.numbers = options.numbers,
+           .ring_time = std::chrono::duration_cast<std::chrono::nanoseconds>(options.ring_time),
+           .epoch = std::time(nullptr)},
+          timers_,
+          {.registration = sink_of<RegistrationInterface>(service_),
+           .login = sink_of<LoginInterface>(service_),
+           .call = sink_of<CallInterface>(service_),
+           .sms = sink_of<SmsInterface>(service_),
+           .ptt = sink_of<PttInterface>(service_)}),
+      registration_interface_(applications_, network_.registrations),
+      login_interface_(network_.logins), call_interface_(network_.calls, network_.ussd),
+      sms_interface_(network_.centre), ss_interface_(network_.services),
+      settings_interface_(network_.settings), vt_interface_(network_.video),
+      ptt_interface_(network_.ptt, network_.ptt_recorder, network_.ptt_messages,
+                     network_.ptt_files),
+      group_interface_(network_.groups, network_.plan, network_.registrations,
+                       [this](int slot) { return network_.running_sessions(slot); }) {
     loop.drive(timers_);
     service_.add(registration_interface_.describe());
     service_.add(login_interface_.describe());
@@ -78,9 +61,9 @@ std::optional<std::string> StandIn::restore(const std::string &state_directory) 
     const auto store = Store::open(state_directory);
     if (!store)
         return store.refusal().reason;
-    if (auto error = keep_settings(*store, settings_))
+    if (auto error = keep_settings(*store, network_.settings))
         return error;
-    return keep_groups(*store, groups_);
+    return keep_groups(*store, network_.groups);
 }
 
 std::optional<std::string> StandIn::start(const std::string &address,
@@ -98,7 +81,7 @@ std::optional<std::string> StandIn::start(const std::string &address,
                  .lost = std::move(lost)});
     if (auto error = bus_.own_name(std::string(Service::kName)))
         return error;
-    registrations_.start();
+    network_.registrations.start();
     return std::nullopt;
 }
 

@@ -4,14 +4,12 @@
 #include "sim/base/clock.hpp"
 #include "sim/base/log.hpp"
 #include "sim/base/main_loop.hpp"
-#include "sim/base/number_plan.hpp"
 #include "sim/bus/applications.hpp"
 #include "sim/bus/bus.hpp"
 #include "sim/bus/service.hpp"
 #include "sim/call/interface.hpp"
-#include "sim/call/model.hpp"
-#include "sim/call/ussd.hpp"
 #include "sim/group/interface.hpp"
+#include "sim/network.hpp"
 #include "sim/options.hpp"
 #include "sim/ptt/interface.hpp"
 #include "sim/registration/interface.hpp"
@@ -20,7 +18,6 @@
 #include "sim/sms/interface.hpp"
 #include "sim/ss/interface.hpp"
 #include "sim/vt/interface.hpp"
-#include "sim/vt/model.hpp"
 
 #include <functional>
 #include <optional>
@@ -28,7 +25,7 @@
 
 namespace sim {
 
-// The whole service: the network, its models and their interfaces on one bus.
+// The whole service: the network and its interfaces on one bus.
 class StandIn {
   public:
     StandIn(const Options &options, const Log &log, MainLoop &loop);
@@ -44,26 +41,11 @@ class StandIn {
 
   private:
     const Log &log_;
-    NumberPlan plan_;
     Timers timers_;
     Bus bus_;
     Applications applications_;
     Service service_;
-    // In flight mode a slot loses what these hold in this order.
-    Registrations registrations_;
-    SupplementaryServices services_;
-    CallModel calls_;
-    VideoTelephony video_;
-    UssdService ussd_;
-    Logins logins_;
-    ServiceCentre centre_;
-    PttDirectory ptt_directory_;
-    PttCalls ptt_calls_;
-    PttRecorder ptt_recorder_;
-    PttMessages ptt_messages_;
-    PttFiles ptt_files_;
-    SettingsModel settings_;
-    GroupModel groups_;
+    Network network_;
     RegistrationInterface registration_interface_;
     LoginInterface login_interface_;
     CallInterface call_interface_;

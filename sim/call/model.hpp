@@ -64,6 +64,8 @@ class CallModel {
     // A party of the network calls a slot. Refused when the slot cannot ring.
     Answer<int> call_from_network(int slot, std::string_view number, CallType type);
     std::vector<CallInfo> list(int slot) const;
+    // The radio is off.
+    void drop_calls(int slot);
 
     // Hold
     Status hold(int slot, int id);
@@ -171,7 +173,6 @@ class CallModel {
     void forward(Session &caller, const std::string &target);
     void divert(SessionRef ringing, EndReason here, const std::string &target);
     void give_up_ringing(SessionRef ref);
-    void drop_calls(int slot);
 
     void set_hold(Session &session, bool held);
     void tell_hold(Session &session, bool held, bool here);

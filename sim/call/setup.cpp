@@ -25,9 +25,7 @@ CallModel::CallModel(const NumberPlan &plan, Timers &timers, Registrations &regi
                      const SupplementaryServices &services, std::chrono::nanoseconds ring_time,
                      Sink sink)
     : plan_(plan), timers_(timers), registrations_(registrations), services_(services),
-      ring_time_(ring_time), sink_(std::move(sink)), lines_(plan.slots()) {
-    registrations.when_lost([this](int slot) { drop_calls(slot); });
-}
+      ring_time_(ring_time), sink_(std::move(sink)), lines_(plan.slots()) {}
 
 Session *CallModel::find(SessionRef ref) {
     auto &sessions = lines_[ref.slot].sessions;

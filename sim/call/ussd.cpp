@@ -35,14 +35,14 @@ bool is_code(std::string_view text) {
 
 } // namespace
 
-UssdService::UssdService(const NumberPlan &plan, Timers &timers, Registrations &registrations,
+UssdService::UssdService(const NumberPlan &plan, Timers &timers, const Registrations &registrations,
                          Sink sink)
     : plan_(plan), timers_(timers), registrations_(registrations), sink_(std::move(sink)),
-      dialogues_(plan.slots()) {
-    registrations.when_lost([this](int slot) {
-        if (dialogues_[slot].state != State::kIdle)
-            release(slot, "Flight mode");
-    });
+      dialogues_(plan.slots()) {}
+
+void UssdService::drop_dialogue(int slot) {
+    if (dialogues_[slot].state != State::kIdle)
+        release(slot, "Flight mode");
 }
 
 Status UssdService::send(int slot, UssdRequest type, int coding_scheme, const std::string &text) {

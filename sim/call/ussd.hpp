@@ -18,9 +18,12 @@ class UssdService {
   public:
     using Sink = std::function<void(int slot, const CallEvent &event)>;
 
-    UssdService(const NumberPlan &plan, Timers &timers, Registrations &registrations, Sink sink);
+    UssdService(const NumberPlan &plan, Timers &timers, const Registrations &registrations,
+                Sink sink);
 
     Status send(int slot, UssdRequest type, int coding_scheme, const std::string &text);
+    // The radio is off.
+    void drop_dialogue(int slot);
 
   private:
     enum class State { kIdle, kNetworkAnswers, kUserAnswers };

@@ -29,11 +29,9 @@ Part part_of(const PttFileAttributes &attributes) {
 } // namespace
 
 PttFiles::PttFiles(const PttDirectory &directory, PttCalls &calls, Timers &timers,
-                   Registrations &registrations, PttCalls::Sink sink)
+                   const Registrations &registrations, PttCalls::Sink sink)
     : directory_(directory), calls_(calls), timers_(timers), registrations_(registrations),
-      sink_(std::move(sink)), next_number_(directory.slots(), 1) {
-    registrations.when_lost([this](int slot) { drop(slot); });
-}
+      sink_(std::move(sink)), next_number_(directory.slots(), 1) {}
 
 std::int32_t PttFiles::Transfer::bytes() const {
     const Part part = part_of(attributes);
@@ -237,7 +235,7 @@ void PttFiles::finish(LegRef ref, PttFileEnd to_sender, PttFileEnd to_receiver) 
         transfers_.erase(ref.transfer);
 }
 
-void PttFiles::drop(int slot) {
+void PttFiles::drop_transfers(int slot) {
     std::vector<LegRef> lost;
     for (const auto &[id, transfer] : transfers_)
         for (const auto &[party, leg] : transfer.legs)

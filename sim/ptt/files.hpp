@@ -35,7 +35,7 @@ struct PttFileReceipt {
 class PttFiles {
   public:
     PttFiles(const PttDirectory &directory, PttCalls &calls, Timers &timers,
-             Registrations &registrations, PttCalls::Sink sink);
+             const Registrations &registrations, PttCalls::Sink sink);
 
     // To how many parties it goes.
     Answer<PttFileReceipt> offer(int slot, PttFileOffer offer);
@@ -44,6 +44,8 @@ class PttFiles {
     Answer<PttFileReceipt> reject(int slot, std::int32_t session, const std::string &transfer_id);
     // How many parties it went to.
     Answer<PttFileReceipt> cancel(int slot, std::int32_t number);
+    // The radio is off.
+    void drop_transfers(int slot);
 
   private:
     // The way of a file to one party.
@@ -78,7 +80,6 @@ class PttFiles {
     void run(LegRef ref);
     void step(LegRef ref);
     void finish(LegRef ref, PttFileEnd to_sender, PttFileEnd to_receiver);
-    void drop(int slot);
 
     const PttDirectory &directory_;
     PttCalls &calls_;

@@ -8,14 +8,14 @@
 
 namespace sim {
 
-PttCalls::PttCalls(const PttDirectory &directory, Timers &timers, Registrations &registrations,
-                   Sink sink)
+PttCalls::PttCalls(const PttDirectory &directory, Timers &timers,
+                   const Registrations &registrations, Sink sink)
     : directory_(directory), timers_(timers), registrations_(registrations), sink_(std::move(sink)),
-      lines_(directory.slots()) {
-    registrations.when_lost([this](int slot) {
-        leave_all(slot, PttEndReason::kEndedHere);
-        lines_[slot].keep_alive.cancel();
-    });
+      lines_(directory.slots()) {}
+
+void PttCalls::drop_calls(int slot) {
+    leave_all(slot, PttEndReason::kEndedHere);
+    lines_[slot].keep_alive.cancel();
 }
 
 PttCall *PttCalls::find(int call) {

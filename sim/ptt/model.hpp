@@ -95,7 +95,7 @@ class PttCalls {
   public:
     using Sink = std::function<void(int slot, const PttEvent &event)>;
 
-    PttCalls(const PttDirectory &directory, Timers &timers, Registrations &registrations,
+    PttCalls(const PttDirectory &directory, Timers &timers, const Registrations &registrations,
              Sink sink);
 
     // Setting up and ending
@@ -107,6 +107,8 @@ class PttCalls {
     Status set_channel(int slot, std::int32_t channel, PttChannelMode mode);
     Status keep_alive(int slot, std::int32_t seconds);
     std::vector<PttRunningCall> running(int slot) const;
+    // The radio is off.
+    void drop_calls(int slot);
 
     // Ad hoc groups
     Answer<std::int32_t> make_ad_hoc_call(int slot, const PttAdHocRequest &request);

@@ -19,10 +19,8 @@ std::optional<Refusal> no_such_kind(LoginKind kind) {
 
 } // namespace
 
-Logins::Logins(int slots, Timers &timers, Registrations &registrations, Sink sink)
-    : timers_(timers), registrations_(registrations), sink_(std::move(sink)), slots_(slots) {
-    registrations.when_lost([this](int slot) { leave_all(slot, LoginReason::kFlightMode); });
-}
+Logins::Logins(int slots, Timers &timers, const Registrations &registrations, Sink sink)
+    : timers_(timers), registrations_(registrations), sink_(std::move(sink)), slots_(slots) {}
 
 Logins::Login &Logins::at(int slot, LoginKind kind) {
     return slots_[slot].logins[static_cast<std::size_t>(kind)];

@@ -31,10 +31,12 @@ class Logins {
   public:
     using Sink = std::function<void(int slot, const LoginState &event)>;
 
-    Logins(int slots, Timers &timers, Registrations &registrations, Sink sink);
+    Logins(int slots, Timers &timers, const Registrations &registrations, Sink sink);
 
     Status login(int slot, std::string_view user, std::string_view password, LoginKind kind);
     Status logout(int slot);
+    // The radio is off.
+    void log_out(int slot) { leave_all(slot, LoginReason::kFlightMode); }
     Answer<LoginState> state(int slot, LoginKind kind) const;
 
   private:

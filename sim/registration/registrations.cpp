@@ -53,8 +53,8 @@ Status Registrations::enable_flight_mode(int slot) {
     const bool announced = registered(slot);
     slots_[slot].timer.cancel();
     slots_[slot].state = State::kFlightMode;
-    for (const auto &listener : lost_)
-        listener(slot);
+    if (lost_)
+        lost_(slot);
     if (emergency_bearer(slot))
         set_bearer(slot, false, RegistrationReason::kFlightMode);
     if (announced)
@@ -75,8 +75,8 @@ void Registrations::begin(int slot) {
 void Registrations::complete(int slot) {
     slots_[slot].state = State::kRegistered;
     sink_(slot, info(slot));
-    for (const auto &listener : registered_)
-        listener(slot);
+    if (registered_)
+        registered_(slot);
 }
 
 void Registrations::set_bearer(int slot, bool registered, RegistrationReason reason) {

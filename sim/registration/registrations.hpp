@@ -8,8 +8,8 @@
 #include <cstdint>
 #include <functional>
 #include <optional>
+#include <utility>
 #include <variant>
-#include <vector>
 
 namespace sim {
 
@@ -60,10 +60,9 @@ class Registrations {
         set_bearer(slot, registered, RegistrationReason::kNone);
     }
 
-    // Called in the order in which they were added: before the loss is announced, and after the
-    // registration has been.
-    void when_lost(Listener listener) { lost_.push_back(std::move(listener)); }
-    void when_registered(Listener listener) { registered_.push_back(std::move(listener)); }
+    // Called before the loss is announced, and after the registration has been.
+    void when_lost(Listener listener) { lost_ = std::move(listener); }
+    void when_registered(Listener listener) { registered_ = std::move(listener); }
 
   private:
     enum class State { kRegistering, kRegistered, kFlightMode };
@@ -80,8 +79,8 @@ class Registrations {
     Timers &timers_;
     Sink sink_;
     PerSlot<Slot> slots_;
-    std::vector<Listener> lost_;
-    std::vector<Listener> registered_;
+    Listener lost_;
+    Listener registered_;
 };
 
 } // namespace sim

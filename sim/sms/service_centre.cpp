@@ -54,13 +54,10 @@ bool single_shot(const tpdu::Validity &validity) {
 
 } // namespace
 
-ServiceCentre::ServiceCentre(const NumberPlan &plan, Timers &timers, Registrations &registrations,
-                             std::int64_t epoch, Sink sink)
+ServiceCentre::ServiceCentre(const NumberPlan &plan, Timers &timers,
+                             const Registrations &registrations, std::int64_t epoch, Sink sink)
     : plan_(plan), timers_(timers), registrations_(registrations), epoch_(epoch),
-      sink_(std::move(sink)), boxes_(plan.slots()), errands_(timers) {
-    registrations.when_lost([this](int slot) { take_back(slot); });
-    registrations.when_registered([this](int slot) { deliver_stored(slot); });
-}
+      sink_(std::move(sink)), boxes_(plan.slots()), errands_(timers) {}
 
 std::int64_t ServiceCentre::now_in_seconds() const {
     // The end of what a TPDU can say; a network that is fast enough gets there.

@@ -76,7 +76,7 @@ class ServiceCentre {
     using Sink = std::function<void(int slot, const MessageEvent &event)>;
 
     // `epoch`: the time of day, in seconds since 1970, when the timers' network time was 0.
-    ServiceCentre(const NumberPlan &plan, Timers &timers, Registrations &registrations,
+    ServiceCentre(const NumberPlan &plan, Timers &timers, const Registrations &registrations,
                   std::int64_t epoch, Sink sink);
 
     Answer<SubmitReceipt> submit(int slot, const SubmitRequest &request);
@@ -84,6 +84,10 @@ class ServiceCentre {
     Answer<std::int32_t> report(int slot, const ReportRequest &request);
     // A party of the network writes to a slot.
     void send_from_network(int slot, tpdu::Deliver message);
+
+    // The slot has registered, or its radio is off.
+    void deliver_stored(int slot);
+    void take_back(int slot);
 
   private:
     using Id = std::uint64_t;
@@ -134,8 +138,6 @@ class ServiceCentre {
 
     void post(int slot, Mail mail);
     void deliver(int slot, Mail mail);
-    void deliver_stored(int slot);
-    void take_back(int slot);
 
     const NumberPlan &plan_;
     Timers &timers_;

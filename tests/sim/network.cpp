@@ -4,6 +4,7 @@
 #include "tests/sim/bus/contract_signals.hpp"
 
 #include "sim/call/signals.hpp"
+#include "sim/ptt/signals.hpp"
 #include "sim/registration/interface.hpp"
 #include "sim/registration/login_interface.hpp"
 #include "sim/sms/interface.hpp"
@@ -12,37 +13,40 @@
 
 namespace sim::test {
 
-Network::Network()
-    : plan_({"+15550100", "+15550101", "+15550102", "+15550103"}),
-      timers_(1, [this] { return now_; }),
-      registrations_(4, timers_,
-                     [this](int slot, const RegistrationEvent &event) { record(slot, event); }),
-      services_(plan_, registrations_), calls_(plan_, timers_, registrations_, services_, 60s,
-                                               [this](int slot, const CallEvent &event) {
-                                                   record(slot, event);
-                                                   video_.hear(slot, event);
-                                               }),
-      video_(calls_, 4), ussd_(plan_, timers_, registrations_,
-                               [this](int slot, const CallEvent &event) { record(slot, event); }),
-      logins_(4, timers_, registrations_,
-              [this](int slot, const LoginState &event) { record(slot, event); }),
-      centre_(plan_, timers_, registrations_, kEpoch, [this](int slot, const MessageEvent &event) {
-          record(slot, event);
-          messages_[slot].push_back(event);
-      }) {
+namespace {
+
+// Events become signals.
+auto recorder(std::map<int, std::vector<std::string>> &events) {
+    return [&events](int slot, const auto &event) {
+        const Signal signal = to_signal(event);
+        expect_as_in_contract(signal);
+        events[slot].push_back(std::string(signal.member) + " " + signal.body.print());
+    };
+}
+
+} // namespace
+
+NetworkTest::NetworkTest()
+    : timers_(1, [this] { return now_; }),
+      network_({.numbers = {"+15550100", "+15550101", "+15550102", "+15550103"},
+                .ring_time = 60s,
+                .epoch = kEpoch},
+               timers_,
+               {.registration = recorder(events_),
+                .login = recorder(events_),
+                .call = recorder(events_),
+                .sms =
+                    [this, record = recorder(events_)](int slot, const MessageEvent &event) {
+                        record(slot, event);
+                        messages_[slot].push_back(event);
+                    },
+                .ptt = recorder(events_)}) {
     registrations_.start();
     advance(300ms);
     forget_events();
 }
 
-template <typename Event>
-void Network::record(int slot, const Event &event) {
-    const Signal signal = to_signal(event);
-    expect_as_in_contract(signal);
-    events_[slot].push_back(std::string(signal.member) + " " + signal.body.print());
-}
-
-void Network::advance(std::chrono::nanoseconds by) {
+void NetworkTest::advance(std::chrono::nanoseconds by) {
     const auto until = now_ + by;
     while (const auto due = timers_.next_due()) {
         if (*due > until)
@@ -53,22 +57,22 @@ void Network::advance(std::chrono::nanoseconds by) {
     now_ = until;
 }
 
-std::vector<std::string> Network::take(int slot) {
+std::vector<std::string> NetworkTest::take(int slot) {
     return std::exchange(events_[slot], {});
 }
 
-void Network::forget_events() {
+void NetworkTest::forget_events() {
     events_.clear();
     messages_.clear();
 }
 
-int Network::dial(int slot, const std::string &number, CallType type) {
+int NetworkTest::dial(int slot, const std::string &number, CallType type) {
     const auto id = calls_.make_call(slot, {number, type, {}});
     EXPECT_TRUE(static_cast<bool>(id)) << id.refusal().reason;
     return id ? *id : 0;
 }
 
-Network::Ends Network::ring(int from, int to, CallType type) {
+NetworkTest::Ends NetworkTest::ring(int from, int to, CallType type) {
     const int caller = dial(from, plan_.number_of(to), type);
     advance(700ms);
     const auto calls = calls_.list(to);
@@ -78,21 +82,21 @@ Network::Ends Network::ring(int from, int to, CallType type) {
     return {caller, rings ? calls.back().session_id : 0};
 }
 
-Network::Ends Network::connect(int from, int to, CallType type) {
+NetworkTest::Ends NetworkTest::connect(int from, int to, CallType type) {
     const Ends ends = ring(from, to, type);
     expect_accepted(calls_.answer(to, ends.callee, type));
     forget_events();
     return ends;
 }
 
-int Network::connect_party(int slot, const std::string &number) {
+int NetworkTest::connect_party(int slot, const std::string &number) {
     const int id = dial(slot, number);
     advance(2700ms);
     forget_events();
     return id;
 }
 
-Network::Pair Network::active_and_held(int slot) {
+NetworkTest::Pair NetworkTest::active_and_held(int slot) {
     const int held = connect_party(slot, "+15559001");
     expect_accepted(calls_.hold(slot, held));
     const int active = connect_party(slot, "+15559002");
@@ -100,7 +104,7 @@ Network::Pair Network::active_and_held(int slot) {
     return {active, held};
 }
 
-CallState Network::state(int slot, int id) {
+CallState NetworkTest::state(int slot, int id) {
     for (const auto &call : calls_.list(slot))
         if (call.session_id == id)
             return call.state;
@@ -108,12 +112,12 @@ CallState Network::state(int slot, int id) {
     return CallState::kDialing;
 }
 
-void Network::lose(int slot) {
+void NetworkTest::lose(int slot) {
     expect_accepted(registrations_.enable_flight_mode(slot));
     forget_events();
 }
 
-void Network::come_back(int slot) {
+void NetworkTest::come_back(int slot) {
     registrations_.switch_on(slot);
     advance(300ms);
 }

@@ -1,11 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #pragma once
 
-#include "sim/call/model.hpp"
-#include "sim/call/ussd.hpp"
-#include "sim/registration/logins.hpp"
-#include "sim/sms/service_centre.hpp"
-#include "sim/vt/model.hpp"
+#include "sim/network.hpp"
 
 #include <chrono>
 #include <gmock/gmock.h>
@@ -23,17 +19,13 @@ using testing::IsEmpty;
 
 // A network of four registered slots whose time stands still until a test moves it on. Events are
 // kept as the signals that they become: "CallEnded (1, 0)".
-class Network : public testing::Test {
+class NetworkTest : public testing::Test {
   protected:
     // 2031-05-06T07:08:09Z, the time of day when a test begins less the 0.3 s that it takes to
     // register.
     static constexpr std::int64_t kEpoch = 1935817689;
 
-    Network();
-
-    // Records an event as the signal that it becomes.
-    template <typename Event>
-    void record(int slot, const Event &event);
+    NetworkTest();
 
     void advance(std::chrono::nanoseconds by);
     // What a slot has been told since it was last asked.
@@ -65,17 +57,20 @@ class Network : public testing::Test {
     void come_back(int slot);
 
     std::chrono::nanoseconds now_{0};
-    NumberPlan plan_;
     Timers timers_;
     std::map<int, std::vector<std::string>> events_;
     std::map<int, std::vector<MessageEvent>> messages_; // the same once more, as records
-    Registrations registrations_;
-    SupplementaryServices services_;
-    CallModel calls_;
-    VideoTelephony video_;
-    UssdService ussd_;
-    Logins logins_;
-    ServiceCentre centre_;
+    Network network_;
+
+    // The parts of the network.
+    const NumberPlan &plan_ = network_.plan;
+    Registrations &registrations_ = network_.registrations;
+    SupplementaryServices &services_ = network_.services;
+    CallModel &calls_ = network_.calls;
+    VideoTelephony &video_ = network_.video;
+    UssdService &ussd_ = network_.ussd;
+    Logins &logins_ = network_.logins;
+    ServiceCentre &centre_ = network_.centre;
 };
 
 // A refusal with this code whose reason holds this text.

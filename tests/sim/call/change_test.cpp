@@ -4,7 +4,7 @@
 namespace sim::test {
 namespace {
 
-class CallChange : public Network {};
+class CallChange : public NetworkTest {};
 
 constexpr const char *kAsked = "CallChangeRequest (1, 1, 'YXVkaW8sdmlkZW8=')";
 

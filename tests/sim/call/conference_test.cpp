@@ -4,7 +4,7 @@
 namespace sim::test {
 namespace {
 
-class CallConference : public Network {
+class CallConference : public NetworkTest {
   protected:
     // Slot 0 has slots 1 and 2 in conference 3, as its calls 1 and 2.
     int confer() {

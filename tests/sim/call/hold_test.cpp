@@ -4,7 +4,7 @@
 namespace sim::test {
 namespace {
 
-class CallHold : public Network {};
+class CallHold : public NetworkTest {};
 
 TEST_F(CallHold, BothSidesAreToldWhoHoldsAndWhoResumes) {
     const auto ends = connect(0, 1);

@@ -4,7 +4,7 @@
 namespace sim::test {
 namespace {
 
-class CallMedia : public Network {};
+class CallMedia : public NetworkTest {};
 
 TEST_F(CallMedia, MuteIsKeptForEachCall) {
     const auto ends = connect(0, 1);

@@ -9,7 +9,7 @@
 namespace sim::test {
 namespace {
 
-class Parties : public Network {
+class Parties : public NetworkTest {
   protected:
     std::vector<std::string> call(const std::string &number, std::chrono::nanoseconds time) {
         dial(0, number);

@@ -4,7 +4,7 @@
 namespace sim::test {
 namespace {
 
-class CallRadio : public Network {};
+class CallRadio : public NetworkTest {};
 
 TEST_F(CallRadio, AHandoverBelongsToALiveCall) {
     expect_refused(calls_.handover_started(0, 1), Result::kUnknownSession, "no call 1");

@@ -7,7 +7,7 @@ namespace {
 
 using enum ForwardCondition;
 
-class CallRouting : public Network {
+class CallRouting : public NetworkTest {
   protected:
     void forward(int slot, ForwardCondition condition, const std::string &number,
                  ServiceClass service = ServiceClass::kBoth, int time = 0) {

@@ -5,7 +5,7 @@
 namespace sim::test {
 namespace {
 
-class CallSetup : public Network {};
+class CallSetup : public NetworkTest {};
 
 TEST_F(CallSetup, ACallToTheNetworkIsAcceptedRingsAndIsAnswered) {
     EXPECT_EQ(dial(0, "+15559999"), 1);

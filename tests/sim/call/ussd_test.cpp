@@ -6,7 +6,7 @@
 namespace sim::test {
 namespace {
 
-class Ussd : public Network {
+class Ussd : public NetworkTest {
   protected:
     Status request(const std::string &code) { return ussd_.send(0, UssdRequest::kStart, 15, code); }
     Status reply(const std::string &text) { return ussd_.send(0, UssdRequest::kReply, 15, text); }

@@ -3,6 +3,7 @@
 #include "sim/group/interface.hpp"
 
 #include "sim/bus/form.hpp"
+#include "sim/network.hpp"
 
 #include <algorithm>
 #include <gmock/gmock.h>
@@ -56,12 +57,10 @@ class XdmParticipants : public testing::Test {
         return method->handler({slot, "", wire::pack(text)});
     }
 
-    GroupModel groups_;
-    NumberPlan plan_{{"+15550100", "+15550101"}};
     Timers timers_{1, [] { return std::chrono::nanoseconds(0); }};
-    Registrations registrations_{2, timers_, [](int, const RegistrationEvent &) {}};
+    Network network_{{.numbers = {"+15550100", "+15550101"}}, timers_, {}};
     // One session, of the second slot alone.
-    GroupInterface interface_{groups_, plan_, registrations_, [](int slot) {
+    GroupInterface interface_{network_.groups, network_.plan, network_.registrations, [](int slot) {
                                   return slot == 1 ? std::vector{sample_session()}
                                                    : std::vector<ParticipantInfo>();
                               }};

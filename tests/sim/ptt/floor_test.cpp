@@ -151,21 +151,26 @@ TEST(PttFloorQueue, OneMoreThanMayWaitIsRejected) {
     std::vector<std::string> numbers;
     for (int slot = 0; slot < kSlots; ++slot)
         numbers.push_back(NumberPlan::default_slot_number(slot));
-    const NumberPlan plan(numbers);
     std::chrono::nanoseconds now{0};
     Timers timers(0, [&] { return now; });
-    Registrations registrations(kSlots, timers, [](int, const RegistrationEvent &) {});
-    const PttDirectory directory(plan);
     std::vector<PttFloorEvent> told;
-    PttCalls calls(directory, timers, registrations, [&](int slot, const PttEvent &event) {
-        if (const auto *floor = std::get_if<PttFloorEvent>(&event); floor && slot == kSlots - 1)
-            told.push_back(*floor);
-    });
+    Network network({.numbers = numbers}, timers,
+                    {.registration = [](int, const RegistrationEvent &) {},
+                     .login = {},
+                     .call = {},
+                     .sms = {},
+                     .ptt =
+                         [&](int slot, const PttEvent &event) {
+                             if (const auto *floor = std::get_if<PttFloorEvent>(&event);
+                                 floor && slot == kSlots - 1)
+                                 told.push_back(*floor);
+                         }});
+    PttCalls &calls = network.ptt;
     const auto settle = [&] {
         now += 1ms;
         timers.run_due();
     };
-    registrations.start();
+    network.registrations.start();
     settle();
     for (int slot = 0; slot < kSlots; ++slot)
         expect_accepted(calls.set_channel(slot, 1, PttChannelMode::kTalkAndListen));

@@ -3,14 +3,10 @@
 
 #include "tests/sim/network.hpp"
 
-#include "tests/sim/bus/contract_signals.hpp"
-
-#include "sim/ptt/directory.hpp"
-#include "sim/ptt/files.hpp"
-#include "sim/ptt/messages.hpp"
-#include "sim/ptt/model.hpp"
-#include "sim/ptt/recorder.hpp"
-#include "sim/ptt/signals.hpp"
+#include <optional>
+#include <string>
+#include <utility>
+#include <vector>
 
 namespace sim::test {
 
@@ -18,12 +14,9 @@ inline constexpr FourIntegers kDefaults{};
 
 // The four slots of the network and a push-to-talk server. One more group, "sip:team@example.org",
 // has the slots 0 to 2.
-class PttNetwork : public Network {
+class PttNetwork : public NetworkTest {
   protected:
-    PttNetwork()
-        : directory_(plan_), ptt_(directory_, timers_, registrations_, sink()),
-          recorder_(ptt_, timers_), mail_(directory_, ptt_, timers_, registrations_, sink()),
-          files_(directory_, ptt_, timers_, registrations_, sink()) {
+    PttNetwork() {
         directory_.add_groups([](std::string_view uri) -> std::optional<std::vector<std::string>> {
             if (uri != kTeam)
                 return std::nullopt;
@@ -82,21 +75,11 @@ class PttNetwork : public Network {
     }
     static PttPeer to(const std::string &uri, bool group = false) { return {0, uri, {}, group}; }
 
-    PttDirectory directory_;
-    PttCalls ptt_;
-    PttRecorder recorder_;
-    PttMessages mail_;
-    PttFiles files_;
-
-  private:
-    PttCalls::Sink sink() {
-        return [this](int slot, const PttEvent &event) {
-            recorder_.hear(slot, event);
-            const Signal signal = to_signal(event);
-            expect_as_in_contract(signal);
-            events_[slot].push_back(std::string(signal.member) + " " + signal.body.print());
-        };
-    }
+    PttDirectory &directory_ = network_.ptt_directory;
+    PttCalls &ptt_ = network_.ptt;
+    PttRecorder &recorder_ = network_.ptt_recorder;
+    PttMessages &mail_ = network_.ptt_messages;
+    PttFiles &files_ = network_.ptt_files;
 };
 
 } // namespace sim::test

@@ -4,7 +4,7 @@
 namespace sim::test {
 namespace {
 
-class LoggingIn : public Network {
+class LoggingIn : public NetworkTest {
   protected:
     Status login(const std::string &user, const std::string &password,
                  LoginKind kind = LoginKind::kIms) {

@@ -5,7 +5,7 @@
 namespace sim::test {
 namespace {
 
-class Registering : public Network {
+class Registering : public NetworkTest {
   protected:
     static constexpr const char *kRegistered = "RegistrationStatus (true, 1, 15, 0, 200, 3600)";
     static constexpr const char *kFlightMode = "RegistrationStatus (false, 0, 0, 2, 0, 0)";

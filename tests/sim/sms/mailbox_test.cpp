@@ -192,17 +192,21 @@ TEST_F(Messages, ADuplicateOfWhatIsGoneIsNone) {
     EXPECT_EQ(texts(1).size(), 2u);
 }
 
-// A network at another pace, with the centre alone.
+// A network at another pace.
 class Pace : public testing::Test {
   protected:
     explicit Pace(double speed)
-        : plan_({"+15550100", "+15550101"}), timers_(speed, [this] { return now_; }),
-          registrations_(2, timers_, [](int, const RegistrationEvent &) {}),
-          centre_(plan_, timers_, registrations_, 1935817689,
-                  [this](int, const MessageEvent &event) {
-                      if (const auto *incoming = std::get_if<IncomingSms>(&event))
-                          incoming_.push_back(*incoming);
-                  }) {
+        : timers_(speed, [this] { return now_; }),
+          network_({.numbers = {"+15550100", "+15550101"}, .epoch = 1935817689}, timers_,
+                   {.registration = [](int, const RegistrationEvent &) {},
+                    .login = {},
+                    .call = {},
+                    .sms =
+                        [this](int, const MessageEvent &event) {
+                            if (const auto *incoming = std::get_if<IncomingSms>(&event))
+                                incoming_.push_back(*incoming);
+                        },
+                    .ptt = {}}) {
         registrations_.start();
         timers_.run_due();
     }
@@ -216,11 +220,11 @@ class Pace : public testing::Test {
     }
 
     std::chrono::nanoseconds now_{0};
-    NumberPlan plan_;
     Timers timers_;
-    Registrations registrations_;
-    ServiceCentre centre_;
     std::vector<IncomingSms> incoming_;
+    Network network_;
+    Registrations &registrations_ = network_.registrations;
+    ServiceCentre &centre_ = network_.centre;
 };
 
 class Fast : public Pace {

@@ -13,7 +13,7 @@ namespace sim::test {
 inline constexpr const char *kSlot1 = "+15550101";
 
 // The network as those who write to each other see it.
-class Messages : public Network {
+class Messages : public NetworkTest {
   protected:
     static SubmitRequest request(const tpdu::Submit &submit) {
         const auto octets = must(tpdu::encode(submit));

@@ -7,7 +7,7 @@ namespace {
 
 using enum ForwardCondition;
 
-class Supplementary : public Network {
+class Supplementary : public NetworkTest {
   protected:
     static constexpr auto kVoice = ServiceClass::kVoice;
     static constexpr auto kVideo = ServiceClass::kVideo;

@@ -5,7 +5,7 @@
 namespace sim::test {
 namespace {
 
-class VideoCall : public Network {
+class VideoCall : public NetworkTest {
   protected:
     VideoCall() : id_(connect(0, 1, CallType::kVideo).caller) {}
 

@@ -1,0 +1,73 @@
+// SPDX-License-Identifier: Apache-2.0
+#pragma once
+
+#include "sim/base/clock.hpp"
+#include "sim/base/number_plan.hpp"
+#include "sim/call/model.hpp"
+#include "sim/call/ussd.hpp"
+#include "sim/group/answers.hpp"
+#include "sim/group/model.hpp"
+#include "sim/ptt/directory.hpp"
+#include "sim/ptt/files.hpp"
+#include "sim/ptt/messages.hpp"
+#include "sim/ptt/model.hpp"
+#include "sim/ptt/recorder.hpp"
+#include "sim/registration/logins.hpp"
+#include "sim/registration/registrations.hpp"
+#include "sim/settings/model.hpp"
+#include "sim/sms/service_centre.hpp"
+#include "sim/ss/model.hpp"
+#include "sim/vt/model.hpp"
+
+#include <chrono>
+#include <cstdint>
+#include <string>
+#include <vector>
+
+namespace sim {
+
+struct NetworkOptions {
+    std::vector<std::string> numbers;                              // one a slot
+    std::chrono::nanoseconds ring_time = std::chrono::seconds(60); // how long a slot rings
+    std::int64_t epoch = 0; // when the timers' network time was 0, since 1970
+};
+
+// Who hears what slots are told.
+struct NetworkSinks {
+    Registrations::Sink registration;
+    Logins::Sink login;
+    CallModel::Sink call;
+    ServiceCentre::Sink sms;
+    PttCalls::Sink ptt;
+};
+
+// The network and the devices in it: every model, wired, without a bus.
+struct Network {
+    Network(NetworkOptions options, Timers &timers, const NetworkSinks &sinks);
+    Network(const Network &) = delete;
+    Network &operator=(const Network &) = delete;
+
+    // The push-to-talk sessions of a slot, as whoever asks about participants is told of them.
+    std::vector<ParticipantInfo> running_sessions(int slot) const;
+
+    NumberPlan plan;
+    Registrations registrations;
+    Logins logins;
+    SupplementaryServices services;
+    CallModel calls;
+    UssdService ussd;
+    VideoTelephony video;
+    ServiceCentre centre;
+    GroupModel groups;
+    PttDirectory ptt_directory;
+    PttCalls ptt;
+    PttRecorder ptt_recorder;
+    PttMessages ptt_messages;
+    PttFiles ptt_files;
+    SettingsModel settings;
+
+  private:
+    void take_away(int slot);
+};
+
+} // namespace sim
