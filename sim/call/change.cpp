@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-// Voice to video and back.
-#include "sim/call/model.hpp"
+#include "sim/call/change.hpp"
+
+#include <string>
 
 namespace sim {
 
@@ -8,11 +9,12 @@ namespace {
 
 constexpr std::chrono::milliseconds kPartyDecides{500};
 constexpr std::chrono::seconds kSlotDecides{15};
+constexpr std::chrono::seconds kPartyWaits{15};
 
 } // namespace
 
-Answer<Session *> CallModel::changeable(int slot, int id) {
-    auto session = talking(slot, id);
+Answer<Session *> CallChanges::changeable(int slot, int id) {
+    auto session = sessions_.talking(slot, id);
     if (!session)
         return session.refusal();
     if ((*session)->is_conference || (*session)->conference != 0)
@@ -23,39 +25,41 @@ Answer<Session *> CallModel::changeable(int slot, int id) {
         return refuse(Result::kWrongState, "the other side has call {} on hold", id);
     if ((*session)->handover)
         return refuse(Result::kWrongState, "a handover of call {} is under way", id);
-    if ((*session)->change)
+    if (is_pending({slot, id}))
         return refuse(Result::kWrongState, "call {} has a change request without an answer", id);
     return session;
 }
 
-void CallModel::switch_type(Session &session, CallType type) {
+CallChanges::Pending &CallChanges::begin(SessionRef ref, bool asked_here, CallType wanted) {
+    Pending &pending = pending_[ref.slot][ref.id];
+    pending.asked_here = asked_here;
+    pending.wanted = wanted;
+    return pending;
+}
+
+void CallChanges::drop(const Session &session) {
+    drop(session.ref);
+    if (session.peer)
+        drop(*session.peer);
+}
+
+void CallChanges::switch_type(Session &session, CallType type) {
+    drop(session);
     const auto apply = [&](Session &end) {
         end.type = type;
-        end.change.reset();
-        end.change_timer.cancel();
-        emit(end.ref.slot, CallSwitched{end.ref.id, type});
+        sessions_.emit(end.ref.slot, CallSwitched{end.ref.id, type});
     };
     apply(session);
-    if (Session *peer = session.peer ? find(*session.peer) : nullptr)
+    if (Session *peer = sessions_.peer_of(session))
         apply(*peer);
 }
 
-void CallModel::drop_change(Session &session) {
-    const auto drop = [](Session &end) {
-        end.change.reset();
-        end.change_timer.cancel();
-    };
-    drop(session);
-    if (Session *peer = session.peer ? find(*session.peer) : nullptr)
-        drop(*peer);
+void CallChanges::refuse_change(const Session &asker, CallErrorCode code, std::string_view why) {
+    drop(asker);
+    sessions_.emit(asker.ref.slot, CallError{asker.ref.id, code, std::string(why)});
 }
 
-void CallModel::refuse_change(Session &asker, CallErrorCode code, std::string_view why) {
-    drop_change(asker);
-    emit(asker.ref.slot, CallError{asker.ref.id, code, std::string(why)});
-}
-
-Answer<ChangeOutcome> CallModel::request_change(Session &session, CallType wanted) {
+Answer<ChangeOutcome> CallChanges::request(Session &session, CallType wanted) {
     if (wanted != CallType::kVoice && wanted != CallType::kVideo)
         return refuse(Result::kInvalidArgument, "a call changes to 0 (voice) or 1 (video), not {}",
                       wanted);
@@ -66,20 +70,20 @@ Answer<ChangeOutcome> CallModel::request_change(Session &session, CallType wante
         switch_type(session, wanted);
         return ChangeOutcome{wanted, false};
     }
-    session.change = PendingChange{true, wanted};
-    if (Session *peer = session.peer ? find(*session.peer) : nullptr) {
-        peer->change = PendingChange{false, wanted};
-        emit(peer->ref.slot, CallChangeRequest{peer->ref.id, wanted, media_of(wanted)});
-        session.change_timer = timers_.after_unscaled(kSlotDecides, [this, ref = session.ref] {
-            if (Session *asker = find(ref))
+    Timer &timer = begin(session.ref, true, wanted).timer;
+    if (const Session *peer = sessions_.peer_of(session)) {
+        begin(peer->ref, false, wanted);
+        sessions_.emit(peer->ref.slot, CallChangeRequest{peer->ref.id, wanted, media_of(wanted)});
+        timer = timers_.after_unscaled(kSlotDecides, [this, ref = session.ref] {
+            if (const Session *asker = sessions_.find(ref))
                 refuse_change(*asker, CallErrorCode::kRequestTimeout,
                               "the change request was not answered");
         });
     } else {
-        session.change_timer = timers_.after(kPartyDecides, [this, ref = session.ref] {
-            Session *asker = find(ref);
+        timer = timers_.after(kPartyDecides, [this, ref = session.ref, wanted] {
+            Session *asker = sessions_.find(ref);
             if (asker && (!asker->party || asker->party->accepts_changes))
-                switch_type(*asker, asker->change->wanted);
+                switch_type(*asker, wanted);
             else if (asker)
                 refuse_change(*asker, CallErrorCode::kNotAcceptable,
                               "the change request was rejected");
@@ -88,59 +92,72 @@ Answer<ChangeOutcome> CallModel::request_change(Session &session, CallType wante
     return ChangeOutcome{session.type, true};
 }
 
-Status CallModel::upgrade(int slot, int id, CallType wanted) {
+Status CallChanges::upgrade(int slot, int id, CallType wanted) {
     if (wanted != CallType::kVideo)
         return refuse(Result::kInvalidArgument, "a call is upgraded to 1 (video), not {}", wanted);
     const auto session = changeable(slot, id);
     if (!session)
         return session.refusal();
-    const auto outcome = request_change(**session, wanted);
+    const auto outcome = request(**session, wanted);
     return outcome ? Status(Done{}) : Status(outcome.refusal());
 }
 
-Status CallModel::downgrade(int slot, int id, CallType wanted) {
+Status CallChanges::downgrade(int slot, int id, CallType wanted) {
     if (wanted != CallType::kVoice)
         return refuse(Result::kInvalidArgument, "a call is downgraded to 0 (voice), not {}",
                       wanted);
     const auto session = changeable(slot, id);
     if (!session)
         return session.refusal();
-    const auto outcome = request_change(**session, wanted);
+    const auto outcome = request(**session, wanted);
     return outcome ? Status(Done{}) : Status(outcome.refusal());
 }
 
-Answer<ChangeOutcome> CallModel::change(int slot, int id, CallType wanted) {
+Answer<ChangeOutcome> CallChanges::change(int slot, int id, CallType wanted) {
     const auto session = changeable(slot, id);
     if (!session)
         return session.refusal();
-    return request_change(**session, wanted);
+    return request(**session, wanted);
 }
 
-Answer<Session *> CallModel::asked_to_change(int slot, int id) {
-    auto session = established(slot, id);
-    if (session && (!(*session)->change || (*session)->change->asked_here))
+Answer<Session *> CallChanges::asked_to_change(int slot, int id) {
+    auto session = sessions_.established(slot, id);
+    if (session && (!is_pending({slot, id}) || pending_[slot].at(id).asked_here))
         return refuse(Result::kWrongState, "the other side of call {} has asked for no change", id);
     return session;
 }
 
-Status CallModel::accept_change(int slot, int id) {
+Status CallChanges::accept(int slot, int id) {
     const auto session = asked_to_change(slot, id);
     if (!session)
         return session.refusal();
-    switch_type(**session, (*session)->change->wanted);
+    switch_type(**session, pending_[slot].at(id).wanted);
     return Done{};
 }
 
-Status CallModel::reject_change(int slot, int id) {
+Status CallChanges::reject(int slot, int id) {
     const auto session = asked_to_change(slot, id);
     if (!session)
         return session.refusal();
-    Session *asker = (*session)->peer ? find(*(*session)->peer) : nullptr;
-    if (asker)
+    if (const Session *asker = sessions_.peer_of(**session))
         refuse_change(*asker, CallErrorCode::kNotAcceptable, "the change request was rejected");
     else
-        drop_change(**session);
+        drop(**session);
     return Done{};
+}
+
+void CallChanges::ask_video(const Session &session) {
+    const bool possible = session.type == CallType::kVoice && !is_pending(session.ref) &&
+                          !session.held_here && session.conference == 0;
+    if (!possible)
+        return;
+    Timer &timer = begin(session.ref, false, CallType::kVideo).timer;
+    sessions_.emit(session.ref.slot,
+                   CallChangeRequest{session.ref.id, CallType::kVideo, media_of(CallType::kVideo)});
+    timer = timers_.after_unscaled(kPartyWaits, [this, ref = session.ref] {
+        if (const Session *asked = sessions_.find(ref))
+            drop(*asked);
+    });
 }
 
 } // namespace sim

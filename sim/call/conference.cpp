@@ -28,27 +28,14 @@ std::optional<Refusal> not_a_media_type(CallType type) {
 } // namespace
 
 Answer<Session *> CallModel::conference_of(int slot, int id) {
-    auto session = existing(slot, id);
+    auto session = sessions_.existing(slot, id);
     if (session && !(*session)->is_conference)
         return refuse(Result::kWrongState, "call {} is not a conference", id);
     return session;
 }
 
-Session *CallModel::conference_session(const Session &member) {
-    return member.conference == 0 ? nullptr : find({member.ref.slot, member.conference});
-}
-
-std::vector<SessionRef> CallModel::member_refs(const Session &conference) const {
-    std::vector<SessionRef> found;
-    if (conference.is_conference)
-        for (const auto &[id, session] : lines_[conference.ref.slot].sessions)
-            if (session.conference == conference.ref.id)
-                found.push_back(session.ref);
-    return found;
-}
-
 Session &CallModel::add_conference(int slot, CallType type, Phase phase) {
-    Session &conference = add_session(slot, type, phase);
+    Session &conference = sessions_.add(slot, type, phase);
     conference.is_conference = true;
     conference.mobile_originated = true;
     conference.peer_uri = fmt::format("sip:conference-{}@slot{}.invalid", conference.ref.id, slot);
@@ -71,34 +58,34 @@ std::optional<Refusal> CallModel::cannot_join(const Session &conference,
 }
 
 std::optional<Refusal> CallModel::room_for(const Session &conference, std::size_t more) const {
-    if (member_refs(conference).size() + more > kMaxParticipants)
+    if (sessions_.members_of(conference).size() + more > kMaxParticipants)
         return refuse(Result::kTooMany, "a conference has at most {} participants",
                       kMaxParticipants);
     return std::nullopt;
 }
 
 void CallModel::join(Session &conference, Session &session) {
-    drop_change(session);
+    changes_.drop(session);
     if (session.held_here != conference.held_here)
         set_hold(session, conference.held_here);
     session.conference = conference.ref.id;
-    emit(conference.ref.slot, ParticipantAdded{conference.ref.id, session.ref.id});
+    sessions_.emit(conference.ref.slot, ParticipantAdded{conference.ref.id, session.ref.id});
 }
 
 void CallModel::member_answered(Session &member) {
-    Session *conference = conference_session(member);
+    Session *conference = sessions_.conference_of(member);
     if (!conference)
         return;
     const int slot = member.ref.slot;
     if (!conference->established()) {
         conference->phase = Phase::kEstablished;
-        emit(slot, ConferenceEstablished{conference->ref.id, conference->type});
+        sessions_.emit(slot, ConferenceEstablished{conference->ref.id, conference->type});
     }
     if (conference->held_here) {
         member.held_here = true;
         hold_far_end(member, true);
     }
-    emit(slot, ParticipantAdded{conference->ref.id, member.ref.id});
+    sessions_.emit(slot, ParticipantAdded{conference->ref.id, member.ref.id});
     tell_roster(*conference);
 }
 
@@ -108,21 +95,21 @@ void CallModel::tell_roster(const Session &conference, const Session *gone) {
         roster.states.push_back(static_cast<std::int32_t>(state));
         roster.uris.push_back(member.peer_uri);
     };
-    for (const SessionRef ref : member_refs(conference)) {
-        const Session &member = *find(ref);
+    for (const SessionRef ref : sessions_.members_of(conference)) {
+        const Session &member = *sessions_.find(ref);
         add(member, participant_state(member));
     }
     if (gone)
         add(*gone, ParticipantState::kGone);
-    emit(conference.ref.slot, roster);
+    sessions_.emit(conference.ref.slot, roster);
 }
 
 void CallModel::leave_conference(const Session &session) {
-    const Session *conference = conference_session(session);
+    const Session *conference = sessions_.conference_of(session);
     if (!conference)
         return;
     if (session.established())
-        emit(session.ref.slot, ParticipantRemoved{conference->ref.id, session.ref.id});
+        sessions_.emit(session.ref.slot, ParticipantRemoved{conference->ref.id, session.ref.id});
     tell_roster(*conference, &session);
 }
 
@@ -140,7 +127,7 @@ Answer<int> CallModel::confer(int slot, Session &first, Session &second, CallTyp
             if (auto refusal = cannot_join(Session{}, *session))
                 return *refusal;
         conference = &add_conference(slot, type, Phase::kEstablished);
-        emit(slot, ConferenceEstablished{conference->ref.id, type});
+        sessions_.emit(slot, ConferenceEstablished{conference->ref.id, type});
         join(*conference, first);
         join(*conference, second);
     }
@@ -149,8 +136,8 @@ Answer<int> CallModel::confer(int slot, Session &first, Session &second, CallTyp
 }
 
 Answer<int> CallModel::merge(int slot) {
-    Session *active = context(slot, false);
-    Session *held = context(slot, true);
+    Session *active = sessions_.context(slot, false);
+    Session *held = sessions_.context(slot, true);
     if (!active || !held)
         return refuse(Result::kWrongState,
                       "a merge needs an active and a held call; there is no {}",
@@ -165,10 +152,10 @@ Answer<int> CallModel::start_nway(int slot, int first, int second, CallType type
     if (first == second)
         return refuse(Result::kInvalidArgument, "a conference needs two calls, not call {} twice",
                       first);
-    const auto one = established(slot, first);
+    const auto one = sessions_.established(slot, first);
     if (!one)
         return one.refusal();
-    const auto other = established(slot, second);
+    const auto other = sessions_.established(slot, second);
     if (!other)
         return other.refusal();
     for (const Session *session : {*one, *other}) {
@@ -187,7 +174,7 @@ Status CallModel::add_participant(int slot, int conference, int id) {
         return to.refusal();
     if (!(*to)->established())
         return refuse(Result::kWrongState, "conference {} is not established yet", conference);
-    const auto session = established(slot, id);
+    const auto session = sessions_.established(slot, id);
     if (!session)
         return session.refusal();
     if (auto refusal = cannot_join(**to, **session))
@@ -201,7 +188,7 @@ Status CallModel::remove_participant(int slot, int conference, int id) {
     const auto from = conference_of(slot, conference);
     if (!from)
         return from.refusal();
-    const auto session = existing(slot, id);
+    const auto session = sessions_.existing(slot, id);
     if (!session)
         return session.refusal();
     if ((*session)->conference != conference)
@@ -219,8 +206,8 @@ CallModel::new_participants(int slot, const Session &conference,
     if (auto refusal = room_for(conference, called.size()))
         return *refusal;
     std::vector<std::string> taken;
-    for (const SessionRef ref : member_refs(conference))
-        taken.push_back(lines_[slot].sessions.at(ref.id).number);
+    for (const SessionRef ref : sessions_.members_of(conference))
+        taken.push_back(sessions_[slot].sessions.at(ref.id).number);
     std::vector<std::string> numbers;
     for (const auto &text : called) {
         auto number = parse_number(text);
@@ -310,9 +297,9 @@ CallModel::participants(int slot, const Session &conference,
         const auto number = parse_number(text);
         if (!number)
             return number.refusal();
-        const auto refs = member_refs(conference);
+        const auto refs = sessions_.members_of(conference);
         const auto match = std::ranges::find_if(refs, [&](SessionRef ref) {
-            const Session &member = lines_[slot].sessions.at(ref.id);
+            const Session &member = sessions_[slot].sessions.at(ref.id);
             return same_number(member.number, *number) || same_number(member.route, *number);
         });
         if (match == refs.end())

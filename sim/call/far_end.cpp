@@ -4,12 +4,6 @@
 
 namespace sim {
 
-namespace {
-
-constexpr std::chrono::seconds kPartyWaits{15};
-
-} // namespace
-
 void CallModel::schedule_step(Session &session) {
     if (session.party && session.next_step < session.party->steps.size())
         session.step_timer = timers_.after(session.party->steps[session.next_step].after,
@@ -17,12 +11,12 @@ void CallModel::schedule_step(Session &session) {
 }
 
 void CallModel::run_step(SessionRef ref) {
-    Session *session = find(ref);
+    Session *session = sessions_.find(ref);
     if (!session)
         return;
     perform(*session, session->party->steps[session->next_step++]);
     // The step may have ended the call.
-    if (Session *left = find(ref))
+    if (Session *left = sessions_.find(ref))
         schedule_step(*left);
 }
 
@@ -30,17 +24,17 @@ void CallModel::perform(Session &session, const Step &step) {
     const auto [slot, id] = session.ref;
     switch (step.action) {
     case Action::kProceed:
-        return emit(slot, CallInProgress{id});
+        return sessions_.emit(slot, CallInProgress{id});
     case Action::kAlert:
         return alert(session);
     case Action::kRingSlot:
         return ring_slot(session);
     case Action::kForward:
-        return emit(slot, CallForwarded{id});
+        return sessions_.emit(slot, CallForwarded{id});
     case Action::kEarlyMedia:
-        return emit(slot, CallEarlyMediaStart{id, media_of(session.type)});
+        return sessions_.emit(slot, CallEarlyMediaStart{id, media_of(session.type)});
     case Action::kStopTone:
-        return emit(slot, CallStopAlertTone{id});
+        return sessions_.emit(slot, CallStopAlertTone{id});
     case Action::kAnswer:
         return establish(session);
     case Action::kBusy:
@@ -62,9 +56,9 @@ void CallModel::perform(Session &session, const Step &step) {
     case Action::kResume:
         return tell_hold(session, false, false);
     case Action::kAskVideo:
-        return ask_video(session);
+        return changes_.ask_video(session);
     case Action::kTone:
-        return emit(slot, CallDtmfEvent{static_cast<std::uint8_t>(step.value)});
+        return sessions_.emit(slot, CallDtmfEvent{static_cast<std::uint8_t>(step.value)});
     case Action::kCallBack:
         return call_back(session, std::chrono::milliseconds(step.value));
     }
@@ -72,39 +66,25 @@ void CallModel::perform(Session &session, const Step &step) {
 
 void CallModel::alert(Session &session) {
     session.phase = Phase::kAlerting;
-    emit(session.ref.slot, CallAlerting{session.ref.id});
-    if (const Session *conference = conference_session(session))
+    sessions_.emit(session.ref.slot, CallAlerting{session.ref.id});
+    if (const Session *conference = sessions_.conference_of(session))
         tell_roster(*conference);
 }
 
 void CallModel::turn_away(const Session &session) {
-    emit(session.ref.slot, CallBusy{session.ref.id});
+    sessions_.emit(session.ref.slot, CallBusy{session.ref.id});
     finish(session.ref, EndReason::kBusy, EndReason::kBusy);
 }
 
 void CallModel::fail(const Session &session, CallErrorCode code, std::string_view why,
                      EndReason reason) {
-    emit(session.ref.slot, CallError{session.ref.id, code, std::string(why)});
+    sessions_.emit(session.ref.slot, CallError{session.ref.id, code, std::string(why)});
     finish(session.ref, reason, reason);
-}
-
-void CallModel::ask_video(Session &session) {
-    const bool possible = session.type == CallType::kVoice && !session.change &&
-                          !session.held_here && session.conference == 0;
-    if (!possible)
-        return;
-    session.change = PendingChange{false, CallType::kVideo};
-    emit(session.ref.slot,
-         CallChangeRequest{session.ref.id, CallType::kVideo, media_of(CallType::kVideo)});
-    session.change_timer = timers_.after_unscaled(kPartyWaits, [this, ref = session.ref] {
-        if (Session *asked = find(ref))
-            drop_change(*asked);
-    });
 }
 
 void CallModel::call_back(const Session &session, std::chrono::milliseconds later) {
     const auto slot = session.ref.slot;
-    lines_[slot].callback_timer =
+    sessions_[slot].callback_timer =
         timers_.after(later, [this, slot, number = session.route, type = session.type] {
             static_cast<void>(call_from_network(slot, number, type));
         });

@@ -18,37 +18,37 @@ std::optional<Refusal> CallModel::cannot_hold(const Session &session) const {
 void CallModel::tell_hold(Session &session, bool held, bool here) {
     (here ? session.held_here : session.held_by_peer) = held;
     if (held)
-        emit(session.ref.slot, CallHeld{session.ref.id, here, session.type});
+        sessions_.emit(session.ref.slot, CallHeld{session.ref.id, here, session.type});
     else
-        emit(session.ref.slot,
-             CallResumed{session.ref.id, here, here ? session.held_by_peer : session.held_here,
-                         session.type});
+        sessions_.emit(session.ref.slot,
+                       CallResumed{session.ref.id, here,
+                                   here ? session.held_by_peer : session.held_here, session.type});
 }
 
 void CallModel::hold_far_end(const Session &session, bool held) {
-    if (Session *peer = session.peer ? find(*session.peer) : nullptr; peer && peer->established())
+    if (Session *peer = sessions_.peer_of(session); peer && peer->established())
         tell_hold(*peer, held, false);
 }
 
 void CallModel::set_hold(Session &session, bool held) {
     tell_hold(session, held, true);
     hold_far_end(session, held);
-    for (const SessionRef ref : member_refs(session)) {
-        Session &member = *find(ref);
+    for (const SessionRef ref : sessions_.members_of(session)) {
+        Session &member = *sessions_.find(ref);
         member.held_here = held;
         hold_far_end(member, held);
     }
 }
 
 Status CallModel::hold(int slot, int id) {
-    const auto session = established(slot, id);
+    const auto session = sessions_.established(slot, id);
     if (!session)
         return session.refusal();
     if ((*session)->held_here)
         return refuse(Result::kWrongState, "call {} is on hold already", id);
     if (auto refusal = cannot_hold(**session))
         return *refusal;
-    if (const Session *held = context(slot, true))
+    if (const Session *held = sessions_.context(slot, true))
         return refuse(Result::kTooMany, "call {} is on hold already: swap or end one of them",
                       held->ref.id);
     set_hold(**session, true);
@@ -56,7 +56,7 @@ Status CallModel::hold(int slot, int id) {
 }
 
 Status CallModel::resume(int slot, int id) {
-    const auto session = established(slot, id);
+    const auto session = sessions_.established(slot, id);
     if (!session)
         return session.refusal();
     if (!(*session)->held_here)
@@ -64,10 +64,10 @@ Status CallModel::resume(int slot, int id) {
     if (auto refusal = cannot_hold(**session))
         return *refusal;
     // A call that rings here can wait, and one into a conference joins whatever state it is in.
-    for (const auto &[other, state] : lines_[slot].sessions)
+    for (const auto &[other, state] : sessions_[slot].sessions)
         if (!state.established() && state.mobile_originated && state.conference == 0)
             return refuse(Result::kLineInUse, "call {} is still being set up", other);
-    if (const Session *active = context(slot, false))
+    if (const Session *active = sessions_.context(slot, false))
         return refuse(Result::kLineInUse, "call {} is active: swap, or end it first",
                       active->ref.id);
     set_hold(**session, false);
@@ -75,8 +75,8 @@ Status CallModel::resume(int slot, int id) {
 }
 
 Status CallModel::swap(int slot) {
-    Session *active = context(slot, false);
-    Session *held = context(slot, true);
+    Session *active = sessions_.context(slot, false);
+    Session *held = sessions_.context(slot, true);
     if (!active || !held)
         return refuse(Result::kWrongState, "a swap needs an active and a held call; there is no {}",
                       active ? "held one" : "active one");

@@ -3,15 +3,18 @@
 
 #include "sim/base/clock.hpp"
 #include "sim/base/number_plan.hpp"
-#include "sim/base/per_slot.hpp"
 #include "sim/base/result.hpp"
+#include "sim/call/change.hpp"
 #include "sim/call/events.hpp"
-#include "sim/call/session.hpp"
+#include "sim/call/media.hpp"
+#include "sim/call/parties.hpp"
+#include "sim/call/radio.hpp"
+#include "sim/call/sessions.hpp"
 #include "sim/registration/registrations.hpp"
 #include "sim/ss/model.hpp"
 
+#include <chrono>
 #include <cstdint>
-#include <functional>
 #include <optional>
 #include <string>
 #include <string_view>
@@ -35,25 +38,22 @@ struct CallInfo {
     bool operator==(const CallInfo &) const = default;
 };
 
-struct ChangeOutcome {
-    CallType in_force = CallType::kVoice;
-    bool pending = false;
-};
-
-struct TtyState {
-    TtyMode mode = TtyMode::kOff;
-    std::string received;
-};
-
 // The calls of all slots: what may be asked of them when, what becomes of them, and who is told.
-// A request that makes no sense in the present state is refused and changes nothing.
+// A request that makes no sense in the present state is refused and changes nothing. What sessions
+// are and what may be asked of them is the device's; where calls go (routing.cpp) and what far ends
+// do (far_end.cpp) is the network's.
 class CallModel {
   public:
-    using Sink = std::function<void(int slot, const CallEvent &event)>;
+    using Sink = CallSessions::Sink;
 
     // `ring_time`: how long a slot rings before the network gives up.
     CallModel(const NumberPlan &plan, Timers &timers, Registrations &registrations,
               const SupplementaryServices &services, std::chrono::nanoseconds ring_time, Sink sink);
+
+    // The parts: what is done inside a call, what its sides negotiate, what the radio side tells.
+    CallMedia &media() { return media_; }
+    CallChanges &changes() { return changes_; }
+    CallRadio &radio() { return radio_; }
 
     // Setting up and ending
     Answer<int> make_call(int slot, const DialRequest &request);
@@ -72,13 +72,6 @@ class CallModel {
     Status resume(int slot, int id);
     Status swap(int slot);
 
-    // Change of the call type
-    Status upgrade(int slot, int id, CallType wanted);
-    Status downgrade(int slot, int id, CallType wanted);
-    Answer<ChangeOutcome> change(int slot, int id, CallType wanted);
-    Status accept_change(int slot, int id);
-    Status reject_change(int slot, int id);
-
     // Conferences
     Answer<int> merge(int slot);
     Answer<int> start_nway(int slot, int first, int second, CallType type);
@@ -89,41 +82,8 @@ class CallModel {
     Answer<int> modify_conference(int slot, int conference, ConferenceChange change,
                                   const std::vector<std::string> &called);
 
-    // Media
-    Answer<bool> is_muted(int slot, int id);
-    Status toggle_mute(int slot, int id);
-    Status set_volume(int slot, int id, std::int32_t volume);
-    Answer<std::int32_t> max_volume(int slot, int id);
-    Status set_speaker(int slot, int id, std::int32_t on);
-    Status record(int slot, int id, RecordAction action, const std::string &path);
-    Status send_dtmf(int slot, int id, std::string_view tones);
-    Status start_dtmf(int slot, int id, std::uint8_t tone);
-    Status stop_dtmf(int slot, int id);
-    Status set_tty_mode(int slot, TtyMode mode);
-    TtyState tty(int slot) const;
-    Status send_tty(int slot, int id, const std::string &bytes);
-
-    // Radio and access
-    Status handover_started(int slot, int id);
-    Status handover_failed(int slot, int id);
-    bool in_epdg_call(int slot) const;
-    Status set_audio_path(int slot, AudioPath path);
-    Status set_ssac(int slot, std::int32_t apply, const Ssac &ssac);
-    Status set_emergency_pdn(int slot, EmergencyPdn info);
-    Status register_emergency_pdn(int slot);
-    Status deregister_emergency_pdn(int slot);
-
   private:
-    Session *find(SessionRef ref);
-    void emit(int slot, const CallEvent &event) const { sink_(slot, event); }
-
     // What requests stand on: the session in the state that they need, or the refusal.
-    Answer<Session *> existing(int slot, int id);
-    Answer<Session *> established(int slot, int id);
-    Answer<Session *> talking(int slot, int id);
-    Answer<Session *> silent(int slot, int id);
-    Answer<Session *> changeable(int slot, int id);
-    Answer<Session *> asked_to_change(int slot, int id);
     Answer<Session *> conference_of(int slot, int id);
     std::optional<Refusal> cannot_dial(int slot, std::string_view number, CallType type) const;
     std::optional<Refusal> cannot_dial_all(int slot, const std::vector<std::string> &numbers,
@@ -139,14 +99,6 @@ class CallModel {
     Answer<std::vector<SessionRef>> participants(int slot, const Session &conference,
                                                  const std::vector<std::string> &called) const;
 
-    // One active and one held call a slot; a conference counts as one, its members not at all.
-    const Session *context(int slot, bool held) const;
-    Session *context(int slot, bool held);
-    bool has_established(int slot) const;
-    const Session *being_set_up(int slot) const;
-    CallState state_of(const Session &session) const;
-
-    Session &add_session(int slot, CallType type, Phase phase);
     // An emergency call gets the line, whatever is on it.
     void clear_line(int slot);
     Session &dial(int slot, std::string_view number, const DialRequest &request);
@@ -164,7 +116,6 @@ class CallModel {
     void alert(Session &session);
     void turn_away(const Session &session);
     void fail(const Session &session, CallErrorCode code, std::string_view why, EndReason reason);
-    void ask_video(Session &session);
     void call_back(const Session &session, std::chrono::milliseconds later);
 
     // Where a call to a slot goes
@@ -178,14 +129,7 @@ class CallModel {
     void tell_hold(Session &session, bool held, bool here);
     void hold_far_end(const Session &session, bool held);
 
-    Answer<ChangeOutcome> request_change(Session &session, CallType wanted);
-    void switch_type(Session &session, CallType type);
-    void drop_change(Session &session);
-    void refuse_change(Session &asker, CallErrorCode code, std::string_view why);
-
     Session &add_conference(int slot, CallType type, Phase phase);
-    Session *conference_session(const Session &member);
-    std::vector<SessionRef> member_refs(const Session &conference) const;
     void join(Session &conference, Session &session);
     void invite_all(Session &conference, const std::vector<std::string> &numbers, CallType type);
     void member_answered(Session &member);
@@ -193,15 +137,15 @@ class CallModel {
     void leave_conference(const Session &session);
     Answer<int> confer(int slot, Session &first, Session &second, CallType type);
 
-    std::vector<SessionRef> far_ends(const Session &session) const;
-
     const NumberPlan &plan_;
     Timers &timers_;
-    Registrations &registrations_;
+    const Registrations &registrations_;
     const SupplementaryServices &services_;
     std::chrono::nanoseconds ring_time_;
-    Sink sink_;
-    PerSlot<Line> lines_;
+    CallSessions sessions_;
+    CallMedia media_;
+    CallChanges changes_;
+    CallRadio radio_;
 };
 
 } // namespace sim

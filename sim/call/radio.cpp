@@ -1,9 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
-// What the radio side tells the service, and the bearer for emergency calls.
-#include "sim/call/model.hpp"
+#include "sim/call/radio.hpp"
 
 #include <arpa/inet.h>
 #include <array>
+#include <string_view>
+#include <utility>
 
 namespace sim {
 
@@ -32,8 +33,8 @@ std::optional<Refusal> bad_barring(std::string_view media, std::int32_t factor, 
 
 } // namespace
 
-Status CallModel::handover_started(int slot, int id) {
-    const auto session = existing(slot, id);
+Status CallRadio::handover_started(int slot, int id) {
+    const auto session = sessions_.existing(slot, id);
     if (!session)
         return session.refusal();
     if ((*session)->handover)
@@ -42,8 +43,8 @@ Status CallModel::handover_started(int slot, int id) {
     return Done{};
 }
 
-Status CallModel::handover_failed(int slot, int id) {
-    const auto session = existing(slot, id);
+Status CallRadio::handover_failed(int slot, int id) {
+    const auto session = sessions_.existing(slot, id);
     if (!session)
         return session.refusal();
     if (!(*session)->handover)
@@ -52,37 +53,45 @@ Status CallModel::handover_failed(int slot, int id) {
     return Done{};
 }
 
-bool CallModel::in_epdg_call(int slot) const {
-    const auto &here = lines_[slot];
-    return here.audio_path == AudioPath::kEpdg && has_established(slot);
+bool CallRadio::in_epdg_call(int slot) const {
+    return slots_[slot].audio_path == AudioPath::kEpdg && sessions_.has_established(slot);
 }
 
-Status CallModel::set_audio_path(int slot, AudioPath path) {
+Status CallRadio::set_audio_path(int slot, AudioPath path) {
     if (path != AudioPath::kCellular && path != AudioPath::kEpdg)
         return refuse(Result::kInvalidArgument, "a path is 0 (cellular) or 1 (ePDG), not {}", path);
-    if (!has_established(slot))
+    if (!sessions_.has_established(slot))
         return refuse(Result::kWrongState, "there is no established call whose path could change");
-    lines_[slot].audio_path = path;
+    slots_[slot].audio_path = path;
     return Done{};
 }
 
-Status CallModel::set_ssac(int slot, std::int32_t apply, const Ssac &ssac) {
+Status CallRadio::set_ssac(int slot, std::int32_t apply, const Ssac &ssac) {
     if (apply != 0 && apply != 1)
         return refuse(Result::kInvalidArgument, "barring is 1 (applies) or 0 (lifted), not {}",
                       apply);
     if (apply == 0) {
-        lines_[slot].ssac.reset();
+        slots_[slot].ssac.reset();
         return Done{};
     }
     if (auto refusal = bad_barring("voice", ssac.voice_factor, ssac.voice_time))
         return *refusal;
     if (auto refusal = bad_barring("video", ssac.video_factor, ssac.video_time))
         return *refusal;
-    lines_[slot].ssac = ssac;
+    slots_[slot].ssac = ssac;
     return Done{};
 }
 
-Status CallModel::set_emergency_pdn(int slot, EmergencyPdn info) {
+std::optional<Refusal> CallRadio::bars(int slot, CallType type) const {
+    const auto &ssac = slots_[slot].ssac;
+    const bool video = type == CallType::kVideo;
+    if (ssac && (video ? ssac->video_factor : ssac->voice_factor) == 0)
+        return refuse(Result::kBarred, "the cell bars {} calls (UpdateSsacInfo set the factor 0)",
+                      video ? "video" : "voice");
+    return std::nullopt;
+}
+
+Status CallRadio::set_emergency_pdn(int slot, EmergencyPdn info) {
     if (info.interface.empty())
         return refuse(Result::kInvalidArgument, "the name of the network interface is empty");
     if (info.servers.empty())
@@ -95,23 +104,23 @@ Status CallModel::set_emergency_pdn(int slot, EmergencyPdn info) {
                       info.local_address);
     if (registrations_.emergency_bearer(slot))
         return refuse(Result::kWrongState, "the emergency PDN is registered: deregister it first");
-    lines_[slot].emergency_pdn = std::move(info);
+    slots_[slot].emergency_pdn = std::move(info);
     return Done{};
 }
 
-Status CallModel::register_emergency_pdn(int slot) {
+Status CallRadio::register_emergency_pdn(int slot) {
     if (auto refusal = registrations_.radio_off(slot))
         return *refusal;
     if (registrations_.emergency_bearer(slot))
         return refuse(Result::kWrongState, "the emergency PDN is registered already");
-    if (!lines_[slot].emergency_pdn)
+    if (!slots_[slot].emergency_pdn)
         return refuse(Result::kWrongState, "nothing is known of the emergency PDN: call "
                                            "SetEmergencyPdnInfo first");
     registrations_.set_emergency_bearer(slot, true);
     return Done{};
 }
 
-Status CallModel::deregister_emergency_pdn(int slot) {
+Status CallRadio::deregister_emergency_pdn(int slot) {
     if (!registrations_.emergency_bearer(slot))
         return refuse(Result::kWrongState, "the emergency PDN is not registered");
     registrations_.set_emergency_bearer(slot, false);

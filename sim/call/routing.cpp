@@ -68,7 +68,7 @@ void CallModel::forward(Session &caller, const std::string &target) {
     if (++caller.diversions > kMaxDiversions)
         return fail(caller, CallErrorCode::kLoopDetected, "the call was forwarded too often",
                     EndReason::kUnreachable);
-    emit(caller.ref.slot, CallForwarded{caller.ref.id});
+    sessions_.emit(caller.ref.slot, CallForwarded{caller.ref.id});
     caller.route = target;
     caller.peer_uri = to_uri(target);
     caller.party = &party_at(plan_, caller.ref.slot, target);
@@ -78,11 +78,11 @@ void CallModel::forward(Session &caller, const std::string &target) {
 
 // A call that rings here goes on to another number.
 void CallModel::divert(SessionRef ringing, EndReason here, const std::string &target) {
-    Session *callee = find(ringing);
+    Session *callee = sessions_.find(ringing);
     const auto caller_ref = callee->peer;
     callee->peer.reset();
     finish(ringing, here, here);
-    Session *caller = caller_ref ? find(*caller_ref) : nullptr;
+    Session *caller = caller_ref ? sessions_.find(*caller_ref) : nullptr;
     if (!caller)
         return;
     caller->peer.reset();
@@ -90,7 +90,7 @@ void CallModel::divert(SessionRef ringing, EndReason here, const std::string &ta
 }
 
 void CallModel::give_up_ringing(SessionRef ref) {
-    const Session *ringing = find(ref);
+    const Session *ringing = sessions_.find(ref);
     if (!ringing)
         return;
     const auto target =
@@ -102,7 +102,7 @@ void CallModel::give_up_ringing(SessionRef ref) {
 }
 
 void CallModel::drop_calls(int slot) {
-    Line &here = lines_[slot];
+    Line &here = sessions_[slot];
     here.callback_timer.cancel();
     const auto is_conference = [](const auto &entry) { return entry.second.is_conference; };
     while (!here.sessions.empty()) {

@@ -10,7 +10,6 @@
 #include <map>
 #include <optional>
 #include <string>
-#include <vector>
 
 namespace sim {
 
@@ -22,12 +21,6 @@ struct SessionRef {
 };
 
 enum class Phase { kDialing, kAlerting, kIncoming, kEstablished };
-
-// A change of the call type that one side has asked for and the other not answered.
-struct PendingChange {
-    bool asked_here = false;
-    CallType wanted = CallType::kVoice;
-};
 
 // One call, or one conference, as one slot sees it.
 struct Session {
@@ -51,34 +44,11 @@ struct Session {
     bool held_here = false;
     bool held_by_peer = false;
     bool handover = false;
-    std::optional<PendingChange> change;
-    Timer change_timer;
 
     bool is_conference = false;
     int conference = 0; // the conference that this session takes part in
 
-    bool muted = false;
-    bool speaker = false;
-    std::int32_t volume = kInitialVolume;
-    std::optional<std::uint8_t> tone;
-    bool recording = false;
-
     bool established() const { return phase == Phase::kEstablished; }
-};
-
-struct EmergencyPdn {
-    std::string interface;
-    std::vector<std::string> servers;
-    std::string local_address;
-};
-
-// The access class barring that the cell announces for multimedia telephony. A factor is the
-// percentage of attempts that get through.
-struct Ssac {
-    std::int32_t voice_factor = 100;
-    std::int32_t voice_time = 0;
-    std::int32_t video_factor = 100;
-    std::int32_t video_time = 0;
 };
 
 struct Line {
@@ -88,11 +58,6 @@ struct Line {
 
     AutoResponse auto_response = AutoResponse::kOff;
     std::int32_t auto_response_delay = 0;
-    TtyMode tty_mode = TtyMode::kOff;
-    std::string tty_received;
-    AudioPath audio_path = AudioPath::kCellular;
-    std::optional<Ssac> ssac;
-    std::optional<EmergencyPdn> emergency_pdn;
 };
 
 } // namespace sim

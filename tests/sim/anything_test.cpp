@@ -109,11 +109,11 @@ void Anything::ask_of_a_call(int slot, int id) {
     case 3:
         return static_cast<void>(calls_.resume(slot, id));
     case 4:
-        return static_cast<void>(calls_.change(slot, id, value<CallType>()));
+        return static_cast<void>(changes_.change(slot, id, value<CallType>()));
     case 5:
-        return static_cast<void>(calls_.accept_change(slot, id));
+        return static_cast<void>(changes_.accept(slot, id));
     case 6:
-        return static_cast<void>(calls_.reject_change(slot, id));
+        return static_cast<void>(changes_.reject(slot, id));
     case 7:
         return static_cast<void>(calls_.add_participant(slot, id, session(slot)));
     case 8:
@@ -126,10 +126,10 @@ void Anything::ask_of_a_call(int slot, int id) {
     case 11:
         return static_cast<void>(calls_.start_nway(slot, id, session(slot), value<CallType>()));
     case 12:
-        return static_cast<void>(calls_.send_dtmf(slot, id, one_of({"", "1", "1*#D", "x"})));
+        return static_cast<void>(media_.send_dtmf(slot, id, one_of({"", "1", "1*#D", "x"})));
     case 13:
-        return static_cast<void>(below(2) == 0 ? calls_.handover_started(slot, id)
-                                               : calls_.handover_failed(slot, id));
+        return static_cast<void>(below(2) == 0 ? radio_.handover_started(slot, id)
+                                               : radio_.handover_failed(slot, id));
     default:
         return static_cast<void>(calls_.answer(slot, id, value<CallType>()));
     }

@@ -67,6 +67,9 @@ class NetworkTest : public testing::Test {
     Registrations &registrations_ = network_.registrations;
     SupplementaryServices &services_ = network_.services;
     CallModel &calls_ = network_.calls;
+    CallMedia &media_ = calls_.media();
+    CallChanges &changes_ = calls_.changes();
+    CallRadio &radio_ = calls_.radio();
     VideoTelephony &video_ = network_.video;
     UssdService &ussd_ = network_.ussd;
     Logins &logins_ = network_.logins;

@@ -302,18 +302,18 @@ TEST_F(CallConference, ParticipantsAreAddedAndRemovedByNumber) {
 
 TEST_F(CallConference, ItsCallsKeepTheirType) {
     const int conference = confer();
-    expect_refused(calls_.upgrade(0, conference, CallType::kVideo), Result::kWrongState,
+    expect_refused(changes_.upgrade(0, conference, CallType::kVideo), Result::kWrongState,
                    "cannot change");
-    expect_refused(calls_.upgrade(0, 1, CallType::kVideo), Result::kWrongState, "cannot change");
+    expect_refused(changes_.upgrade(0, 1, CallType::kVideo), Result::kWrongState, "cannot change");
 }
 
 TEST_F(CallConference, AnOpenChangeRequestLapsesWhenTheCallJoins) {
     const auto first = connect(0, 1);
     expect_accepted(calls_.hold(0, first.caller));
     const auto second = connect(0, 2);
-    expect_accepted(calls_.upgrade(0, second.caller, CallType::kVideo));
+    expect_accepted(changes_.upgrade(0, second.caller, CallType::kVideo));
     ASSERT_TRUE(calls_.merge(0));
-    expect_refused(calls_.accept_change(2, second.callee), Result::kWrongState,
+    expect_refused(changes_.accept(2, second.callee), Result::kWrongState,
                    "has asked for no change");
 }
 

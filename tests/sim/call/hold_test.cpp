@@ -88,14 +88,14 @@ TEST_F(CallHold, RequestsThatMakeNoSenseAreRefusedAndChangeNothing) {
 
 TEST_F(CallHold, NothingIsHeldDuringAHandover) {
     const auto pair = active_and_held(0);
-    expect_accepted(calls_.handover_started(0, pair.active));
+    expect_accepted(radio_.handover_started(0, pair.active));
     expect_refused(calls_.swap(0), Result::kWrongState, "handover");
     expect_accepted(calls_.end(0, pair.held));
     expect_refused(calls_.hold(0, pair.active), Result::kWrongState, "handover");
     const auto waiting = ring(1, 0);
     expect_refused(calls_.answer(0, waiting.callee, CallType::kVoice), Result::kWrongState,
                    "handover");
-    expect_accepted(calls_.handover_failed(0, pair.active));
+    expect_accepted(radio_.handover_failed(0, pair.active));
     expect_accepted(calls_.hold(0, pair.active));
 }
 

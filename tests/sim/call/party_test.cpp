@@ -84,22 +84,22 @@ TEST_F(Parties, HoldsAndResumes) {
 TEST_F(Parties, AsksForVideo) {
     EXPECT_THAT(call("+15550209", 4s), ElementsAre(kProceeds, kRings, answers("+15550209"),
                                                    "CallChangeRequest (1, 1, 'YXVkaW8sdmlkZW8=')"));
-    expect_accepted(calls_.accept_change(0, 1));
+    expect_accepted(changes_.accept(0, 1));
     EXPECT_THAT(take(0), ElementsAre("CallSwitched (1, 1)"));
 }
 
 TEST_F(Parties, AsksForVideoInVain) {
     call("+15550209", 4s);
-    expect_accepted(calls_.reject_change(0, 1));
+    expect_accepted(changes_.reject(0, 1));
     EXPECT_THAT(take(0), IsEmpty());
     EXPECT_EQ(calls_.list(0).front().type, CallType::kVoice);
-    expect_refused(calls_.accept_change(0, 1), Result::kWrongState, "has asked for no change");
+    expect_refused(changes_.accept(0, 1), Result::kWrongState, "has asked for no change");
 }
 
 TEST_F(Parties, WaitsAQuarterOfAMinuteForTheAnswer) {
     call("+15550209", 4s);
     advance(15s);
-    expect_refused(calls_.accept_change(0, 1), Result::kWrongState, "has asked for no change");
+    expect_refused(changes_.accept(0, 1), Result::kWrongState, "has asked for no change");
 }
 
 TEST_F(Parties, DoesNotAskForVideoWhileOnHold) {
@@ -112,7 +112,7 @@ TEST_F(Parties, DoesNotAskForVideoWhileOnHold) {
 
 TEST_F(Parties, RefusesChanges) {
     call("+15550210", 3s);
-    expect_accepted(calls_.upgrade(0, 1, CallType::kVideo));
+    expect_accepted(changes_.upgrade(0, 1, CallType::kVideo));
     advance(1s);
     EXPECT_THAT(take(0), ElementsAre("CallError (1, 488, 'the change request was rejected')"));
     EXPECT_EQ(calls_.list(0).front().type, CallType::kVoice);

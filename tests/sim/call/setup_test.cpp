@@ -228,7 +228,7 @@ TEST_F(CallSetup, EmergencyCallsAreAnsweredAtOnceAndGetTheLine) {
                    "is an emergency call");
     expect_refused(calls_.hold(0, id), Result::kWrongState, "is an emergency call");
     expect_refused(calls_.swap(0), Result::kWrongState, "is an emergency call");
-    expect_refused(calls_.upgrade(0, id, CallType::kVideo), Result::kWrongState, "emergency");
+    expect_refused(changes_.upgrade(0, id, CallType::kVideo), Result::kWrongState, "emergency");
     expect_refused(calls_.merge(0), Result::kWrongState, "is an emergency call");
 }
 

@@ -11,8 +11,8 @@ class Registering : public NetworkTest {
     static constexpr const char *kFlightMode = "RegistrationStatus (false, 0, 0, 2, 0, 0)";
 
     void register_bearer(int slot) {
-        expect_accepted(calls_.set_emergency_pdn(slot, {"rmnet1", {"192.0.2.1"}, "192.0.2.7"}));
-        expect_accepted(calls_.register_emergency_pdn(slot));
+        expect_accepted(radio_.set_emergency_pdn(slot, {"rmnet1", {"192.0.2.1"}, "192.0.2.7"}));
+        expect_accepted(radio_.register_emergency_pdn(slot));
     }
 };
 
@@ -65,15 +65,15 @@ TEST_F(Registering, FlightModeCutsARegistrationShort) {
 TEST_F(Registering, TheEmergencyBearerIsAnnounced) {
     register_bearer(0);
     EXPECT_THAT(take(0), ElementsAre("EmergencyRegistrationStatus (true, 1, 0)"));
-    expect_refused(calls_.register_emergency_pdn(0), Result::kWrongState, "already");
-    expect_accepted(calls_.deregister_emergency_pdn(0));
+    expect_refused(radio_.register_emergency_pdn(0), Result::kWrongState, "already");
+    expect_accepted(radio_.deregister_emergency_pdn(0));
     EXPECT_THAT(take(0), ElementsAre("EmergencyRegistrationStatus (false, 0, 0)"));
     register_bearer(0);
     forget_events();
     expect_accepted(registrations_.enable_flight_mode(0));
     EXPECT_THAT(take(0), ElementsAre("EmergencyRegistrationStatus (false, 0, 2)", kFlightMode));
-    expect_refused(calls_.register_emergency_pdn(0), Result::kWrongState, "flight mode");
-    expect_refused(calls_.deregister_emergency_pdn(0), Result::kWrongState, "not registered");
+    expect_refused(radio_.register_emergency_pdn(0), Result::kWrongState, "flight mode");
+    expect_refused(radio_.deregister_emergency_pdn(0), Result::kWrongState, "not registered");
 }
 
 TEST_F(Registering, FlightModeEndsEverythingBeforeItIsAnnounced) {

@@ -310,12 +310,12 @@ TEST_F(VideoCall, VideoGoesWithTheRadio) {
 TEST_F(VideoCall, ACallThatBecomesAVoiceCallStartsAnewAsAVideoCall) {
     expect_accepted(video_.start_camera(0, id_, Camera::kFront));
     expect_accepted(video_.set_active(0, id_));
-    expect_accepted(calls_.downgrade(0, id_, CallType::kVoice));
+    expect_accepted(changes_.downgrade(0, id_, CallType::kVoice));
     EXPECT_EQ(video_.find(0, id_), nullptr);
     EXPECT_EQ(video_.active(0), 0);
     wrong_state(video_.stop_camera(0, id_), "no video call");
-    expect_accepted(calls_.upgrade(0, id_, CallType::kVideo));
-    expect_accepted(calls_.accept_change(1, calls_.list(1).front().session_id));
+    expect_accepted(changes_.upgrade(0, id_, CallType::kVideo));
+    expect_accepted(changes_.accept(1, calls_.list(1).front().session_id));
     wrong_state(video_.stop_camera(0, id_), "start one first");
 }
 

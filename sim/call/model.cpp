@@ -12,104 +12,23 @@ namespace {
 constexpr std::chrono::seconds kNetworkRingTime{30};
 constexpr std::int32_t kMaxAutoResponseDelay = 60;
 
-std::string session_ids(const Line &line) {
-    std::string ids;
-    for (const auto &[id, session] : line.sessions)
-        ids += fmt::format("{}{}", ids.empty() ? "" : ", ", id);
-    return ids.empty() ? "there is no call" : "the calls are " + ids;
-}
-
 } // namespace
 
 CallModel::CallModel(const NumberPlan &plan, Timers &timers, Registrations &registrations,
                      const SupplementaryServices &services, std::chrono::nanoseconds ring_time,
                      Sink sink)
     : plan_(plan), timers_(timers), registrations_(registrations), services_(services),
-      ring_time_(ring_time), sink_(std::move(sink)), lines_(plan.slots()) {}
-
-Session *CallModel::find(SessionRef ref) {
-    auto &sessions = lines_[ref.slot].sessions;
-    const auto found = sessions.find(ref.id);
-    return found == sessions.end() ? nullptr : &found->second;
-}
-
-Answer<Session *> CallModel::existing(int slot, int id) {
-    if (Session *session = find({slot, id}))
-        return session;
-    return refuse(Result::kUnknownSession, "there is no call {}: {}", id,
-                  session_ids(lines_[slot]));
-}
-
-Answer<Session *> CallModel::established(int slot, int id) {
-    auto session = existing(slot, id);
-    if (session && !(*session)->established())
-        return refuse(Result::kWrongState, "call {} is not established yet", id);
-    return session;
-}
-
-Answer<Session *> CallModel::talking(int slot, int id) {
-    auto session = established(slot, id);
-    if (session && (*session)->held_here)
-        return refuse(Result::kWrongState, "call {} is on hold", id);
-    return session;
-}
-
-const Session *CallModel::context(int slot, bool held) const {
-    for (const auto &[id, session] : lines_[slot].sessions)
-        if (session.established() && session.conference == 0 && session.held_here == held)
-            return &session;
-    return nullptr;
-}
-
-Session *CallModel::context(int slot, bool held) {
-    const Session *found = std::as_const(*this).context(slot, held);
-    return found ? find(found->ref) : nullptr;
-}
-
-const Session *CallModel::being_set_up(int slot) const {
-    for (const auto &[id, session] : lines_[slot].sessions)
-        if (!session.established())
-            return &session;
-    return nullptr;
-}
-
-CallState CallModel::state_of(const Session &session) const {
-    switch (session.phase) {
-    case Phase::kDialing:
-        return CallState::kDialing;
-    case Phase::kAlerting:
-        return CallState::kAlerting;
-    case Phase::kIncoming:
-        return has_established(session.ref.slot) ? CallState::kWaiting : CallState::kIncoming;
-    case Phase::kEstablished:
-        break;
-    }
-    if (session.held_here)
-        return CallState::kHeld;
-    return session.held_by_peer ? CallState::kHeldByPeer : CallState::kActive;
-}
-
-bool CallModel::has_established(int slot) const {
-    return std::ranges::any_of(lines_[slot].sessions,
-                               [](const auto &entry) { return entry.second.established(); });
-}
+      ring_time_(ring_time), sessions_(plan.slots(), std::move(sink)),
+      media_(sessions_, plan.slots()), changes_(sessions_, timers, plan.slots()),
+      radio_(sessions_, registrations, plan.slots()) {}
 
 std::vector<CallInfo> CallModel::list(int slot) const {
     std::vector<CallInfo> calls;
-    for (const auto &[id, session] : lines_[slot].sessions)
+    for (const auto &[id, session] : sessions_[slot].sessions)
         calls.push_back({id, session.peer_uri, session.type, session.mobile_originated,
-                         state_of(session), session.is_conference || session.conference != 0});
+                         sessions_.state_of(session),
+                         session.is_conference || session.conference != 0});
     return calls;
-}
-
-Session &CallModel::add_session(int slot, CallType type, Phase phase) {
-    Line &here = lines_[slot];
-    const int id = here.next_session++;
-    Session &session = here.sessions[id];
-    session.ref = {slot, id};
-    session.type = type;
-    session.phase = phase;
-    return session;
 }
 
 std::optional<Refusal> CallModel::cannot_dial(int slot, std::string_view number,
@@ -122,15 +41,13 @@ std::optional<Refusal> CallModel::cannot_dial(int slot, std::string_view number,
         return refuse(Result::kInvalidArgument, "{} is no emergency number (112, 911 are)", number);
     if (auto refusal = registrations_.radio_off(slot))
         return refusal;
-    const auto &ssac = lines_[slot].ssac;
-    const bool video = type == CallType::kVideo;
-    if (!emergency && ssac && (video ? ssac->video_factor : ssac->voice_factor) == 0)
-        return refuse(Result::kBarred, "the cell bars {} calls (UpdateSsacInfo set the factor 0)",
-                      video ? "video" : "voice");
-    if (!emergency)
+    if (!emergency) {
+        if (auto refusal = radio_.bars(slot, type))
+            return refusal;
         if (auto refusal = services_.bars_outgoing(slot, number, type))
             return refusal;
-    for (const auto &[id, session] : lines_[slot].sessions)
+    }
+    for (const auto &[id, session] : sessions_[slot].sessions)
         if (session.type == CallType::kEmergency)
             return refuse(Result::kLineInUse, "call {} is an emergency call", id);
     return std::nullopt;
@@ -145,9 +62,9 @@ std::optional<Refusal> CallModel::cannot_dial_all(int slot, const std::vector<st
 }
 
 std::optional<Refusal> CallModel::line_in_use(int slot) const {
-    if (const Session *other = being_set_up(slot))
+    if (const Session *other = sessions_.being_set_up(slot))
         return refuse(Result::kLineInUse, "call {} is still being set up", other->ref.id);
-    if (const Session *active = context(slot, false))
+    if (const Session *active = sessions_.context(slot, false))
         return refuse(Result::kLineInUse, "call {} is active: hold or end it first",
                       active->ref.id);
     return std::nullopt;
@@ -167,10 +84,10 @@ Answer<int> CallModel::make_call(int slot, const DialRequest &request) {
 }
 
 void CallModel::clear_line(int slot) {
-    while (const Session *other = being_set_up(slot))
+    while (const Session *other = sessions_.being_set_up(slot))
         finish(other->ref, EndReason::kLocalHangUp, EndReason::kRemoteHangUp);
-    if (Session *active = context(slot, false)) {
-        if (const Session *held = context(slot, true))
+    if (Session *active = sessions_.context(slot, false)) {
+        if (const Session *held = sessions_.context(slot, true))
             finish(held->ref, EndReason::kLocalHangUp, EndReason::kRemoteHangUp);
         set_hold(*active, true);
     }
@@ -178,7 +95,7 @@ void CallModel::clear_line(int slot) {
 
 Session &CallModel::dial(int slot, std::string_view number, const DialRequest &request) {
     const CallType type = is_emergency(number) ? CallType::kEmergency : request.type;
-    Session &session = add_session(slot, type, Phase::kDialing);
+    Session &session = sessions_.add(slot, type, Phase::kDialing);
     session.mobile_originated = true;
     session.number = number;
     session.route = number;
@@ -190,10 +107,10 @@ Session &CallModel::dial(int slot, std::string_view number, const DialRequest &r
 }
 
 std::optional<Refusal> CallModel::cannot_ring(int slot, CallType type) const {
-    if (const Session *other = being_set_up(slot))
+    if (const Session *other = sessions_.being_set_up(slot))
         return refuse(Result::kLineInUse, "call {} of slot {} is still being set up", other->ref.id,
                       slot);
-    if (has_established(slot) && !services_.may_wait(slot, type))
+    if (sessions_.has_established(slot) && !services_.may_wait(slot, type))
         return refuse(Result::kLineInUse, "slot {} has a call, and call waiting is off", slot);
     return std::nullopt;
 }
@@ -202,13 +119,13 @@ Answer<Session *> CallModel::offer(int slot, std::string_view from, CallType typ
                                    std::string_view called, const PassedTexts &texts) {
     if (auto refusal = cannot_ring(slot, type))
         return *refusal;
-    Session &session = add_session(slot, type, Phase::kIncoming);
+    Session &session = sessions_.add(slot, type, Phase::kIncoming);
     session.number = from;
     session.peer_uri = to_uri(from);
-    const bool waiting = state_of(session) == CallState::kWaiting;
-    emit(slot,
-         CallIncomingInd{session.ref.id, session.peer_uri, type, to_uri(called), texts, waiting});
-    const Line &here = lines_[slot];
+    const bool waiting = sessions_.state_of(session) == CallState::kWaiting;
+    sessions_.emit(slot, CallIncomingInd{session.ref.id, session.peer_uri, type, to_uri(called),
+                                         texts, waiting});
+    const Line &here = sessions_[slot];
     const bool responds = here.auto_response != AutoResponse::kOff &&
                           !(waiting && here.auto_response == AutoResponse::kAnswer);
     if (responds)
@@ -219,11 +136,11 @@ Answer<Session *> CallModel::offer(int slot, std::string_view from, CallType typ
 }
 
 void CallModel::respond_automatically(SessionRef ref) {
-    const Session *session = find(ref);
+    const Session *session = sessions_.find(ref);
     // A call that has come to wait meanwhile is the user's to answer.
-    if (!session || state_of(*session) != CallState::kIncoming)
+    if (!session || sessions_.state_of(*session) != CallState::kIncoming)
         return;
-    switch (lines_[ref.slot].auto_response) {
+    switch (sessions_[ref.slot].auto_response) {
     case AutoResponse::kOff:
         return;
     case AutoResponse::kAnswer:
@@ -249,7 +166,7 @@ Answer<int> CallModel::call_from_network(int slot, std::string_view number, Call
 }
 
 Status CallModel::answer(int slot, int id, CallType type) {
-    const auto found = existing(slot, id);
+    const auto found = sessions_.existing(slot, id);
     if (!found)
         return found.refusal();
     Session &session = **found;
@@ -259,11 +176,11 @@ Status CallModel::answer(int slot, int id, CallType type) {
         return refuse(Result::kInvalidArgument,
                       "call {} is of type {}; it can be answered as that or as voice, not as {}",
                       id, session.type, type);
-    for (const auto &[other, state] : lines_[slot].sessions)
+    for (const auto &[other, state] : sessions_[slot].sessions)
         if (other != id && !state.established() && state.conference == 0)
             return refuse(Result::kLineInUse, "call {} is still being set up", other);
-    if (Session *active = context(slot, false)) {
-        if (const Session *held = context(slot, true))
+    if (Session *active = sessions_.context(slot, false)) {
+        if (const Session *held = sessions_.context(slot, true))
             return refuse(Result::kTooMany,
                           "call {} is active and call {} on hold: end one of them first",
                           active->ref.id, held->ref.id);
@@ -277,7 +194,7 @@ Status CallModel::answer(int slot, int id, CallType type) {
 }
 
 Status CallModel::end(int slot, int id) {
-    const auto session = existing(slot, id);
+    const auto session = sessions_.existing(slot, id);
     if (!session)
         return session.refusal();
     if ((*session)->phase == Phase::kIncoming)
@@ -287,7 +204,7 @@ Status CallModel::end(int slot, int id) {
 }
 
 Status CallModel::reject(int slot, int id, RejectReason reason) {
-    const auto session = existing(slot, id);
+    const auto session = sessions_.existing(slot, id);
     if (!session)
         return session.refusal();
     if ((*session)->phase != Phase::kIncoming)
@@ -302,7 +219,7 @@ Status CallModel::reject(int slot, int id, RejectReason reason) {
         return Done{};
     }
     if (busy && (*session)->peer)
-        emit((*session)->peer->slot, CallBusy{(*session)->peer->id});
+        sessions_.emit((*session)->peer->slot, CallBusy{(*session)->peer->id});
     const auto why = busy ? EndReason::kBusy : EndReason::kDeclined;
     finish({slot, id}, why, why);
     return Done{};
@@ -315,8 +232,8 @@ Status CallModel::set_auto_response(int slot, AutoResponse mode, std::int32_t de
     if (delay_seconds < 0 || delay_seconds > kMaxAutoResponseDelay)
         return refuse(Result::kInvalidArgument, "a delay is 0 to {} seconds, not {}",
                       kMaxAutoResponseDelay, delay_seconds);
-    lines_[slot].auto_response = mode;
-    lines_[slot].auto_response_delay = delay_seconds;
+    sessions_[slot].auto_response = mode;
+    sessions_[slot].auto_response_delay = delay_seconds;
     return Done{};
 }
 
@@ -324,36 +241,37 @@ void CallModel::mark_established(Session &session) {
     session.ring_timer.cancel();
     session.auto_response_timer.cancel();
     session.phase = Phase::kEstablished;
-    emit(session.ref.slot, CallEstablished{session.ref.id, session.type, session.mobile_originated,
-                                           session.peer_uri, session.conference != 0});
+    sessions_.emit(session.ref.slot,
+                   CallEstablished{session.ref.id, session.type, session.mobile_originated,
+                                   session.peer_uri, session.conference != 0});
     if (session.conference != 0)
         member_answered(session);
 }
 
 void CallModel::establish(Session &session) {
     mark_established(session);
-    if (Session *peer = session.peer ? find(*session.peer) : nullptr) {
+    if (Session *peer = sessions_.peer_of(session)) {
         peer->type = session.type;
         mark_established(*peer);
     }
 }
 
 void CallModel::finish(SessionRef ref, EndReason here, EndReason there) {
-    const auto node = lines_[ref.slot].sessions.extract(ref.id);
+    const auto node = sessions_[ref.slot].sessions.extract(ref.id);
     if (node.empty())
         return;
     const Session &session = node.mapped();
-    for (const SessionRef member : member_refs(session))
+    changes_.drop(ref);
+    for (const SessionRef member : sessions_.members_of(session))
         finish(member, EndReason::kConferenceOver, there);
     leave_conference(session);
-    emit(ref.slot, CallEnded{ref.id, here});
+    sessions_.emit(ref.slot, CallEnded{ref.id, here});
     if (session.peer)
         finish(*session.peer, there, here);
-    if (Session *conference = conference_session(session);
-        conference && member_refs(*conference).empty())
+    if (Session *conference = sessions_.conference_of(session);
+        conference && sessions_.members_of(*conference).empty())
         finish(conference->ref, EndReason::kConferenceOver, EndReason::kConferenceOver);
-    if (lines_[ref.slot].sessions.empty())
-        lines_[ref.slot].tty_received.clear();
+    media_.forget(ref);
 }
 
 } // namespace sim
