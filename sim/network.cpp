@@ -1,8 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "sim/network.hpp"
 
-#include "sim/ptt/participants.hpp"
-
 #include <utility>
 
 namespace sim {
@@ -37,13 +35,6 @@ void Network::take_away(int slot) {
     centre.take_back(slot);
     ptt.drop_calls(slot);
     ptt_files.drop_transfers(slot);
-}
-
-std::vector<ParticipantInfo> Network::running_sessions(int slot) const {
-    std::vector<ParticipantInfo> sessions;
-    for (const PttRunningCall &call : ptt.running(slot))
-        sessions.push_back(participant_info(call));
-    return sessions;
 }
 
 } // namespace sim

@@ -5,7 +5,6 @@
 #include "sim/base/number_plan.hpp"
 #include "sim/call/model.hpp"
 #include "sim/call/ussd.hpp"
-#include "sim/group/answers.hpp"
 #include "sim/group/model.hpp"
 #include "sim/ptt/directory.hpp"
 #include "sim/ptt/files.hpp"
@@ -46,9 +45,6 @@ struct Network {
     Network(NetworkOptions options, Timers &timers, const NetworkSinks &sinks);
     Network(const Network &) = delete;
     Network &operator=(const Network &) = delete;
-
-    // The push-to-talk sessions of a slot, as whoever asks about participants is told of them.
-    std::vector<ParticipantInfo> running_sessions(int slot) const;
 
     NumberPlan plan;
     Registrations registrations;

@@ -3,7 +3,6 @@
 
 #include "sim/call/signals.hpp"
 #include "sim/group/store.hpp"
-#include "sim/ptt/signals.hpp"
 #include "sim/settings/store.hpp"
 
 #include <ctime>
@@ -42,7 +41,7 @@ StandIn::StandIn(const Options &options, const Log &log, MainLoop &loop)
       ptt_interface_(network_.ptt, network_.ptt_recorder, network_.ptt_messages,
                      network_.ptt_files),
       group_interface_(network_.groups, network_.plan, network_.registrations,
-                       [this](int slot) { return network_.running_sessions(slot); }) {
+                       [this](int slot) { return network_.ptt.running(slot); }) {
     loop.drive(timers_);
     service_.add(registration_interface_.describe());
     service_.add(login_interface_.describe());

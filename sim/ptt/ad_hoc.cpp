@@ -78,8 +78,8 @@ Answer<std::int32_t> PttCalls::make_ad_hoc_call(int slot, const PttAdHocRequest 
     return call.participants.at(call.owner).session;
 }
 
-Answer<PttCalls::Place> PttCalls::owned_ad_hoc(int slot, std::int32_t session) {
-    const auto place = connected(slot, session);
+Answer<PttSessions::Place> PttCalls::owned_ad_hoc(int slot, std::int32_t session) {
+    const auto place = sessions_.connected(slot, session);
     if (!place)
         return place;
     if (place->call.type != PttCallType::kAdHoc)
@@ -154,8 +154,8 @@ PttGroupAdvertisement PttCalls::advertisement_of(const PttCall &call,
 }
 
 void PttCalls::advertise(int slot, PttGroupAdvertisement advertisement) {
-    advertisement.number = lines_[slot].next_advertisement++;
-    sink_(slot, advertisement);
+    advertisement.number = sessions_[slot].next_advertisement++;
+    sessions_.emit(slot, advertisement);
 }
 
 } // namespace sim

@@ -2,15 +2,21 @@
 #pragma once
 
 #include "sim/base/clock.hpp"
+#include "sim/base/per_slot.hpp"
+#include "sim/base/result.hpp"
 #include "sim/ptt/directory.hpp"
 #include "sim/ptt/events.hpp"
 #include "sim/ptt/floor.hpp"
 
 #include <chrono>
+#include <cstdint>
+#include <functional>
 #include <map>
 #include <optional>
 #include <set>
 #include <string>
+#include <string_view>
+#include <utility>
 #include <vector>
 
 namespace sim {
@@ -82,10 +88,58 @@ struct PttCall {
     std::optional<PttChange> change;
 
     bool is_group() const { return type != PttCallType::kOneToOne; }
+    std::int32_t connected_count() const;
     PttParticipant *find(int who) {
         const auto found = participants.find(who);
         return found == participants.end() ? nullptr : &found->second;
     }
+};
+
+// What a slot has of push-to-talk.
+struct PttLine {
+    std::int32_t next_session = 1;
+    std::map<std::int32_t, PttRef> sessions;
+    std::int32_t channel = 0;
+    PttChannelMode channel_mode = PttChannelMode::kTalkAndListen;
+    std::int32_t next_advertisement = 1;
+    Timer keep_alive;
+};
+
+// The calls and the sessions that slots have in them as they stand, and who is told of them: what
+// the parts of the push-to-talk model share.
+class PttSessions {
+  public:
+    using Sink = std::function<void(int slot, const PttEvent &event)>;
+
+    // A slot's session: the call and the slot's part in it.
+    struct Place {
+        PttCall &call;
+        PttParticipant &self;
+    };
+
+    PttSessions(int slots, Sink sink) : sink_(std::move(sink)), lines_(slots) {}
+
+    PttLine &operator[](int slot) { return lines_[slot]; }
+    const PttLine &operator[](int slot) const { return lines_[slot]; }
+    std::map<int, PttCall> &calls() { return calls_; }
+    const std::map<int, PttCall> &calls() const { return calls_; }
+    PttCall *find(int call);
+    PttParticipant *find(PttRef ref);
+
+    // What requests stand on: the session in the state that they need, or the refusal.
+    Answer<Place> existing(int slot, std::int32_t session);
+    Answer<Place> connected(int slot, std::int32_t session);
+
+    void emit(int slot, const PttEvent &event) const { sink_(slot, event); }
+    void emit(const PttParticipant &participant, const PttEvent &event) const;
+    // Tells the others in a group.
+    void tell_status(const PttCall &call, const PttParticipant &participant,
+                     std::string_view status) const;
+
+  private:
+    Sink sink_;
+    PerSlot<PttLine> lines_;
+    std::map<int, PttCall> calls_;
 };
 
 } // namespace sim

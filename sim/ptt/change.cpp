@@ -1,8 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// Other media and other terms for a call that goes on.
-#include "sim/ptt/model.hpp"
+#include "sim/ptt/change.hpp"
 
 #include "sim/ptt/media.hpp"
+
+#include <utility>
 
 namespace sim {
 
@@ -13,8 +14,8 @@ constexpr std::chrono::milliseconds kPartyAnswers{500};
 
 } // namespace
 
-Status PttCalls::modify(int slot, const PttModifyRequest &request) {
-    const auto place = connected(slot, request.session);
+Status PttChanges::modify(int slot, const PttModifyRequest &request) {
+    const auto place = sessions_.connected(slot, request.session);
     if (!place)
         return place.refusal();
     auto &[call, self] = *place;
@@ -29,42 +30,42 @@ Status PttCalls::modify(int slot, const PttModifyRequest &request) {
         return refuse(Result::kWrongState, "another change of session {} waits for its answer",
                       request.session);
     if (request.changes_media)
-        offer_change(call, self, request);
+        offer(call, self, request);
     else {
         // Terms are between the participant and the network.
         self.terms = request.terms;
-        tell_change(self, request, true);
+        tell(self, request, true);
     }
     return Done{};
 }
 
-void PttCalls::offer_change(PttCall &call, PttParticipant &asker, const PttModifyRequest &request) {
+void PttChanges::offer(PttCall &call, PttParticipant &asker, const PttModifyRequest &request) {
     PttChange &change = call.change.emplace();
     change.asker = asker.ref.who;
     change.request = request;
     change.request.media = or_usual(request.media);
     change.patience =
-        timers_.after_unscaled(kPatience, [this, id = call.id] { conclude_change(*find(id)); });
+        timers_.after_unscaled(kPatience, [this, id = call.id] { conclude(*sessions_.find(id)); });
     for (auto &[who, other] : call.participants) {
         if (!other.connected() || who == asker.ref.who)
             continue;
         change.waiting.insert(who);
         PttModifyRequest offer = change.request;
         offer.session = other.session;
-        emit(other, offer);
+        sessions_.emit(other, offer);
         if (!other.is_slot())
-            other.patience = timers_.after(kPartyAnswers,
-                                           [this, ref = other.ref] { party_answers_change(ref); });
+            other.patience =
+                timers_.after(kPartyAnswers, [this, ref = other.ref] { party_answers(ref); });
     }
     if (change.waiting.empty()) {
         change.accepted = true;
         change.common = change.request.media;
-        conclude_change(call);
+        conclude(call);
     }
 }
 
-Status PttCalls::accept_modify(int slot, const PttModifyRequest &request) {
-    const auto place = connected(slot, request.session);
+Status PttChanges::accept(int slot, const PttModifyRequest &request) {
+    const auto place = sessions_.connected(slot, request.session);
     if (!place)
         return place.refusal();
     auto &[call, self] = *place;
@@ -85,23 +86,23 @@ Status PttCalls::accept_modify(int slot, const PttModifyRequest &request) {
         self.terms = request.terms;
     PttModifyRequest told = call.change->request;
     told.changes_terms = request.changes_terms;
-    tell_change(self, told, true);
-    settle_change(call, self.ref.who, media);
+    tell(self, told, true);
+    settle(call, self.ref.who, media);
     return Done{};
 }
 
-Status PttCalls::reject_modify(int slot, std::int32_t session) {
-    const auto place = connected(slot, session);
+Status PttChanges::reject(int slot, std::int32_t session) {
+    const auto place = sessions_.connected(slot, session);
     if (!place)
         return place.refusal();
     auto &[call, self] = *place;
     if (!call.change || !call.change->waiting.contains(self.ref.who))
         return refuse(Result::kWrongState, "nobody has offered a change of session {}", session);
-    settle_change(call, self.ref.who, std::nullopt);
+    settle(call, self.ref.who, std::nullopt);
     return Done{};
 }
 
-void PttCalls::settle_change(PttCall &call, int who, std::optional<FourIntegers> accepted) {
+void PttChanges::settle(PttCall &call, int who, std::optional<FourIntegers> accepted) {
     if (!call.change)
         return;
     PttChange &change = *call.change;
@@ -115,10 +116,10 @@ void PttCalls::settle_change(PttCall &call, int who, std::optional<FourIntegers>
             change.common[i] |= (*accepted)[i];
     }
     if (change.waiting.empty())
-        conclude_change(call);
+        conclude(call);
 }
 
-void PttCalls::conclude_change(PttCall &call) {
+void PttChanges::conclude(PttCall &call) {
     const PttChange change = std::move(*call.change);
     call.change.reset();
     PttParticipant &asker = call.participants.at(change.asker);
@@ -128,14 +129,37 @@ void PttCalls::conclude_change(PttCall &call) {
         if (change.request.changes_terms)
             asker.terms = change.request.terms;
     }
-    tell_change(asker, change.request, change.accepted);
+    tell(asker, change.request, change.accepted);
 }
 
-void PttCalls::tell_change(PttParticipant &participant, const PttModifyRequest &request,
-                           bool accepted) {
-    emit(participant, PttModifyStatus{accepted, request.changes_media, request.changes_terms,
-                                      participant.session, request.reference, participant.media,
-                                      participant.terms});
+void PttChanges::tell(PttParticipant &participant, const PttModifyRequest &request, bool accepted) {
+    sessions_.emit(participant,
+                   PttModifyStatus{accepted, request.changes_media, request.changes_terms,
+                                   participant.session, request.reference, participant.media,
+                                   participant.terms});
+}
+
+void PttChanges::ask_video(PttRef ref) {
+    PttCall &call = *sessions_.find(ref.call);
+    PttParticipant &self = *call.find(ref.who);
+    if (call.change)
+        return;
+    PttModifyRequest request;
+    request.changes_media = true;
+    request.media = self.media;
+    request.media[kPttVideo] = 1;
+    offer(call, self, request);
+}
+
+void PttChanges::party_answers(PttRef ref) {
+    PttCall &call = *sessions_.find(ref.call);
+    PttParticipant &self = *call.find(ref.who);
+    if (!call.change)
+        return;
+    if (self.contact.party->habit == PttHabit::kRefusesChanges)
+        return settle(call, ref.who, std::nullopt);
+    self.media = call.change->request.media;
+    settle(call, ref.who, self.media);
 }
 
 } // namespace sim

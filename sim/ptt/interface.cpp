@@ -2,7 +2,7 @@
 #include "sim/ptt/interface.hpp"
 
 #include "sim/bus/ask.hpp"
-#include "sim/ptt/signals.hpp"
+#include "sim/bus/tell.hpp"
 #include "sim/ptt/wire.hpp"
 
 namespace sim {
@@ -65,7 +65,7 @@ Status remove_users(PttCalls &calls, int slot, int32_t session, int32_t count, i
     return calls.remove_users(slot, session, peers_of(*users));
 }
 
-Answer<std::vector<PttFloorStatus>> request_floor_status(PttCalls &calls, int slot,
+Answer<std::vector<PttFloorStatus>> request_floor_status(PttFloorControl &floor, int slot,
                                                          const Variant &session_list) {
     const auto integers = ptt_wire::integers(session_list);
     if (!integers)
@@ -76,7 +76,7 @@ Answer<std::vector<PttFloorStatus>> request_floor_status(PttCalls &calls, int sl
     for (const int32_t session : *integers)
         if (session != kNoSession)
             sessions.push_back(session);
-    return calls.floor_status(slot, sessions);
+    return floor.status(slot, sessions);
 }
 
 Answer<std::tuple<int32_t, PttNotice, int32_t>>
@@ -91,41 +91,89 @@ send_notice(PttMessages &messages, int slot, int32_t number, const string &messa
     return std::tuple(number, notice, *told);
 }
 
-constexpr MethodRow<PttCalls, PttRecorder, PttMessages, PttFiles> kMethods[] = {
-    {"PocMakeCall", ask<make_call>, kConnection},
-    {"PocMakeAdHocConfCall", ask<make_ad_hoc_call, int32_t>, kConnection},
-    {"PocAddUsersToAdHocConfCall", ask<add_users>, kConnection},
-    {"PocRemoveUsersFromAdHocConfCall", ask<remove_users>, kConnection},
-    {"PocCallConvertToCrisisCall", ask<&PttCalls::convert_to_crisis>, kConnection},
-    {"PocAnswerCall", ask<&PttCalls::answer>, kConnection},
-    {"PocRejectCall", ask<&PttCalls::reject>, kConnection},
-    {"PocEndCall", ask<&PttCalls::end>, kConnection},
-    {"PocRequestFloor", ask<&PttCalls::request_floor>, kConnection},
-    {"PocReleaseFloor", ask<&PttCalls::release_floor, FourIntegers>, kConnection},
-    {"PocRequestFloorStatus", ask<request_floor_status>, kConnection},
-    {"PocModifyCall", ask<&PttCalls::modify>, kConnection},
-    {"PocAcceptModifyCall", ask<&PttCalls::accept_modify>, kConnection},
-    {"PocRejectModifyCall", ask<&PttCalls::reject_modify>, kConnection},
-    {"PocSetChannel", ask<&PttCalls::set_channel>, kConnection},
-    {"PocStartCallRecording", ask<&PttRecorder::start>, kConnection},
-    {"PocPauseCallRecording", ask<&PttRecorder::pause>, kConnection},
-    {"PocResumeCallRecording", ask<&PttRecorder::resume>, kConnection},
-    {"PocStopCallRecording", ask<&PttRecorder::stop>, kConnection},
-    {"PocCancelCallRecording", ask<&PttRecorder::cancel>, kConnection},
-    {"PocSendMsg", ask<&PttMessages::send>, kConnection},
-    {"PocSendReceivedMsgNoti", ask<send_notice>, kConnection},
-    {"PocTransferFile", ask<&PttFiles::offer>, kConnection},
-    {"PocAcceptFileTransfer", ask<&PttFiles::accept>, kConnection},
-    // Spelt so.
-    {"PocARejectFileTransfer", ask<&PttFiles::reject>, kConnection},
-    {"PocCancelFileTransfer", ask<&PttFiles::cancel>, kConnection},
-    {"PocSendKeepAlive", ask<&PttCalls::keep_alive>, kConnection},
+constexpr MethodRow<PttCalls, PttFloorControl, PttChanges, PttRecorder, PttMessages, PttFiles>
+    kMethods[] = {
+        {"PocMakeCall", ask<make_call>, kConnection},
+        {"PocMakeAdHocConfCall", ask<make_ad_hoc_call, int32_t>, kConnection},
+        {"PocAddUsersToAdHocConfCall", ask<add_users>, kConnection},
+        {"PocRemoveUsersFromAdHocConfCall", ask<remove_users>, kConnection},
+        {"PocCallConvertToCrisisCall", ask<&PttCalls::convert_to_crisis>, kConnection},
+        {"PocAnswerCall", ask<&PttCalls::answer>, kConnection},
+        {"PocRejectCall", ask<&PttCalls::reject>, kConnection},
+        {"PocEndCall", ask<&PttCalls::end>, kConnection},
+        {"PocRequestFloor", ask<&PttFloorControl::request>, kConnection},
+        {"PocReleaseFloor", ask<&PttFloorControl::release, FourIntegers>, kConnection},
+        {"PocRequestFloorStatus", ask<request_floor_status>, kConnection},
+        {"PocModifyCall", ask<&PttChanges::modify>, kConnection},
+        {"PocAcceptModifyCall", ask<&PttChanges::accept>, kConnection},
+        {"PocRejectModifyCall", ask<&PttChanges::reject>, kConnection},
+        {"PocSetChannel", ask<&PttCalls::set_channel>, kConnection},
+        {"PocStartCallRecording", ask<&PttRecorder::start>, kConnection},
+        {"PocPauseCallRecording", ask<&PttRecorder::pause>, kConnection},
+        {"PocResumeCallRecording", ask<&PttRecorder::resume>, kConnection},
+        {"PocStopCallRecording", ask<&PttRecorder::stop>, kConnection},
+        {"PocCancelCallRecording", ask<&PttRecorder::cancel>, kConnection},
+        {"PocSendMsg", ask<&PttMessages::send>, kConnection},
+        {"PocSendReceivedMsgNoti", ask<send_notice>, kConnection},
+        {"PocTransferFile", ask<&PttFiles::offer>, kConnection},
+        {"PocAcceptFileTransfer", ask<&PttFiles::accept>, kConnection},
+        // Spelt so.
+        {"PocARejectFileTransfer", ask<&PttFiles::reject>, kConnection},
+        {"PocCancelFileTransfer", ask<&PttFiles::cancel>, kConnection},
+        {"PocSendKeepAlive", ask<&PttCalls::keep_alive>, kConnection},
+};
+
+auto floor_members(const PttFloorEvent &e) {
+    return std::tie(e.session, e.media, e.priority, e.speaker_uri, e.participants, e.speaker_name,
+                    e.position, e.seconds, e.cause, e.text);
+}
+
+// Of the events of one kind alone.
+template <PttFloorKind kKind>
+auto floor(const PttFloorEvent &e) {
+    return e.kind == kKind ? std::optional(floor_members(e)) : std::nullopt;
+}
+
+auto advertised(const PttGroupAdvertisement &e) {
+    return std::tuple(e.number, wire::Dictionary{ptt_wire::advertisement(e)});
+}
+
+constexpr SignalTable kSignals{
+    SignalRow<PttCallIncoming>{"PocCallIncomingInd"},
+    SignalRow<PttCallInProgress>{"PocCallInProgress"},
+    SignalRow<PttCallAlerting>{"PocCallAlerting"},
+    SignalRow<PttCallEstablished>{"PocCallEstablished"},
+    SignalRow<PttCallEnded>{"PocCallEnded"},
+    SignalRow{"PocCallFloorGranted", &floor<PttFloorKind::kGranted>},
+    SignalRow{"PocCallFloorRejected", &floor<PttFloorKind::kRejected>},
+    SignalRow{"PocCallFloorIdle", &floor<PttFloorKind::kIdle>},
+    SignalRow{"PocCallFloorQueuePosition", &floor<PttFloorKind::kQueuePosition>},
+    SignalRow{"PocCallFloorCanceled", &floor<PttFloorKind::kCanceled>},
+    SignalRow{"PocCallFloorTaken", &floor<PttFloorKind::kTaken>},
+    SignalRow<PttModifyRequest>{"PocCallModifyRequest"},
+    SignalRow<PttModifyStatus>{"PocCallModifyStatus"},
+    SignalRow{"PocCallFloorRequestTimeout", &floor<PttFloorKind::kTimeout>},
+    SignalRow<PttCrisisInitiated>{"PocCallCrisisCallInitiated"},
+    SignalRow{"PocGroupAdvertisement", advertised},
+    SignalRow<PttParticipantInfo>{"PocGroupConfParticipantInfo"},
+    SignalRow<PttIncomingMessage>{"PocIncomingMsgInfo"},
+    SignalRow<PttMessageNotice>{"PocMsgNotification"},
+    SignalRow<PttIncomingFile>{"PocIncomingFileTransfer"},
+    SignalRow<PttFileProgress>{"PocFileTransferProgress"},
+    SignalRow<PttFileTerminated>{"PocFileTransferTerminated"},
 };
 
 } // namespace
 
 Interface PttInterface::describe() {
-    return {kName, bind_methods(kMethods, calls_, recorder_, messages_, files_), ptt_signals()};
+    return {kName,
+            bind_methods(kMethods, calls_, calls_.floor(), calls_.changes(), recorder_, messages_,
+                         files_),
+            kSignals.infos()};
+}
+
+Signal to_signal(const PttEvent &event) {
+    return kSignals.signal_of(event);
 }
 
 } // namespace sim

@@ -2,6 +2,7 @@
 #pragma once
 
 #include "sim/bus/interface.hpp"
+#include "sim/ptt/events.hpp"
 #include "sim/ptt/files.hpp"
 #include "sim/ptt/messages.hpp"
 #include "sim/ptt/model.hpp"
@@ -24,5 +25,7 @@ class PttInterface {
     PttMessages &messages_;
     PttFiles &files_;
 };
+
+Signal to_signal(const PttEvent &event);
 
 } // namespace sim

@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
-// Asking slots and parties of the network to take part.
+// Asking slots and parties of the network to take part, and what parties do by themselves once they
+// do.
 #include "sim/ptt/model.hpp"
 
 namespace sim {
@@ -10,26 +11,28 @@ using namespace std::chrono_literals;
 
 constexpr auto kPartyAnswers = 500ms;
 constexpr auto kPartyDeclines = 2s;
+constexpr auto kStays = 3s;
+constexpr auto kSilentAtFirst = 1s;
 
 } // namespace
 
 void PttCalls::invite_all(int id) {
     // The call may end on the way: each is looked up anew.
     std::vector<PttRef> invited;
-    for (const auto &[who, participant] : find(id)->participants)
+    for (const auto &[who, participant] : sessions_.find(id)->participants)
         if (participant.phase == PttPhase::kInvited)
             invited.push_back(participant.ref);
     for (const PttRef ref : invited)
         invite(ref);
     // On a channel there may be nobody else.
-    PttCall *call = find(id);
+    PttCall *call = sessions_.find(id);
     if (call && call->type == PttCallType::kChannel && !call->established)
         connect({id, call->owner});
 }
 
 void PttCalls::invite(PttRef ref) {
-    PttCall *call = find(ref.call);
-    PttParticipant *participant = find(ref);
+    PttCall *call = sessions_.find(ref.call);
+    PttParticipant *participant = sessions_.find(ref);
     if (!participant || participant->phase != PttPhase::kInvited)
         return;
     if (participant->is_slot())
@@ -42,17 +45,18 @@ void PttCalls::invite_slot(PttCall &call, PttParticipant &participant) {
     const int slot = participant.contact.slot;
     if (!registrations_.registered(slot))
         return leave(participant.ref, PttEndReason::kUnreachable, PttEndReason::kUnreachable);
-    if (lines_[slot].sessions.size() >= kMostSessions)
+    if (sessions_[slot].sessions.size() >= kMostSessions)
         return leave(participant.ref, PttEndReason::kBusy, PttEndReason::kBusy);
     open_session(call, participant);
     const PttParticipant *owner = call.find(call.owner);
     if (call.type == PttCallType::kAdHoc)
         advertise(slot, advertisement_of(call, participant));
-    emit(participant, PttCallIncoming{call.crisis, participant.automatic, call.takes_floor,
-                                      call.is_group(), owner ? owner->uri() : "",
-                                      owner ? owner->name() : "", participant.contact.uri, call.uri,
-                                      call.name, others_text(call, participant),
-                                      participant.session, call.type, call.media, call.terms});
+    sessions_.emit(participant,
+                   PttCallIncoming{call.crisis, participant.automatic, call.takes_floor,
+                                   call.is_group(), owner ? owner->uri() : "",
+                                   owner ? owner->name() : "", participant.contact.uri, call.uri,
+                                   call.name, others_text(call, participant), participant.session,
+                                   call.type, call.media, call.terms});
     alert(call, participant);
     if (participant.automatic)
         connect(participant.ref);
@@ -89,9 +93,9 @@ void PttCalls::alert(PttCall &call, PttParticipant &participant) {
     participant.phase = PttPhase::kAlerting;
     const PttParticipant *owner = call.find(call.owner);
     if (owner && !std::exchange(call.alerted, true))
-        emit(*owner, PttCallAlerting{owner->session});
+        sessions_.emit(*owner, PttCallAlerting{owner->session});
     if (call.established)
-        tell_status(call, participant, "alerting");
+        sessions_.tell_status(call, participant, "alerting");
 }
 
 void PttCalls::expect_answer(PttParticipant &participant) {
@@ -99,6 +103,30 @@ void PttCalls::expect_answer(PttParticipant &participant) {
         timers_.after_unscaled(participant.answer_time, [this, ref = participant.ref] {
             leave(ref, PttEndReason::kMissed, PttEndReason::kNoAnswer);
         });
+}
+
+void PttCalls::practise_habit(PttCall &call, PttParticipant &participant) {
+    const PttRef ref = participant.ref;
+    switch (participant.contact.party->habit) {
+    case PttHabit::kListens:
+    case PttHabit::kRefusesChanges:
+    case PttHabit::kEchoes:
+        return;
+    case PttHabit::kLeaves:
+        participant.step = timers_.after(kStays, [this, ref] {
+            leave(ref, PttEndReason::kEndedHere, PttEndReason::kEndedByPeer);
+        });
+        return;
+    case PttHabit::kTalks:
+        participant.step = timers_.after(kSilentAtFirst, [this, id = call.id, ref] {
+            PttParticipant &self = *sessions_.find(ref);
+            floor_.ask(*sessions_.find(id), self, {ref.who, 0, {1, 0, 0, 0}, self.name()}, 0s);
+        });
+        return;
+    case PttHabit::kAsksVideo:
+        participant.step = timers_.after(kSilentAtFirst, [this, ref] { changes_.ask_video(ref); });
+        return;
+    }
 }
 
 } // namespace sim

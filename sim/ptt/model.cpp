@@ -1,75 +1,247 @@
 // SPDX-License-Identifier: Apache-2.0
-// What the parts of the model stand on, and how calls and slots' parts in them end.
+// Placing, answering and ending. Inviting is in invite.cpp.
 #include "sim/ptt/model.hpp"
 
 #include "sim/ptt/media.hpp"
 
 #include <algorithm>
+#include <utility>
 
 namespace sim {
 
+namespace {
+
+constexpr std::int32_t kUsualAnswerTime = 30;
+
+} // namespace
+
 PttCalls::PttCalls(const PttDirectory &directory, Timers &timers,
                    const Registrations &registrations, Sink sink)
-    : directory_(directory), timers_(timers), registrations_(registrations), sink_(std::move(sink)),
-      lines_(directory.slots()) {}
+    : directory_(directory), timers_(timers), registrations_(registrations),
+      sessions_(directory.slots(), std::move(sink)), floor_(sessions_, timers),
+      changes_(sessions_, timers) {}
+
+std::optional<Refusal> PttCalls::cannot_place(int slot, const PttOffer &offer) {
+    if (auto refusal = registrations_.radio_off(slot))
+        return refusal;
+    if (auto refusal = bad_media(offer.media))
+        return refusal;
+    if (auto refusal = bad_terms(offer.terms))
+        return refusal;
+    if (auto refusal = bad_seconds(offer.answer_time, "the time to answer"))
+        return refusal;
+    if (sessions_[slot].sessions.size() >= kMostSessions)
+        return refuse(Result::kTooMany, "slot {} has {} push-to-talk sessions, and no more can be",
+                      slot, kMostSessions);
+    return std::nullopt;
+}
+
+PttCall &PttCalls::add_call(int slot, PttCallType type, const PttOffer &offer) {
+    const int id = next_call_++;
+    PttCall &call = sessions_.calls()[id];
+    call.id = id;
+    call.type = type;
+    call.crisis = offer.crisis;
+    call.automatic = offer.automatic || type == PttCallType::kChannel;
+    call.takes_floor = offer.takes_floor;
+    call.media = or_usual(offer.media);
+    call.terms = offer.terms;
+    call.answer_time = seconds_or(offer.answer_time, kUsualAnswerTime);
+    PttContact caller{directory_.uri_of(slot), offer.caller_name, slot, nullptr, {}, false, 0};
+    PttParticipant &owner = add_participant(call, caller);
+    owner.placed = true;
+    owner.phase = PttPhase::kConnecting;
+    open_session(call, owner);
+    call.owner = owner.ref.who;
+    if (call.crisis)
+        call.crisis_by = call.owner;
+    call.step = timers_.after(kAcceptTime, [this, id] { proceed(id); });
+    return call;
+}
+
+PttParticipant &PttCalls::add_participant(PttCall &call, const PttContact &contact) {
+    const int who = call.next_participant++;
+    PttParticipant &participant = call.participants[who];
+    participant.ref = {call.id, who};
+    participant.contact = contact;
+    participant.automatic = call.automatic;
+    participant.answer_time = call.answer_time;
+    participant.media = call.media;
+    // The rank of the one who calls is not the others'.
+    participant.terms = call.terms;
+    if (who != 1)
+        participant.terms[kPttPriority] = 0;
+    return participant;
+}
+
+void PttCalls::open_session(PttCall &call, PttParticipant &participant) {
+    PttLine &here = sessions_[participant.contact.slot];
+    participant.session = here.next_session++;
+    participant.listens_only =
+        call.type == PttCallType::kChannel && here.channel_mode == PttChannelMode::kListenOnly;
+    here.sessions[participant.session] = participant.ref;
+}
+
+Answer<std::int32_t> PttCalls::make_call(int slot, const PttCallRequest &request) {
+    if (auto refusal = cannot_place(slot, request.offer))
+        return *refusal;
+    PttCall plan;
+    const auto called = called_by(slot, request, plan);
+    if (!called)
+        return called.refusal();
+    if (PttCall *running = plan.uri.empty() ? nullptr : running_call(plan.uri)) {
+        for (const auto &[who, participant] : running->participants)
+            if (participant.contact.slot == slot)
+                return refuse(Result::kLineInUse, "this call goes on: it is session {}",
+                              participant.session);
+        if (common_media(or_usual(request.offer.media), running->media) == FourIntegers{})
+            return refuse(Result::kInvalidArgument,
+                          "the call goes on, and has none of these media");
+        return join(*running, slot, request.offer);
+    }
+    PttCall &call = add_call(slot, request.type, request.offer);
+    call.uri = plan.uri;
+    call.name = plan.name;
+    for (const auto &contact : *called)
+        add_participant(call, contact);
+    return call.participants.at(call.owner).session;
+}
+
+Answer<std::vector<PttContact>> PttCalls::called_by(int slot, const PttCallRequest &request,
+                                                    PttCall &call) {
+    switch (request.type) {
+    case PttCallType::kOneToOne:
+        return directory_.resolve(slot, {{0, request.called, {}, false}});
+    case PttCallType::kGroup: {
+        call.uri = request.called;
+        auto members = directory_.members(slot, request.called);
+        if (members && members->empty())
+            return refuse(Result::kInvalidArgument, "group \"{}\" has no other members",
+                          request.called);
+        return members;
+    }
+    case PttCallType::kChannel: {
+        const auto channel = sessions_[slot].channel;
+        if (channel == 0)
+            return refuse(Result::kWrongState, "slot {} is on no channel: PocSetChannel tunes it",
+                          slot);
+        call.uri = channel_uri(channel);
+        call.name = fmt::format("Channel {}", channel);
+        std::vector<PttContact> tuned;
+        for (int other = 0; other < directory_.slots(); ++other)
+            if (other != slot && sessions_[other].channel == channel)
+                tuned.push_back({directory_.uri_of(other), {}, other, nullptr, call.uri, false, 0});
+        return tuned;
+    }
+    case PttCallType::kAdHoc:
+        break;
+    }
+    return refuse(Result::kInvalidArgument,
+                  "a call is of type 0 (one to one), 1 (group) or 3 (channel), not {}",
+                  request.type);
+}
+
+std::int32_t PttCalls::join(PttCall &call, int slot, const PttOffer &offer) {
+    PttParticipant &late = add_participant(
+        call, {directory_.uri_of(slot), offer.caller_name, slot, nullptr, call.uri, false, 0});
+    late.placed = true;
+    late.phase = PttPhase::kConnecting;
+    late.media = common_media(or_usual(offer.media), call.media);
+    late.terms = offer.terms;
+    open_session(call, late);
+    late.step = timers_.after(kAcceptTime, [this, ref = late.ref] {
+        PttParticipant &self = *sessions_.find(ref);
+        sessions_.emit(self, PttCallInProgress{self.session});
+        self.step = timers_.after(kRouteTime, [this, ref] { connect(ref); });
+    });
+    return late.session;
+}
+
+void PttCalls::proceed(int id) {
+    PttCall &call = *sessions_.find(id);
+    const PttParticipant &owner = call.participants.at(call.owner);
+    sessions_.emit(owner, PttCallInProgress{owner.session});
+    call.step = timers_.after(kRouteTime, [this, id] { invite_all(id); });
+}
+
+Status PttCalls::answer(int slot, const PttModifyRequest &request) {
+    const auto place = sessions_.existing(slot, request.session);
+    if (!place)
+        return place.refusal();
+    auto &[call, self] = *place;
+    if (self.phase != PttPhase::kAlerting)
+        return refuse(Result::kWrongState, "session {} does not ring here", request.session);
+    if (auto refusal = bad_media(request.media))
+        return *refusal;
+    if (auto refusal = bad_terms(request.terms))
+        return *refusal;
+    if (request.changes_media) {
+        const auto common = common_media(or_usual(request.media), call.media);
+        if (common == FourIntegers{})
+            return refuse(Result::kInvalidArgument, "session {} has none of these media",
+                          request.session);
+        self.media = common;
+    }
+    if (request.changes_terms)
+        self.terms = request.terms;
+    connect(self.ref);
+    return Done{};
+}
+
+void PttCalls::connect(PttRef ref) {
+    PttCall &call = *sessions_.find(ref.call);
+    PttParticipant &participant = *call.find(ref.who);
+    PttParticipant *owner = call.find(call.owner);
+    if (!std::exchange(call.established, true) && owner && owner != &participant)
+        enter(call, *owner);
+    enter(call, participant);
+}
+
+void PttCalls::enter(PttCall &call, PttParticipant &participant) {
+    participant.step.cancel();
+    participant.patience.cancel();
+    participant.phase = PttPhase::kConnected;
+    PttPeer peer = to_peer(call.uri, call.name, true);
+    if (!call.is_group())
+        for (const auto &[who, other] : call.participants)
+            if (who != participant.ref.who)
+                peer = to_peer(other.uri(), other.name());
+    sessions_.emit(participant,
+                   PttCallEstablished{participant.session, call.type, participant.placed, peer.uri,
+                                      call.crisis, participant.media, participant.automatic,
+                                      participant.terms, peer});
+    if (call.crisis)
+        sessions_.emit(participant, PttCrisisInitiated{participant.session});
+    if (call.is_group())
+        for (const auto &[who, other] : call.participants)
+            if (who != participant.ref.who && other.phase != PttPhase::kInvited)
+                sessions_.emit(participant,
+                               PttParticipantInfo{participant.session, other.uri(),
+                                                  other.connected() ? "connected" : "alerting"});
+    sessions_.tell_status(call, participant, "connected");
+    if (participant.ref.who == call.owner && std::exchange(call.takes_floor, false))
+        floor_.ask(call, participant,
+                   {participant.ref.who,
+                    participant.terms[kPttPriority],
+                    {1, 0, 0, 0},
+                    participant.name()},
+                   std::chrono::seconds(kPttUsualTalkTime));
+    else
+        floor_.tell(call, participant);
+    if (!participant.is_slot())
+        practise_habit(call, participant);
+}
 
 void PttCalls::drop_calls(int slot) {
     leave_all(slot, PttEndReason::kEndedHere);
-    lines_[slot].keep_alive.cancel();
-}
-
-PttCall *PttCalls::find(int call) {
-    const auto found = calls_.find(call);
-    return found == calls_.end() ? nullptr : &found->second;
-}
-
-PttParticipant *PttCalls::find(PttRef ref) {
-    PttCall *call = find(ref.call);
-    return call ? call->find(ref.who) : nullptr;
+    sessions_[slot].keep_alive.cancel();
 }
 
 PttCall *PttCalls::running_call(std::string_view uri) {
-    for (auto &[id, call] : calls_)
+    for (auto &[id, call] : sessions_.calls())
         if (call.is_group() && call.uri == uri)
             return &call;
     return nullptr;
-}
-
-Answer<PttCalls::Place> PttCalls::existing(int slot, std::int32_t session) {
-    const auto found = lines_[slot].sessions.find(session);
-    if (found != lines_[slot].sessions.end())
-        return Place{*find(found->second.call), *find(found->second)};
-    std::string ids;
-    for (const auto &[id, ref] : lines_[slot].sessions)
-        ids += fmt::format("{}{}", ids.empty() ? "" : ", ", id);
-    return refuse(Result::kUnknownSession, "there is no push-to-talk session {}: {}", session,
-                  ids.empty() ? "there is none" : "the sessions are " + ids);
-}
-
-Answer<PttCalls::Place> PttCalls::connected(int slot, std::int32_t session) {
-    const auto place = existing(slot, session);
-    if (place && !place->self.connected())
-        return refuse(Result::kWrongState, "session {} is not established yet", session);
-    return place;
-}
-
-void PttCalls::emit(const PttParticipant &participant, const PttEvent &event) const {
-    if (participant.is_slot())
-        sink_(participant.contact.slot, event);
-}
-
-void PttCalls::tell_status(const PttCall &call, const PttParticipant &participant,
-                           std::string_view status) const {
-    if (!call.is_group())
-        return;
-    for (const auto &[who, other] : call.participants)
-        if (other.connected() && who != participant.ref.who)
-            emit(other, PttParticipantInfo{other.session, participant.uri(), std::string(status)});
-}
-
-std::int32_t PttCalls::connected_count(const PttCall &call) const {
-    return static_cast<std::int32_t>(std::ranges::count_if(
-        call.participants, [](const auto &entry) { return entry.second.connected(); }));
 }
 
 std::string PttCalls::others_text(const PttCall &call, const PttParticipant &except) const {
@@ -80,28 +252,8 @@ std::string PttCalls::others_text(const PttCall &call, const PttParticipant &exc
     return text;
 }
 
-std::vector<PttRunningCall> PttCalls::running(int slot) const {
-    std::vector<PttRunningCall> running;
-    for (const auto &[session, ref] : lines_[slot].sessions) {
-        const PttCall &call = calls_.at(ref.call);
-        const PttParticipant &self = call.participants.at(ref.who);
-        if (!call.is_group() || !self.connected())
-            continue;
-        const auto owner = call.participants.find(call.owner);
-        PttRunningCall told{session, call.type,   call.uri,   call.name,
-                            {},      call.crisis, self.media, {}};
-        if (owner != call.participants.end())
-            told.placed_by = owner->second.uri();
-        for (const auto &[who, participant] : call.participants)
-            told.participants.push_back(
-                {participant.uri(), participant.name(), participant.connected()});
-        running.push_back(std::move(told));
-    }
-    return running;
-}
-
 Status PttCalls::end(int slot, std::int32_t session, PttEndScope scope) {
-    const auto place = existing(slot, session);
+    const auto place = sessions_.existing(slot, session);
     if (!place)
         return place.refusal();
     auto &[call, self] = *place;
@@ -121,7 +273,7 @@ Status PttCalls::end(int slot, std::int32_t session, PttEndScope scope) {
 }
 
 Status PttCalls::reject(int slot, std::int32_t session, PttRejectReason reason) {
-    const auto place = existing(slot, session);
+    const auto place = sessions_.existing(slot, session);
     if (!place)
         return place.refusal();
     if (place->self.phase != PttPhase::kAlerting)
@@ -136,7 +288,7 @@ Status PttCalls::reject(int slot, std::int32_t session, PttRejectReason reason) 
 }
 
 void PttCalls::leave(PttRef ref, PttEndReason here, PttEndReason there) {
-    PttCall *call = find(ref.call);
+    PttCall *call = sessions_.find(ref.call);
     if (!call)
         return;
     const auto node = call->participants.extract(ref.who);
@@ -145,25 +297,25 @@ void PttCalls::leave(PttRef ref, PttEndReason here, PttEndReason there) {
     const PttParticipant &gone = node.mapped();
     const bool owner_left = call->owner == ref.who;
     if (gone.is_slot() && gone.session != 0) {
-        lines_[gone.contact.slot].sessions.erase(gone.session);
-        emit(gone, PttCallEnded{gone.session, here});
+        sessions_[gone.contact.slot].sessions.erase(gone.session);
+        sessions_.emit(gone, PttCallEnded{gone.session, here});
     }
     if (call->established)
-        tell_status(*call, gone, "disconnected");
+        sessions_.tell_status(*call, gone, "disconnected");
     const bool goes_on = call->participants.size() > 1 || call->type == PttCallType::kChannel;
     if (call->established && goes_on) {
-        forget_speaker(*call, ref.who);
-        settle_change(*call, ref.who, std::nullopt);
+        floor_.forget(*call, ref.who);
+        changes_.settle(*call, ref.who, std::nullopt);
     }
     wind_up(ref.call, owner_left, there);
 }
 
 void PttCalls::wind_up(int id, bool owner_left, PttEndReason there) {
-    PttCall *call = find(id);
+    PttCall *call = sessions_.find(id);
     // Parties of the network do not talk among themselves.
     if (std::ranges::none_of(call->participants,
                              [](const auto &entry) { return entry.second.is_slot(); })) {
-        calls_.erase(id);
+        sessions_.calls().erase(id);
         return;
     }
     const bool alone = call->participants.size() == 1;
@@ -171,8 +323,8 @@ void PttCalls::wind_up(int id, bool owner_left, PttEndReason there) {
     if (!call->is_group())
         return leave(first, there, there);
     if (!call->established && owner_left)
-        while (find(id))
-            leave(find(id)->participants.begin()->second.ref, there, there);
+        while (sessions_.find(id))
+            leave(sessions_.find(id)->participants.begin()->second.ref, there, there);
     else if (!call->established && alone && call->owner == first.who)
         leave(first, there, there);
     else if (call->established && alone && call->type != PttCallType::kChannel)
@@ -180,8 +332,8 @@ void PttCalls::wind_up(int id, bool owner_left, PttEndReason there) {
 }
 
 void PttCalls::leave_all(int slot, PttEndReason reason) {
-    while (!lines_[slot].sessions.empty())
-        leave(lines_[slot].sessions.begin()->second, reason, PttEndReason::kNetworkFailure);
+    while (!sessions_[slot].sessions.empty())
+        leave(sessions_[slot].sessions.begin()->second, reason, PttEndReason::kNetworkFailure);
 }
 
 Status PttCalls::keep_alive(int slot, std::int32_t seconds) {
@@ -189,9 +341,9 @@ Status PttCalls::keep_alive(int slot, std::int32_t seconds) {
         return *refusal;
     if (auto refusal = bad_seconds(seconds, "the time until the next keep-alive"))
         return *refusal;
-    lines_[slot].keep_alive.cancel();
+    sessions_[slot].keep_alive.cancel();
     if (seconds > 0)
-        lines_[slot].keep_alive =
+        sessions_[slot].keep_alive =
             timers_.after_unscaled(std::chrono::seconds(seconds), [this, slot] {
                 leave_all(slot, PttEndReason::kKeepAliveMissed);
             });
@@ -199,7 +351,7 @@ Status PttCalls::keep_alive(int slot, std::int32_t seconds) {
 }
 
 Status PttCalls::convert_to_crisis(int slot, std::int32_t session) {
-    const auto place = connected(slot, session);
+    const auto place = sessions_.connected(slot, session);
     if (!place)
         return place.refusal();
     auto &[call, self] = *place;
@@ -209,12 +361,12 @@ Status PttCalls::convert_to_crisis(int slot, std::int32_t session) {
     call.crisis_by = self.ref.who;
     for (const auto &[who, participant] : call.participants)
         if (participant.connected())
-            emit(participant, PttCrisisInitiated{participant.session});
+            sessions_.emit(participant, PttCrisisInitiated{participant.session});
     return Done{};
 }
 
 Answer<std::vector<PttContact>> PttCalls::others(int slot, std::int32_t session, PttMedia media) {
-    const auto place = connected(slot, session);
+    const auto place = sessions_.connected(slot, session);
     if (!place)
         return place.refusal();
     if (place->self.media[media] == 0)
@@ -233,13 +385,13 @@ Answer<std::vector<PttContact>> PttCalls::others(int slot, std::int32_t session,
 }
 
 std::string PttCalls::uri_in(int slot, std::int32_t session) {
-    const auto &sessions = lines_[slot].sessions;
+    const auto &sessions = sessions_[slot].sessions;
     const auto found = sessions.find(session);
-    return found == sessions.end() ? directory_.uri_of(slot) : find(found->second)->uri();
+    return found == sessions.end() ? directory_.uri_of(slot) : sessions_.find(found->second)->uri();
 }
 
 Answer<std::string> PttCalls::talking_to(int slot, std::int32_t session) {
-    const auto place = connected(slot, session);
+    const auto place = sessions_.connected(slot, session);
     if (!place)
         return place.refusal();
     if (place->call.is_group())
@@ -248,6 +400,52 @@ Answer<std::string> PttCalls::talking_to(int slot, std::int32_t session) {
         if (who != place->self.ref.who)
             return participant.uri();
     return std::string();
+}
+
+// Channels: whoever is tuned to one takes part in what goes on there.
+Status PttCalls::set_channel(int slot, std::int32_t channel, PttChannelMode mode) {
+    if (auto refusal = registrations_.radio_off(slot))
+        return *refusal;
+    if (channel < 0 || channel > kPttChannels)
+        return refuse(Result::kInvalidArgument, "a channel is 1 to {}, or 0 for none, not {}",
+                      kPttChannels, channel);
+    if (mode != PttChannelMode::kTalkAndListen && mode != PttChannelMode::kListenOnly)
+        return refuse(Result::kInvalidArgument,
+                      "a mode is 0 (talk and listen) or 1 (listen), not {}", mode);
+    PttLine &here = sessions_[slot];
+    here.channel_mode = mode;
+    if (channel == here.channel) {
+        for (const auto &[session, ref] : here.sessions)
+            if (PttCall &call = *sessions_.find(ref.call); call.type == PttCallType::kChannel) {
+                PttParticipant &self = *sessions_.find(ref);
+                self.listens_only = mode == PttChannelMode::kListenOnly;
+                if (self.listens_only)
+                    floor_.cancel(call, self, PttFloorCause::kListensOnly);
+            }
+        return Done{};
+    }
+    leave_channel(slot);
+    here.channel = channel;
+    for (auto &[id, call] : sessions_.calls()) {
+        if (call.type != PttCallType::kChannel || !call.established ||
+            call.uri != channel_uri(channel))
+            continue;
+        PttParticipant &late =
+            add_participant(call, {directory_.uri_of(slot), {}, slot, nullptr, call.uri, false, 0});
+        invite_slot(call, late);
+        break;
+    }
+    return Done{};
+}
+
+void PttCalls::leave_channel(int slot) {
+    for (const auto &[session, ref] : sessions_[slot].sessions)
+        if (sessions_.find(ref.call)->type == PttCallType::kChannel)
+            return leave(ref, PttEndReason::kEndedHere, PttEndReason::kEndedByPeer);
+}
+
+std::string PttCalls::channel_uri(std::int32_t channel) {
+    return fmt::format("sip:channel-{}@{}", channel, PttDirectory::kGroupHost);
 }
 
 } // namespace sim

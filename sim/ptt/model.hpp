@@ -2,17 +2,17 @@
 #pragma once
 
 #include "sim/base/clock.hpp"
-#include "sim/base/per_slot.hpp"
 #include "sim/base/result.hpp"
+#include "sim/group/answers.hpp"
 #include "sim/ptt/call.hpp"
+#include "sim/ptt/change.hpp"
 #include "sim/ptt/directory.hpp"
 #include "sim/ptt/events.hpp"
+#include "sim/ptt/floor_control.hpp"
 #include "sim/registration/registrations.hpp"
 
 #include <chrono>
 #include <cstdint>
-#include <functional>
-#include <map>
 #include <optional>
 #include <string>
 #include <string_view>
@@ -56,47 +56,19 @@ struct PttAddRequest {
     std::vector<PttContent> contents;
 };
 
-struct PttFloorRequest {
-    std::int32_t session = 0;
-    FourIntegers media{};
-    std::int32_t priority = 0;
-    std::int32_t patience = 0;
-    std::string name;
-};
-
-struct PttFloorStatus {
-    std::int32_t session = 0;
-    PttFloorState state = PttFloorState::kIdle;
-    std::int32_t participants = 0;
-    std::string speaker_uri;
-    bool operator==(const PttFloorStatus &) const = default;
-};
-
-// A group call that a slot takes part in, for whoever wants to know.
-struct PttRunningCall {
-    struct Participant {
-        std::string uri;
-        std::string display_name;
-        bool connected = false; // else being asked
-    };
-    std::int32_t session = 0;
-    PttCallType type = PttCallType::kGroup;
-    std::string uri;
-    std::string name;
-    std::string placed_by; // uri
-    bool crisis = false;
-    FourIntegers media{};
-    std::vector<Participant> participants;
-};
-
-// The push-to-talk calls of all slots: who takes part, who speaks, and who is told. A request that
-// makes no sense in the present state is refused and changes nothing.
+// The push-to-talk calls of all slots: who takes part, and who is told. A request that makes no
+// sense in the present state is refused and changes nothing. What a slot may ask when is the
+// device's; the calls themselves are the server's.
 class PttCalls {
   public:
-    using Sink = std::function<void(int slot, const PttEvent &event)>;
+    using Sink = PttSessions::Sink;
 
     PttCalls(const PttDirectory &directory, Timers &timers, const Registrations &registrations,
              Sink sink);
+
+    // The parts: who speaks, and what is negotiated while a call goes on.
+    PttFloorControl &floor() { return floor_; }
+    PttChanges &changes() { return changes_; }
 
     // Setting up and ending
     Answer<std::int32_t> make_call(int slot, const PttCallRequest &request);
@@ -106,7 +78,8 @@ class PttCalls {
     Status convert_to_crisis(int slot, std::int32_t session);
     Status set_channel(int slot, std::int32_t channel, PttChannelMode mode);
     Status keep_alive(int slot, std::int32_t seconds);
-    std::vector<PttRunningCall> running(int slot) const;
+    // The group calls that a slot takes part in, as those who ask about participants are told.
+    std::vector<ParticipantInfo> running(int slot) const;
     // The radio is off.
     void drop_calls(int slot);
 
@@ -116,18 +89,6 @@ class PttCalls {
     Status remove_users(int slot, std::int32_t session, const std::vector<PttPeer> &users);
     // Somebody tells a slot of a group.
     void advertise(int slot, PttGroupAdvertisement advertisement);
-
-    // The floor
-    Status request_floor(int slot, const PttFloorRequest &request);
-    Status release_floor(int slot, std::int32_t session);
-    // Of these sessions; of all when none is named.
-    Answer<std::vector<PttFloorStatus>> floor_status(int slot,
-                                                     const std::vector<std::int32_t> &sessions);
-
-    // Change of the media and of the terms
-    Status modify(int slot, const PttModifyRequest &request);
-    Status accept_modify(int slot, const PttModifyRequest &request);
-    Status reject_modify(int slot, std::int32_t session);
 
     // Who takes part beside this slot, under the names known in the call; refused when the call
     // does not have these media.
@@ -141,26 +102,8 @@ class PttCalls {
     static constexpr std::chrono::milliseconds kRouteTime{500};
     static constexpr std::size_t kMostSessions = 4; // of a slot
 
-    struct Line {
-        std::int32_t next_session = 1;
-        std::map<std::int32_t, PttRef> sessions;
-        std::int32_t channel = 0;
-        PttChannelMode channel_mode = PttChannelMode::kTalkAndListen;
-        std::int32_t next_advertisement = 1;
-        Timer keep_alive;
-    };
-    // A slot's session: the call and the slot's part in it.
-    struct Place {
-        PttCall &call;
-        PttParticipant &self;
-    };
-
-    PttCall *find(int call);
-    PttParticipant *find(PttRef ref);
     PttCall *running_call(std::string_view uri);
-    Answer<Place> existing(int slot, std::int32_t session);
-    Answer<Place> connected(int slot, std::int32_t session);
-    Answer<Place> owned_ad_hoc(int slot, std::int32_t session);
+    Answer<PttSessions::Place> owned_ad_hoc(int slot, std::int32_t session);
 
     std::optional<Refusal> cannot_place(int slot, const PttOffer &offer);
     PttCall &add_call(int slot, PttCallType type, const PttOffer &offer);
@@ -186,37 +129,7 @@ class PttCalls {
     void leave_channel(int slot);
     static std::string channel_uri(std::int32_t channel);
 
-    void emit(const PttParticipant &participant, const PttEvent &event) const;
-    void tell_status(const PttCall &call, const PttParticipant &participant,
-                     std::string_view status) const;
-
-    std::optional<Refusal> cannot_speak(const Place &place, const PttFloorRequest &request) const;
-    void ask_floor(PttCall &call, PttParticipant &participant, FloorWish wish,
-                   std::chrono::seconds patience);
-    void grant_floor(PttCall &call, FloorWish wish);
-    void pass_floor_on(PttCall &call);
-    void cut_off(PttRef ref);
-    void stop_waiting(PttRef ref);
-    // From one who has it or waits for it; of others nothing is taken.
-    void cancel_floor(PttCall &call, const PttParticipant &speaker, PttFloorCause cause);
-    void forget_speaker(PttCall &call, int who);
-    void tell_positions(PttCall &call);
-    void tell_floor(const PttCall &call, const PttParticipant &participant) const;
-    PttFloorEvent floor_event(PttFloorKind kind, const PttCall &call,
-                              const PttParticipant &participant,
-                              PttFloorCause cause = PttFloorCause::kNone) const;
-    std::int32_t connected_count(const PttCall &call) const;
-
     void practise_habit(PttCall &call, PttParticipant &participant);
-    void party_talks(PttRef ref);
-    void party_asks_video(PttRef ref);
-    void party_answers_change(PttRef ref);
-
-    void offer_change(PttCall &call, PttParticipant &asker, const PttModifyRequest &request);
-    void settle_change(PttCall &call, int who, std::optional<FourIntegers> accepted);
-    void conclude_change(PttCall &call);
-    void tell_change(PttParticipant &participant, const PttModifyRequest &request, bool accepted);
-
     Answer<std::vector<PttContact>> contacts_of(int slot, const std::vector<PttUser> &users) const;
     PttGroupAdvertisement advertisement_of(const PttCall &call,
                                            const PttParticipant &invited) const;
@@ -224,9 +137,9 @@ class PttCalls {
     const PttDirectory &directory_;
     Timers &timers_;
     const Registrations &registrations_;
-    Sink sink_;
-    PerSlot<Line> lines_;
-    std::map<int, PttCall> calls_;
+    PttSessions sessions_;
+    PttFloorControl floor_;
+    PttChanges changes_;
     int next_call_ = 1;
     int next_ad_hoc_ = 1;
 };

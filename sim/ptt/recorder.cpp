@@ -95,7 +95,7 @@ Answer<PttRecordingInfo> PttRecorder::start(int slot, const PttRecordRequest &re
                                                 [this, key] { finish(key, "the time is over"); });
     note(recording,
          fmt::format("recording of session {} of slot {} with {}", request.session, slot, *with));
-    const auto floor = calls_.floor_status(slot, {request.session});
+    const auto floor = calls_.floor().status(slot, {request.session});
     if (floor && !floor->front().speaker_uri.empty())
         note_speaker(recording, floor->front().speaker_uri,
                      floor->front().state == PttFloorState::kGranted);

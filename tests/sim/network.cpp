@@ -4,7 +4,7 @@
 #include "tests/sim/bus/contract_signals.hpp"
 
 #include "sim/call/signals.hpp"
-#include "sim/ptt/signals.hpp"
+#include "sim/ptt/interface.hpp"
 #include "sim/registration/interface.hpp"
 #include "sim/registration/login_interface.hpp"
 #include "sim/sms/interface.hpp"

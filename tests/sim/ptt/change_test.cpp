@@ -10,10 +10,10 @@ constexpr FourIntegers kWithVideo{1, 1, 0, 0};
 class PttChangeTest : public PttNetwork {
   protected:
     Status offer(int slot, FourIntegers media = kWithVideo, std::int32_t reference = 42) {
-        return ptt_.modify(slot, {true, false, 1, reference, media, {}});
+        return ptt_changes_.modify(slot, {true, false, 1, reference, media, {}});
     }
     Status accept(int slot, bool narrows = false, FourIntegers media = {}) {
-        return ptt_.accept_modify(slot, {narrows, false, 1, 0, media, {}});
+        return ptt_changes_.accept(slot, {narrows, false, 1, 0, media, {}});
     }
 };
 
@@ -28,7 +28,7 @@ TEST_F(PttChangeTest, AnOfferIsAcceptedByTheOther) {
         EXPECT_THAT(take(slot), ElementsAre("PocCallModifyStatus (true, true, false, 1, 42, "
                                             "<[1, 1, 0, 0]>, <[0, 0, 0, 0]>)"));
     EXPECT_EQ(timers_.next_due(), std::nullopt);
-    expect_accepted(ptt_.request_floor(0, {1, kWithVideo, 0, 0, {}}));
+    expect_accepted(floor_.request(0, {1, kWithVideo, 0, 0, {}}));
 }
 
 TEST_F(PttChangeTest, AnAnswerMayTakeLess) {
@@ -43,16 +43,16 @@ TEST_F(PttChangeTest, AnAnswerMayTakeLess) {
 TEST_F(PttChangeTest, ARejectedOfferChangesNothing) {
     connect_two();
     expect_accepted(offer(0));
-    expect_accepted(ptt_.reject_modify(1, 1));
+    expect_accepted(ptt_changes_.reject(1, 1));
     EXPECT_THAT(take(0), ElementsAre("PocCallModifyStatus (false, true, false, 1, 42, "
                                      "<[1, 0, 1, 1]>, <[0, 0, 0, 0]>)"));
-    expect_refused(ptt_.reject_modify(1, 1), Result::kWrongState, "nobody has offered");
+    expect_refused(ptt_changes_.reject(1, 1), Result::kWrongState, "nobody has offered");
 }
 
 TEST_F(PttChangeTest, InAGroupItIsEnoughThatOneAccepts) {
     connect_team();
     expect_accepted(offer(0));
-    expect_accepted(ptt_.reject_modify(1, 1));
+    expect_accepted(ptt_changes_.reject(1, 1));
     EXPECT_THAT(take(0), IsEmpty());
     forget_events();
     expect_accepted(accept(2));
@@ -85,7 +85,7 @@ TEST_F(PttChangeTest, AnOfferGoesWithTheOneWhoMadeItAndIsSettledWhenAnotherGoes)
 
 TEST_F(PttChangeTest, TermsAreTheOwnAlone) {
     connect_two();
-    expect_accepted(ptt_.modify(0, {false, true, 1, 7, {}, {2, 1, 12, 0}}));
+    expect_accepted(ptt_changes_.modify(0, {false, true, 1, 7, {}, {2, 1, 12, 0}}));
     EXPECT_THAT(take(0), ElementsAre("PocCallModifyStatus (true, false, true, 1, 7, "
                                      "<[1, 0, 1, 1]>, <[2, 1, 12, 0]>)"));
     EXPECT_THAT(take(1), IsEmpty());
@@ -104,27 +104,27 @@ TEST_F(PttChangeTest, PartiesOfTheNetworkAnswerAndAsk) {
     expect_accepted(ptt_.end(0, 1, PttEndScope::kLeave));
     place(0, "+15550210");
     advance(5s);
-    expect_accepted(ptt_.modify(0, {true, false, 2, 0, kWithVideo, {}}));
+    expect_accepted(ptt_changes_.modify(0, {true, false, 2, 0, kWithVideo, {}}));
     advance(500ms);
     EXPECT_THAT(take(0).back(), HasSubstr("ModifyStatus (false,"));
     expect_accepted(ptt_.end(0, 2, PttEndScope::kLeave));
     place(0, "+15550209");
     advance(5s);
     EXPECT_THAT(take(0).back(), HasSubstr("ModifyRequest (true, false, 3, 0, <[1, 1, 1, 1]>"));
-    expect_accepted(ptt_.accept_modify(0, {false, false, 3, 0, {}, {}}));
+    expect_accepted(ptt_changes_.accept(0, {false, false, 3, 0, {}, {}}));
     EXPECT_THAT(take(0), ElementsAre(HasSubstr("ModifyStatus (true, true, false, 3, 0,")));
 }
 
 TEST_F(PttChangeTest, RequestsThatMakeNoSenseAreRefused) {
     expect_refused(offer(0), Result::kUnknownSession, "session 1");
     expect_refused(accept(0), Result::kUnknownSession, "session 1");
-    expect_refused(ptt_.reject_modify(0, 1), Result::kUnknownSession, "session 1");
+    expect_refused(ptt_changes_.reject(0, 1), Result::kUnknownSession, "session 1");
     connect_two();
-    expect_refused(ptt_.modify(0, {false, false, 1, 0, {}, {}}), Result::kInvalidArgument,
+    expect_refused(ptt_changes_.modify(0, {false, false, 1, 0, {}, {}}), Result::kInvalidArgument,
                    "neither of the flags");
     expect_refused(offer(0, {2, 0, 0, 0}), Result::kInvalidArgument, "not 2");
-    expect_refused(ptt_.modify(0, {false, true, 1, 0, {}, {9, 0, 0, 0}}), Result::kInvalidArgument,
-                   "not 9");
+    expect_refused(ptt_changes_.modify(0, {false, true, 1, 0, {}, {9, 0, 0, 0}}),
+                   Result::kInvalidArgument, "not 9");
     expect_refused(accept(0), Result::kWrongState, "nobody has offered");
     expect_accepted(offer(0));
     expect_refused(offer(1), Result::kWrongState, "another change");

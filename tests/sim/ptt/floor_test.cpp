@@ -34,11 +34,11 @@ TEST_F(PttFloorTest, TheFirstIsGrantedTheSecondWaitsAndIsGrantedThen) {
     EXPECT_THAT(take(0), ElementsAre(granted("+15550100")));
     EXPECT_THAT(take(1), ElementsAre(taken("+15550100"), queued("+15550100", 1)));
     EXPECT_THAT(take(2), ElementsAre(taken("+15550100")));
-    expect_accepted(ptt_.release_floor(0, 1));
+    expect_accepted(floor_.release(0, 1));
     EXPECT_THAT(take(0), ElementsAre(taken("+15550101")));
     EXPECT_THAT(take(1), ElementsAre(granted("+15550101")));
     EXPECT_THAT(take(2), ElementsAre(taken("+15550101")));
-    expect_accepted(ptt_.release_floor(1, 1));
+    expect_accepted(floor_.release(1, 1));
     for (const int slot : {0, 1, 2})
         EXPECT_THAT(take(slot), ElementsAre(kIdle));
     EXPECT_EQ(timers_.next_due(), std::nullopt);
@@ -52,10 +52,10 @@ TEST_F(PttFloorTest, AHigherPriorityGoesBeforeInTheQueue) {
     expect_accepted(ask_floor(2, 3));
     EXPECT_THAT(take(2), ElementsAre(queued("+15550100", 1)));
     EXPECT_THAT(take(1), ElementsAre(queued("+15550100", 2)));
-    expect_accepted(ptt_.release_floor(0, 1));
+    expect_accepted(floor_.release(0, 1));
     EXPECT_THAT(take(2), ElementsAre(granted("+15550102", 30, 3)));
     EXPECT_THAT(take_floor(1).size(), 2u); // taken, and now the first
-    expect_accepted(ptt_.release_floor(1, 1));
+    expect_accepted(floor_.release(1, 1));
     EXPECT_THAT(take(1), ElementsAre("PocCallFloorCanceled (1, <[1, 0, 0, 0]>, 3, "
                                      "'tel:+15550102', 3, '', 0, 0, 6, 'withdrawn')"));
 }
@@ -177,7 +177,7 @@ TEST(PttFloorQueue, OneMoreThanMayWaitIsRejected) {
     expect_accepted(calls.make_call(0, {{}, "", PttCallType::kChannel}));
     settle();
     for (int slot = 0; slot < kSlots; ++slot)
-        expect_accepted(calls.request_floor(slot, {1, {}, 0, 0, {}}));
+        expect_accepted(calls.floor().request(slot, {1, {}, 0, 0, {}}));
     ASSERT_FALSE(told.empty());
     EXPECT_EQ(told.back().kind, PttFloorKind::kRejected);
     EXPECT_EQ(told.back().cause, PttFloorCause::kQueueFull);
@@ -191,16 +191,15 @@ TEST_F(PttFloorTest, TheStateIsToldOfTheSessionsThatAreNamedOrOfAll) {
     place(0, "+15550103");
     advance(700ms);
     using enum PttFloorState;
-    const auto all = ptt_.floor_status(0, {});
+    const auto all = floor_.status(0, {});
     ASSERT_TRUE(all);
     EXPECT_THAT(*all, ElementsAre(PttFloorStatus{1, kGranted, 3, "tel:+15550100"},
                                   PttFloorStatus{2, kIdle, 0, ""}));
-    EXPECT_THAT(*ptt_.floor_status(1, {1}),
+    EXPECT_THAT(*floor_.status(1, {1}),
                 ElementsAre(PttFloorStatus{1, kWaiting, 3, "tel:+15550100"}));
-    EXPECT_THAT(*ptt_.floor_status(2, {1}),
-                ElementsAre(PttFloorStatus{1, kTaken, 3, "tel:+15550100"}));
-    EXPECT_EQ(ptt_.floor_status(2, {})->size(), 1u);
-    expect_refused(ptt_.floor_status(0, {1, 7}), Result::kUnknownSession, "session 7");
+    EXPECT_THAT(*floor_.status(2, {1}), ElementsAre(PttFloorStatus{1, kTaken, 3, "tel:+15550100"}));
+    EXPECT_EQ(floor_.status(2, {})->size(), 1u);
+    expect_refused(floor_.status(0, {1, 7}), Result::kUnknownSession, "session 7");
 }
 
 TEST_F(PttFloorTest, RequestsThatMakeNoSenseAreRefused) {
@@ -209,18 +208,18 @@ TEST_F(PttFloorTest, RequestsThatMakeNoSenseAreRefused) {
     expect_refused(ask_floor(0), Result::kWrongState, "not established");
     advance(700ms);
     answer_all({1, 2});
-    expect_refused(ptt_.release_floor(0, 1), Result::kWrongState, "neither");
+    expect_refused(floor_.release(0, 1), Result::kWrongState, "neither");
     expect_refused(ask_floor(0, 8), Result::kInvalidArgument, "not 8");
     expect_refused(ask_floor(0, 0, -1), Result::kInvalidArgument, "the time to wait");
-    expect_refused(ptt_.request_floor(0, {1, {0, 1, 0, 0}, 0, 0, {}}), Result::kInvalidArgument,
+    expect_refused(floor_.request(0, {1, {0, 1, 0, 0}, 0, 0, {}}), Result::kInvalidArgument,
                    "all of these media");
-    expect_refused(ptt_.request_floor(0, {1, {3, 0, 0, 0}, 0, 0, {}}), Result::kInvalidArgument,
+    expect_refused(floor_.request(0, {1, {3, 0, 0, 0}, 0, 0, {}}), Result::kInvalidArgument,
                    "not 3");
     expect_accepted(ask_floor(0));
     expect_refused(ask_floor(0), Result::kWrongState, "has the floor already");
     expect_accepted(ask_floor(1));
     expect_refused(ask_floor(1), Result::kWrongState, "waits for the floor already");
-    expect_refused(ptt_.release_floor(2, 1), Result::kWrongState, "neither");
+    expect_refused(floor_.release(2, 1), Result::kWrongState, "neither");
 }
 
 } // namespace

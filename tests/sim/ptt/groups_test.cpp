@@ -157,7 +157,7 @@ TEST_F(PttGroups, WhoeverTurnsToListeningOnlyNeitherSpeaksNorWaits) {
     EXPECT_THAT(take_floor(2), ElementsAre(testing::StartsWith("PocCallFloorGranted")));
     expect_accepted(ptt_.set_channel(1, 5, kListenOnly)); // nothing is left to take
     EXPECT_THAT(take(1), testing::Each(testing::Not(HasSubstr("Canceled"))));
-    expect_accepted(ptt_.release_floor(2, 1));
+    expect_accepted(floor_.release(2, 1));
     EXPECT_EQ(timers_.next_due(), std::nullopt);
 }
 

@@ -71,12 +71,14 @@ class PttNetwork : public NetworkTest {
         answer_all({1, 2});
     }
     Status ask_floor(int slot, std::int32_t priority = 0, std::int32_t patience = 0) {
-        return ptt_.request_floor(slot, {1, {}, priority, patience, {}});
+        return floor_.request(slot, {1, {}, priority, patience, {}});
     }
     static PttPeer to(const std::string &uri, bool group = false) { return {0, uri, {}, group}; }
 
     PttDirectory &directory_ = network_.ptt_directory;
     PttCalls &ptt_ = network_.ptt;
+    PttFloorControl &floor_ = ptt_.floor();
+    PttChanges &ptt_changes_ = ptt_.changes();
     PttRecorder &recorder_ = network_.ptt_recorder;
     PttMessages &mail_ = network_.ptt_messages;
     PttFiles &files_ = network_.ptt_files;

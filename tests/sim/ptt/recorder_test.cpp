@@ -34,10 +34,10 @@ TEST_F(PttRecorderTest, KeepsWhoSpeaksWhen) {
     ASSERT_TRUE(info);
     EXPECT_EQ(info->path, path());
     advance(1s);
-    expect_accepted(ptt_.release_floor(1, 1));
+    expect_accepted(floor_.release(1, 1));
     expect_accepted(recorder_.pause(0, 1));
     expect_accepted(ask_floor(0));
-    expect_accepted(ptt_.release_floor(0, 1));
+    expect_accepted(floor_.release(0, 1));
     advance(1s);
     expect_accepted(recorder_.resume(0, 1));
     expect_accepted(ask_floor(0));
@@ -52,7 +52,7 @@ TEST_F(PttRecorderTest, KeepsOneSideWhenAsked) {
     connect_team();
     expect_accepted(start(PttRecordSource::kOwn));
     expect_accepted(ask_floor(1));
-    expect_accepted(ptt_.release_floor(1, 1));
+    expect_accepted(floor_.release(1, 1));
     expect_accepted(ask_floor(0));
     expect_accepted(ptt_.end(0, 1, PttEndScope::kLeave));
     EXPECT_THAT(lines_of(path()),

@@ -155,8 +155,8 @@ TEST_F(PttSetup, ACallThatGoesOnCanBeJoined) {
                    Result::kInvalidArgument, "none of these media");
     const auto running = ptt_.running(1);
     ASSERT_EQ(running.size(), 1u);
-    EXPECT_EQ(running[0].uri, kTeam);
-    EXPECT_EQ(running[0].placed_by, "tel:+15550100");
+    EXPECT_EQ(running[0].list_service_uri, kTeam);
+    EXPECT_EQ(running[0].inviting_user, "tel:+15550100");
     EXPECT_EQ(running[0].participants.size(), 3u);
     EXPECT_THAT(ptt_.running(3), IsEmpty());
 }

@@ -34,7 +34,7 @@ class PttWalk : public PttNetwork, public testing::WithParamInterface<unsigned> 
     }
     // Mostly one that there is.
     std::int32_t session_of(int slot) {
-        const auto status = ptt_.floor_status(slot, {});
+        const auto status = floor_.status(slot, {});
         if (status->empty() || upto(9) == 0)
             return upto(9);
         return (*status)[static_cast<std::size_t>(
@@ -162,14 +162,14 @@ class PttWalk : public PttNetwork, public testing::WithParamInterface<unsigned> 
             return static_cast<void>(ptt_.set_channel(slot, upto(1), PttChannelMode{upto(1)}));
         case 9:
         case 10:
-            return static_cast<void>(ptt_.request_floor(slot, {session, {}, upto(7), upto(9), {}}));
+            return static_cast<void>(floor_.request(slot, {session, {}, upto(7), upto(9), {}}));
         case 11:
-            return static_cast<void>(ptt_.release_floor(slot, session));
+            return static_cast<void>(floor_.release(slot, session));
         case 12:
-            return static_cast<void>(ptt_.modify(slot, change));
+            return static_cast<void>(ptt_changes_.modify(slot, change));
         case 13:
-            return static_cast<void>(coin() ? ptt_.accept_modify(slot, change)
-                                            : ptt_.reject_modify(slot, session));
+            return static_cast<void>(coin() ? ptt_changes_.accept(slot, change)
+                                            : ptt_changes_.reject(slot, session));
         case 14:
             return static_cast<void>(ptt_.add_users(slot, {session, coin(), users(), 0, {}}));
         case 15:
@@ -201,7 +201,7 @@ TEST_P(PttWalk, NothingIsLeftWhenAllHaveGone) {
         step();
         advance(std::chrono::milliseconds(upto(800)));
         for (int slot = 0; slot < 4; ++slot) {
-            const auto status = ptt_.floor_status(slot, {});
+            const auto status = floor_.status(slot, {});
             ASSERT_TRUE(status);
             ASSERT_LE(status->size(), 4u);
         }
@@ -210,8 +210,8 @@ TEST_P(PttWalk, NothingIsLeftWhenAllHaveGone) {
         registrations_.switch_on(slot);
     advance(300ms);
     for (int slot = 0; slot < 4; ++slot) {
-        while (!ptt_.floor_status(slot, {})->empty()) {
-            const auto session = ptt_.floor_status(slot, {})->front().session;
+        while (!floor_.status(slot, {})->empty()) {
+            const auto session = floor_.status(slot, {})->front().session;
             if (!ptt_.end(slot, session, PttEndScope::kLeave))
                 expect_accepted(ptt_.reject(slot, session, PttRejectReason::kDecline));
         }

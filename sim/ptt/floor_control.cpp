@@ -1,8 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// The floor: who may speak, who waits, who is interrupted.
-#include "sim/ptt/model.hpp"
+#include "sim/ptt/floor_control.hpp"
 
 #include "sim/ptt/media.hpp"
+
+#include <utility>
 
 namespace sim {
 
@@ -10,6 +11,7 @@ namespace {
 
 constexpr std::int32_t kUsualPatience = 30;
 constexpr FourIntegers kVoiceAlone{1, 0, 0, 0};
+constexpr std::chrono::seconds kPartyTalks{2};
 
 std::string_view text_of(PttFloorCause cause) {
     switch (cause) {
@@ -35,12 +37,13 @@ std::string_view text_of(PttFloorCause cause) {
 
 } // namespace
 
-PttFloorEvent PttCalls::floor_event(PttFloorKind kind, const PttCall &call,
-                                    const PttParticipant &participant, PttFloorCause cause) const {
+PttFloorEvent PttFloorControl::event_of(PttFloorKind kind, const PttCall &call,
+                                        const PttParticipant &participant,
+                                        PttFloorCause cause) const {
     PttFloorEvent event;
     event.kind = kind;
     event.session = participant.session;
-    event.participants = connected_count(call);
+    event.participants = call.connected_count();
     event.position = call.floor.position(participant.ref.who);
     event.cause = cause;
     event.text = text_of(cause);
@@ -58,13 +61,13 @@ PttFloorEvent PttCalls::floor_event(PttFloorKind kind, const PttCall &call,
     return event;
 }
 
-void PttCalls::tell_floor(const PttCall &call, const PttParticipant &participant) const {
+void PttFloorControl::tell(const PttCall &call, const PttParticipant &participant) const {
     const auto kind = call.floor.holder() ? PttFloorKind::kTaken : PttFloorKind::kIdle;
-    emit(participant, floor_event(kind, call, participant));
+    sessions_.emit(participant, event_of(kind, call, participant));
 }
 
-std::optional<Refusal> PttCalls::cannot_speak(const Place &place,
-                                              const PttFloorRequest &request) const {
+std::optional<Refusal> PttFloorControl::cannot_speak(const PttSessions::Place &place,
+                                                     const PttFloorRequest &request) const {
     const auto &[call, self] = place;
     if (auto refusal = bad_media(request.media))
         return refusal;
@@ -83,8 +86,8 @@ std::optional<Refusal> PttCalls::cannot_speak(const Place &place,
     return std::nullopt;
 }
 
-Status PttCalls::request_floor(int slot, const PttFloorRequest &request) {
-    const auto place = connected(slot, request.session);
+Status PttFloorControl::request(int slot, const PttFloorRequest &request) {
+    const auto place = sessions_.connected(slot, request.session);
     if (!place)
         return place.refusal();
     if (auto refusal = cannot_speak(*place, request))
@@ -99,24 +102,24 @@ Status PttCalls::request_floor(int slot, const PttFloorRequest &request) {
         wish.media = kVoiceAlone;
     if (wish.name.empty())
         wish.name = self.name();
-    ask_floor(call, self, std::move(wish), seconds_or(request.patience, kUsualPatience));
+    ask(call, self, std::move(wish), seconds_or(request.patience, kUsualPatience));
     return Done{};
 }
 
-void PttCalls::ask_floor(PttCall &call, PttParticipant &participant, FloorWish wish,
-                         std::chrono::seconds patience) {
+void PttFloorControl::ask(PttCall &call, PttParticipant &participant, FloorWish wish,
+                          std::chrono::seconds patience) {
     const auto reject = [&](PttFloorCause cause) {
-        emit(participant, floor_event(PttFloorKind::kRejected, call, participant, cause));
+        sessions_.emit(participant, event_of(PttFloorKind::kRejected, call, participant, cause));
     };
     if (participant.listens_only)
         return reject(PttFloorCause::kListensOnly);
     if (!call.floor.holder())
-        return grant_floor(call, std::move(wish));
+        return grant(call, std::move(wish));
     if (call.floor.interrupted_by(wish)) {
         const PttParticipant &holder = call.participants.at(call.floor.holder()->who);
-        emit(holder,
-             floor_event(PttFloorKind::kCanceled, call, holder, PttFloorCause::kInterrupted));
-        return grant_floor(call, std::move(wish));
+        sessions_.emit(
+            holder, event_of(PttFloorKind::kCanceled, call, holder, PttFloorCause::kInterrupted));
+        return grant(call, std::move(wish));
     }
     if (participant.terms[kPttDoNotWait] == 1)
         return reject(PttFloorCause::kTaken);
@@ -129,7 +132,7 @@ void PttCalls::ask_floor(PttCall &call, PttParticipant &participant, FloorWish w
     tell_positions(call);
 }
 
-void PttCalls::grant_floor(PttCall &call, FloorWish wish) {
+void PttFloorControl::grant(PttCall &call, FloorWish wish) {
     PttParticipant &holder = call.participants.at(wish.who);
     call.floor.grant(std::move(wish));
     holder.told_position = 0;
@@ -137,78 +140,78 @@ void PttCalls::grant_floor(PttCall &call, FloorWish wish) {
     call.talk_limit =
         timers_.after_unscaled(seconds_or(holder.terms[kPttTalkTime], kPttUsualTalkTime),
                                [this, ref = holder.ref] { cut_off(ref); });
-    emit(holder, floor_event(PttFloorKind::kGranted, call, holder));
+    sessions_.emit(holder, event_of(PttFloorKind::kGranted, call, holder));
     for (const auto &[who, other] : call.participants)
         if (other.connected() && who != holder.ref.who)
-            tell_floor(call, other);
+            tell(call, other);
     if (!holder.is_slot())
         party_talks(holder.ref);
 }
 
-void PttCalls::pass_floor_on(PttCall &call) {
+void PttFloorControl::pass_on(PttCall &call) {
     call.floor.free();
     call.talk_limit.cancel();
     if (auto next = call.floor.next()) {
-        grant_floor(call, *std::move(next));
+        grant(call, *std::move(next));
         return tell_positions(call);
     }
     for (const auto &[who, participant] : call.participants)
         if (participant.connected())
-            tell_floor(call, participant);
+            tell(call, participant);
 }
 
-void PttCalls::tell_positions(PttCall &call) {
+void PttFloorControl::tell_positions(PttCall &call) {
     for (const auto &wish : call.floor.queue()) {
         PttParticipant &waiting = call.participants.at(wish.who);
         const auto position = call.floor.position(wish.who);
         if (std::exchange(waiting.told_position, position) != position)
-            emit(waiting, floor_event(PttFloorKind::kQueuePosition, call, waiting));
+            sessions_.emit(waiting, event_of(PttFloorKind::kQueuePosition, call, waiting));
     }
 }
 
-Status PttCalls::release_floor(int slot, std::int32_t session) {
-    const auto place = connected(slot, session);
+Status PttFloorControl::release(int slot, std::int32_t session) {
+    const auto place = sessions_.connected(slot, session);
     if (!place)
         return place.refusal();
     auto &[call, self] = *place;
     if (call.floor.held_by(self.ref.who)) {
-        pass_floor_on(call);
+        pass_on(call);
         return Done{};
     }
     if (call.floor.position(self.ref.who) == 0)
         return refuse(Result::kWrongState, "session {} neither has the floor nor waits for it",
                       session);
-    cancel_floor(call, self, PttFloorCause::kWithdrawn);
+    cancel(call, self, PttFloorCause::kWithdrawn);
     return Done{};
 }
 
-void PttCalls::cut_off(PttRef ref) {
-    PttCall &call = *find(ref.call);
-    cancel_floor(call, *call.find(ref.who), PttFloorCause::kTalkedTooLong);
+void PttFloorControl::cut_off(PttRef ref) {
+    PttCall &call = *sessions_.find(ref.call);
+    cancel(call, *call.find(ref.who), PttFloorCause::kTalkedTooLong);
 }
 
-void PttCalls::cancel_floor(PttCall &call, const PttParticipant &speaker, PttFloorCause cause) {
-    const auto tell = [&] {
-        emit(speaker, floor_event(PttFloorKind::kCanceled, call, speaker, cause));
+void PttFloorControl::cancel(PttCall &call, const PttParticipant &speaker, PttFloorCause cause) {
+    const auto tell_speaker = [&] {
+        sessions_.emit(speaker, event_of(PttFloorKind::kCanceled, call, speaker, cause));
     };
     if (call.floor.held_by(speaker.ref.who)) {
-        tell(); // while the event still names the speaker
-        pass_floor_on(call);
+        tell_speaker(); // while the event still names the speaker
+        pass_on(call);
     } else if (call.floor.position(speaker.ref.who) != 0) {
-        forget_speaker(call, speaker.ref.who);
-        tell();
+        forget(call, speaker.ref.who);
+        tell_speaker();
     }
 }
 
-void PttCalls::stop_waiting(PttRef ref) {
-    PttCall &call = *find(ref.call);
+void PttFloorControl::stop_waiting(PttRef ref) {
+    PttCall &call = *sessions_.find(ref.call);
     const PttParticipant &waiting = *call.find(ref.who);
-    forget_speaker(call, ref.who);
-    emit(waiting,
-         floor_event(PttFloorKind::kTimeout, call, waiting, PttFloorCause::kWaitedTooLong));
+    forget(call, ref.who);
+    sessions_.emit(waiting,
+                   event_of(PttFloorKind::kTimeout, call, waiting, PttFloorCause::kWaitedTooLong));
 }
 
-void PttCalls::forget_speaker(PttCall &call, int who) {
+void PttFloorControl::forget(PttCall &call, int who) {
     if (PttParticipant *participant = call.find(who)) {
         participant->told_position = 0;
         participant->patience.cancel();
@@ -218,32 +221,40 @@ void PttCalls::forget_speaker(PttCall &call, int who) {
         return tell_positions(call);
     }
     if (call.floor.held_by(who))
-        pass_floor_on(call);
+        pass_on(call);
 }
 
 Answer<std::vector<PttFloorStatus>>
-PttCalls::floor_status(int slot, const std::vector<std::int32_t> &sessions) {
+PttFloorControl::status(int slot, const std::vector<std::int32_t> &sessions) {
     std::vector<std::int32_t> wanted = sessions;
     if (wanted.empty())
-        for (const auto &[session, ref] : lines_[slot].sessions)
+        for (const auto &[session, ref] : sessions_[slot].sessions)
             wanted.push_back(session);
     std::vector<PttFloorStatus> found;
     for (const std::int32_t session : wanted) {
-        const auto place = existing(slot, session);
+        const auto place = sessions_.existing(slot, session);
         if (!place)
             return place.refusal();
         const auto &[call, self] = *place;
-        PttFloorStatus status{session, PttFloorState::kIdle, connected_count(call), {}};
+        PttFloorStatus told{session, PttFloorState::kIdle, call.connected_count(), {}};
         if (const auto &holder = call.floor.holder()) {
-            status.speaker_uri = call.participants.at(holder->who).uri();
-            status.state =
+            told.speaker_uri = call.participants.at(holder->who).uri();
+            told.state =
                 holder->who == self.ref.who ? PttFloorState::kGranted : PttFloorState::kTaken;
         }
         if (call.floor.position(self.ref.who) != 0)
-            status.state = PttFloorState::kWaiting;
-        found.push_back(std::move(status));
+            told.state = PttFloorState::kWaiting;
+        found.push_back(std::move(told));
     }
     return found;
+}
+
+void PttFloorControl::party_talks(PttRef ref) {
+    sessions_.find(ref)->step = timers_.after(kPartyTalks, [this, ref] {
+        PttCall &call = *sessions_.find(ref.call);
+        if (call.floor.held_by(ref.who))
+            pass_on(call);
+    });
 }
 
 } // namespace sim
