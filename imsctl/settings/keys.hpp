@@ -4,12 +4,11 @@
 
 #include <algorithm>
 #include <array>
-#include <cstddef>
+#include <cstdint>
 #include <ims.h>
 #include <iterator>
 #include <span>
 #include <string_view>
-#include <utility>
 #include <variant>
 
 namespace imsctl {
@@ -24,7 +23,6 @@ struct Key {
 
     std::string_view name;
     Member member;
-    std::size_t offset; // for covers()
 };
 
 using SettingsRecord = ims_global_settings_s;
@@ -43,24 +41,6 @@ constexpr KeyType type_of(const Key<Record> &key) {
     constexpr std::array kTypes = {KeyType::kNumber, KeyType::kFlag, KeyType::kText,
                                    KeyType::kNumber};
     return kTypes[key.member.index()];
-}
-
-// Nothing but these members, in this order, makes up the record.
-template <class Record, std::size_t Count>
-consteval bool covers(const Key<Record> (&keys)[Count]) {
-    const auto aligned = [](std::size_t offset, std::size_t alignment) {
-        return (offset + alignment - 1) / alignment * alignment;
-    };
-    std::size_t end = 0;
-    for (const Key<Record> &key : keys) {
-        const auto [size, alignment] = std::visit(
-            []<class Type>(Type Record::*) { return std::pair(sizeof(Type), alignof(Type)); },
-            key.member);
-        if (key.offset != aligned(end, alignment))
-            return false;
-        end = key.offset + size;
-    }
-    return aligned(end, alignof(Record)) == sizeof(Record);
 }
 
 // These are read, but the service cannot be told a value for them: it is sent a neighbour's in
