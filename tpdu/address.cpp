@@ -8,7 +8,7 @@ namespace tpdu {
 
 namespace {
 
-constexpr std::string_view kDigits = "0123456789*#abc";
+constexpr std::string_view kAddressDigits = "0123456789*#abc";
 constexpr std::uint8_t kFill = 0x0F;
 constexpr std::uint8_t kNoExtensionBit = 0x80;
 constexpr std::size_t kMaxServiceCentreOctets = 1 + kMaxAddressSemiOctets / 2;
@@ -18,7 +18,7 @@ constexpr std::string_view kServiceCentre = "service centre address";
 Octets to_semi_octets(detail::Writer &out, std::string_view text, std::string_view field) {
     Octets values;
     for (const char c : text) {
-        const std::size_t value = kDigits.find(c);
+        const std::size_t value = kAddressDigits.find(c);
         if (value == std::string_view::npos) {
             out.fail(ErrorKind::kNotEncodable, field,
                      "has no digit for '" + std::string(1, c) + "' in \"" + std::string(text) +
@@ -63,7 +63,7 @@ std::string read_digits(detail::Reader &in, OctetView octets, std::size_t count,
                         std::to_string(count));
             return {};
         }
-        digits += kDigits[value];
+        digits += kAddressDigits[value];
     }
     return digits;
 }

@@ -83,10 +83,10 @@ Error not_utf8(std::size_t position) {
 }
 
 std::string code_point_name(char32_t code_point) {
-    constexpr std::string_view kDigits = "0123456789ABCDEF";
+    constexpr std::string_view kHexDigits = "0123456789ABCDEF";
     std::string name;
     for (char32_t rest = code_point; rest != 0 || name.size() < 4; rest >>= 4)
-        name.insert(name.begin(), kDigits[rest & 0x0F]);
+        name.insert(name.begin(), kHexDigits[rest & 0x0F]);
     return "U+" + name;
 }
 

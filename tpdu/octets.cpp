@@ -20,12 +20,12 @@ std::optional<std::uint8_t> hex_digit(char c) {
 } // namespace
 
 std::string to_hex(OctetView octets) {
-    constexpr std::string_view kDigits = "0123456789ABCDEF";
+    constexpr std::string_view kHexDigits = "0123456789ABCDEF";
     std::string text;
     text.reserve(octets.size() * 2);
     for (const std::uint8_t octet : octets) {
-        text += kDigits[octet >> 4];
-        text += kDigits[octet & 0x0F];
+        text += kHexDigits[octet >> 4];
+        text += kHexDigits[octet & 0x0F];
     }
     return text;
 }

@@ -13,7 +13,7 @@ using namespace tpdu;
 using tpdu_test::hex;
 using tpdu_test::must;
 
-std::string repeat(std::string_view text, std::size_t count) {
+std::string repeated_text(std::string_view text, std::size_t count) {
     std::string repeated;
     for (std::size_t i = 0; i < count; ++i)
         repeated += text;
@@ -91,58 +91,59 @@ TEST(Segment, AShortTextStandsAlone) {
 }
 
 TEST(Segment, LimitsOfTheDefaultAlphabet) {
-    EXPECT_EQ(sizes_of(repeat("x", 160)), Sizes{160});
-    EXPECT_EQ(sizes_of(repeat("x", 161)), (Sizes{153, 8}));
-    EXPECT_EQ(sizes_of(repeat("x", 306)), (Sizes{153, 153}));
-    EXPECT_EQ(sizes_of(repeat("x", 307)), (Sizes{153, 153, 1}));
+    EXPECT_EQ(sizes_of(repeated_text("x", 160)), Sizes{160});
+    EXPECT_EQ(sizes_of(repeated_text("x", 161)), (Sizes{153, 8}));
+    EXPECT_EQ(sizes_of(repeated_text("x", 306)), (Sizes{153, 153}));
+    EXPECT_EQ(sizes_of(repeated_text("x", 307)), (Sizes{153, 153, 1}));
 }
 
 TEST(Segment, LimitsOfUcs2) {
     // Sizes are in octets: 70 units are 140, 67 are 134.
-    EXPECT_EQ(sizes_of(repeat("漢", 70)), Sizes{140});
-    EXPECT_EQ(sizes_of(repeat("漢", 71)), (Sizes{134, 8}));
-    EXPECT_EQ(sizes_of(repeat("漢", 134)), (Sizes{134, 134}));
-    EXPECT_EQ(sizes_of(repeat("漢", 135)), (Sizes{134, 134, 2}));
+    EXPECT_EQ(sizes_of(repeated_text("漢", 70)), Sizes{140});
+    EXPECT_EQ(sizes_of(repeated_text("漢", 71)), (Sizes{134, 8}));
+    EXPECT_EQ(sizes_of(repeated_text("漢", 134)), (Sizes{134, 134}));
+    EXPECT_EQ(sizes_of(repeated_text("漢", 135)), (Sizes{134, 134, 2}));
 }
 
 TEST(Segment, AWideReferenceCostsRoom) {
     const SegmentOptions wide{0x1234, ReferenceWidth::k16Bit, std::nullopt};
-    EXPECT_EQ(sizes_of(repeat("x", 160), wide), Sizes{160});
-    EXPECT_EQ(sizes_of(repeat("x", 305), wide), (Sizes{152, 152, 1}));
-    EXPECT_EQ(sizes_of(repeat("漢", 133), wide), (Sizes{132, 132, 2}));
+    EXPECT_EQ(sizes_of(repeated_text("x", 160), wide), Sizes{160});
+    EXPECT_EQ(sizes_of(repeated_text("x", 305), wide), (Sizes{152, 152, 1}));
+    EXPECT_EQ(sizes_of(repeated_text("漢", 133), wide), (Sizes{132, 132, 2}));
 }
 
 TEST(Segment, OneForeignCharacterMakesItUcs2) {
-    EXPECT_EQ(must(segment(repeat("x", 70))).alphabet, Alphabet::kGsm7);
-    EXPECT_EQ(must(segment(repeat("x", 69) + "ç")).alphabet, Alphabet::kUcs2);
-    EXPECT_EQ(sizes_of(repeat("x", 70) + "ç"), (Sizes{134, 8}));
+    EXPECT_EQ(must(segment(repeated_text("x", 70))).alphabet, Alphabet::kGsm7);
+    EXPECT_EQ(must(segment(repeated_text("x", 69) + "ç")).alphabet, Alphabet::kUcs2);
+    EXPECT_EQ(sizes_of(repeated_text("x", 70) + "ç"), (Sizes{134, 8}));
 }
 
 TEST(Segment, AnEscapedCharacterStaysInOnePart) {
     // As the 160th and 161st septet it makes the text too long for one message.
-    EXPECT_EQ(sizes_of(repeat("x", 158) + "€"), Sizes{160});
-    EXPECT_EQ(sizes_of(repeat("x", 159) + "€"), (Sizes{153, 8}));
+    EXPECT_EQ(sizes_of(repeated_text("x", 158) + "€"), Sizes{160});
+    EXPECT_EQ(sizes_of(repeated_text("x", 159) + "€"), (Sizes{153, 8}));
     // Its escape would be the 153rd septet of the first part.
-    EXPECT_EQ(sizes_of(repeat("x", 152) + "€" + repeat("x", 10)), (Sizes{152, 12}));
-    EXPECT_EQ(sizes_of(repeat("x", 151) + "€" + repeat("x", 10)), (Sizes{153, 10}));
+    EXPECT_EQ(sizes_of(repeated_text("x", 152) + "€" + repeated_text("x", 10)), (Sizes{152, 12}));
+    EXPECT_EQ(sizes_of(repeated_text("x", 151) + "€" + repeated_text("x", 10)), (Sizes{153, 10}));
     // Two septets each: 76 and a single septet left over in every part.
-    EXPECT_EQ(sizes_of(repeat("€", 160)), (Sizes{152, 152, 16}));
-    for (const UserData &part : must(segment(repeat("€", 160))).parts)
-        EXPECT_EQ(must(decode_text(0x00, part.body)), repeat("€", part.body.size() / 2));
+    EXPECT_EQ(sizes_of(repeated_text("€", 160)), (Sizes{152, 152, 16}));
+    for (const UserData &part : must(segment(repeated_text("€", 160))).parts)
+        EXPECT_EQ(must(decode_text(0x00, part.body)), repeated_text("€", part.body.size() / 2));
 }
 
 TEST(Segment, ASurrogatePairStaysInOnePart) {
-    EXPECT_EQ(sizes_of(repeat("漢", 68) + "😀"), Sizes{140});
-    EXPECT_EQ(sizes_of(repeat("漢", 69) + "😀"), (Sizes{134, 8}));
-    EXPECT_EQ(sizes_of(repeat("漢", 66) + "😀" + repeat("漢", 5)), (Sizes{132, 14}));
-    EXPECT_EQ(sizes_of(repeat("漢", 65) + "😀" + repeat("漢", 5)), (Sizes{134, 10}));
-    EXPECT_EQ(sizes_of(repeat("😀", 70)), (Sizes{132, 132, 16}));
-    for (const UserData &part : must(segment(repeat("😀", 70))).parts)
-        EXPECT_EQ(must(decode_text(0x08, part.body)), repeat("😀", part.body.size() / 4));
+    EXPECT_EQ(sizes_of(repeated_text("漢", 68) + "😀"), Sizes{140});
+    EXPECT_EQ(sizes_of(repeated_text("漢", 69) + "😀"), (Sizes{134, 8}));
+    EXPECT_EQ(sizes_of(repeated_text("漢", 66) + "😀" + repeated_text("漢", 5)), (Sizes{132, 14}));
+    EXPECT_EQ(sizes_of(repeated_text("漢", 65) + "😀" + repeated_text("漢", 5)), (Sizes{134, 10}));
+    EXPECT_EQ(sizes_of(repeated_text("😀", 70)), (Sizes{132, 132, 16}));
+    for (const UserData &part : must(segment(repeated_text("😀", 70))).parts)
+        EXPECT_EQ(must(decode_text(0x08, part.body)), repeated_text("😀", part.body.size() / 4));
 }
 
 TEST(Segment, PartsAreNumberedAndShareTheReference) {
-    const SegmentedText text = must(segment(repeat("x", 400), {200, ReferenceWidth::k8Bit, {}}));
+    const SegmentedText text =
+        must(segment(repeated_text("x", 400), {200, ReferenceWidth::k8Bit, {}}));
     ASSERT_EQ(text.parts.size(), 3U);
     for (std::size_t i = 0; i < text.parts.size(); ++i) {
         const auto found = find_concatenation(*text.parts[i].header);
@@ -152,7 +153,8 @@ TEST(Segment, PartsAreNumberedAndShareTheReference) {
 }
 
 TEST(Segment, EveryPartFitsIntoAMessage) {
-    for (const std::string &text : {repeat("x", 1000), repeat("€", 500), repeat("漢", 500)}) {
+    for (const std::string &text :
+         {repeated_text("x", 1000), repeated_text("€", 500), repeated_text("漢", 500)}) {
         for (const ReferenceWidth width : {ReferenceWidth::k8Bit, ReferenceWidth::k16Bit}) {
             const SegmentedText parts = must(segment(text, {9, width, std::nullopt}));
             for (const UserData &part : parts.parts) {
@@ -175,21 +177,21 @@ TEST(Segment, AnAlphabetCanBeForced) {
 }
 
 TEST(Segment, MoreThan255PartsAreAnError) {
-    const SegmentedText longest = must(segment(repeat("x", 255 * 153)));
+    const SegmentedText longest = must(segment(repeated_text("x", 255 * 153)));
     EXPECT_EQ(longest.parts.size(), 255U);
-    const auto too_long = segment(repeat("x", 255 * 153 + 1));
+    const auto too_long = segment(repeated_text("x", 255 * 153 + 1));
     ASSERT_FALSE(too_long);
     EXPECT_EQ(too_long.error().kind, ErrorKind::kTooLong);
     EXPECT_EQ(too_long.error().message, "text takes 256 messages but 255 parts are the most");
     // 67 surrogate halves do not go into a part: 66 do.
-    EXPECT_EQ(must(segment(repeat("😀", 255 * 33))).parts.size(), 255U);
-    EXPECT_FALSE(segment(repeat("😀", 255 * 33 + 1)));
+    EXPECT_EQ(must(segment(repeated_text("😀", 255 * 33))).parts.size(), 255U);
+    EXPECT_FALSE(segment(repeated_text("😀", 255 * 33 + 1)));
 }
 
 TEST(Segment, RefusesIllFormedTextAndReferences) {
     EXPECT_EQ(segment("a\xFF").error().message, "text is not well-formed UTF-8 at byte 1");
-    EXPECT_FALSE(segment(repeat("x", 161), {256, ReferenceWidth::k8Bit, std::nullopt}));
-    EXPECT_TRUE(segment(repeat("x", 161), {256, ReferenceWidth::k16Bit, std::nullopt}));
+    EXPECT_FALSE(segment(repeated_text("x", 161), {256, ReferenceWidth::k8Bit, std::nullopt}));
+    EXPECT_TRUE(segment(repeated_text("x", 161), {256, ReferenceWidth::k16Bit, std::nullopt}));
 }
 
 } // namespace

@@ -17,7 +17,7 @@ using tpdu::MessageWaiting;
 using tpdu::WaitingKind;
 using tpdu_test::must;
 
-struct Row {
+struct CodingRow {
     std::uint8_t octet;
     DataCoding coding;
 };
@@ -25,7 +25,7 @@ struct Row {
 constexpr auto kNoClass = std::nullopt;
 constexpr auto kNoWaiting = std::nullopt;
 
-const std::vector<Row> kRows = {
+const std::vector<CodingRow> kCodingRows = {
     {0x00, {CodingGroup::kGeneral, Alphabet::kGsm7, false, kNoClass, kNoWaiting}},
     {0x04, {CodingGroup::kGeneral, Alphabet::kEightBit, false, kNoClass, kNoWaiting}},
     {0x08, {CodingGroup::kGeneral, Alphabet::kUcs2, false, kNoClass, kNoWaiting}},
@@ -60,7 +60,7 @@ const std::vector<Row> kRows = {
 };
 
 TEST(DataCoding, EachGroupBothWays) {
-    for (const Row &row : kRows) {
+    for (const CodingRow &row : kCodingRows) {
         EXPECT_EQ(tpdu::decode_data_coding(row.octet), row.coding) << std::hex << int{row.octet};
         EXPECT_EQ(must(tpdu::encode_data_coding(row.coding)), row.octet);
     }

@@ -39,14 +39,14 @@ const Decoder kSubmitError = [](OctetView o) {
 const Decoder kFromMobile = [](OctetView o) { return error_of(decode_from_mobile(o)); };
 const Decoder kToMobile = [](OctetView o) { return error_of(decode_to_mobile(o)); };
 
-struct Row {
+struct DecodeErrorRow {
     Decoder decode;
     std::string octets;
     ErrorKind kind;
     std::string message;
 };
 
-std::string repeat(std::string_view octet, std::size_t count) {
+std::string repeated_octet(std::string_view octet, std::size_t count) {
     std::string text;
     for (std::size_t i = 0; i < count; ++i)
         text += octet;
@@ -57,7 +57,7 @@ const std::string kScts = "1340908051030A";
 const std::string kSubmitHead = "01 00 01 81 F1 00";    // up to TP-PID, no header
 const std::string kSubmitHeadUdh = "41 00 01 81 F1 00"; // the same with a header
 
-const std::vector<Row> kRows = {
+const std::vector<DecodeErrorRow> kDecodeErrors = {
     // The type
     {kSubmit, "", ErrorKind::kTruncated, "TP-MTI is missing: the message ends before it"},
     {kSubmit, "00 00", ErrorKind::kMalformed, "TP-MTI is 0 but an SMS-SUBMIT has 1"},
@@ -75,7 +75,7 @@ const std::vector<Row> kRows = {
     {kSubmit, "01 00", ErrorKind::kTruncated, "TP-DA is missing: the message ends before it"},
     {kSubmit, "01 00 03 81 21", ErrorKind::kTruncated,
      "TP-DA says 3 semi-octets but only 1 octet follows"},
-    {kSubmit, "01 00 16 81" + repeat("11", 11), ErrorKind::kTooLong,
+    {kSubmit, "01 00 16 81" + repeated_octet("11", 11), ErrorKind::kTooLong,
      "TP-DA says 22 semi-octets but holds 20 at most"},
     {kSubmit, "01 00 01 81 F1", ErrorKind::kTruncated,
      "TP-PID is missing: the message ends before it"},
@@ -89,15 +89,15 @@ const std::vector<Row> kRows = {
     {kSubmit, kSubmitHead + "00", ErrorKind::kTruncated,
      "TP-UDL is missing: the message ends before it"},
     // TP-UDL against what is there
-    {kSubmit, kSubmitHead + "00 28" + repeat("41", 12), ErrorKind::kTruncated,
+    {kSubmit, kSubmitHead + "00 28" + repeated_octet("41", 12), ErrorKind::kTruncated,
      "TP-UDL says 40 septets but only 12 octets follow"},
     {kSubmit, kSubmitHead + "00 02 41", ErrorKind::kTruncated,
      "TP-UDL says 2 septets but only 1 octet follows"},
     {kSubmit, kSubmitHead + "04 01", ErrorKind::kTruncated,
      "TP-UDL says 1 octet but only 0 octets follow"},
-    {kSubmit, kSubmitHead + "00 A1" + repeat("41", 141), ErrorKind::kTooLong,
+    {kSubmit, kSubmitHead + "00 A1" + repeated_octet("41", 141), ErrorKind::kTooLong,
      "TP-UDL says 161 septets but an SMS-SUBMIT carries 160 at most"},
-    {kSubmit, kSubmitHead + "08 8E" + repeat("41", 142), ErrorKind::kTooLong,
+    {kSubmit, kSubmitHead + "08 8E" + repeated_octet("41", 142), ErrorKind::kTooLong,
      "TP-UDL says 142 octets but an SMS-SUBMIT carries 140 at most"},
     // The classic slip of counting octets where septets count: 9 septets take 8 octets only.
     {kSubmit, kSubmitHead + "00 09 E8329BFD4697D9EC37", ErrorKind::kTrailing,
@@ -122,7 +122,7 @@ const std::vector<Row> kRows = {
      "TP-SCTS needs 7 octets but only 1 octet follows"},
     {kDeliver, "04 02 01 21", ErrorKind::kMalformed,
      "TP-OA has the type of address 0x01, whose top bit is not set"},
-    {kDeliver, "04 02 81 21 00 00" + kScts + "A1" + repeat("41", 141), ErrorKind::kTooLong,
+    {kDeliver, "04 02 81 21 00 00" + kScts + "A1" + repeated_octet("41", 141), ErrorKind::kTooLong,
      "TP-UDL says 161 septets but an SMS-DELIVER carries 160 at most"},
     {kDeliver, "04 02 81 21 00 00" + kScts + "00 00", ErrorKind::kTrailing,
      "TP-UD ends before the message does: 1 octet left over"},
@@ -137,7 +137,7 @@ const std::vector<Row> kRows = {
      "TP-DCS is missing: the message ends before it"},
     {kStatusReport, "06 2A 01 91 F1" + kScts + kScts + "00 00 00", ErrorKind::kTrailing,
      "TP-PI ends before the message does: 1 octet left over"},
-    {kStatusReport, "06 2A 01 91 F1" + kScts + kScts + "00 06 04 84" + repeat("41", 132),
+    {kStatusReport, "06 2A 01 91 F1" + kScts + kScts + "00 06 04 84" + repeated_octet("41", 132),
      ErrorKind::kTooLong, "TP-UDL says 132 octets but an SMS-STATUS-REPORT carries 131 at most"},
     // Reports
     {kDeliverAck, "00", ErrorKind::kTruncated, "TP-PI is missing: the message ends before it"},
@@ -147,18 +147,18 @@ const std::vector<Row> kRows = {
      "TP-PID ends before the message does: 1 octet left over"},
     {kDeliverAck, "00 02 00 00", ErrorKind::kTrailing,
      "TP-DCS ends before the message does: 1 octet left over"},
-    {kDeliverAck, "00 06 04 A0" + repeat("41", 160), ErrorKind::kTooLong,
+    {kDeliverAck, "00 06 04 A0" + repeated_octet("41", 160), ErrorKind::kTooLong,
      "TP-UDL says 160 octets but an SMS-DELIVER-REPORT of success carries 159 at most"},
     {kDeliverError, "00", ErrorKind::kTruncated, "TP-FCS is missing: the message ends before it"},
     {kDeliverError, "00 D3", ErrorKind::kTruncated, "TP-PI is missing: the message ends before it"},
-    {kDeliverError, "00 D3 06 04 9F" + repeat("41", 159), ErrorKind::kTooLong,
+    {kDeliverError, "00 D3 06 04 9F" + repeated_octet("41", 159), ErrorKind::kTooLong,
      "TP-UDL says 159 octets but an SMS-DELIVER-REPORT of failure carries 158 at most"},
     {kSubmitAck, "01 00 1340", ErrorKind::kTruncated,
      "TP-SCTS needs 7 octets but only 2 octets follow"},
-    {kSubmitAck, "01 04" + kScts + "AE" + repeat("41", 153), ErrorKind::kTooLong,
+    {kSubmitAck, "01 04" + kScts + "AE" + repeated_octet("41", 153), ErrorKind::kTooLong,
      "TP-UDL says 174 septets but an SMS-SUBMIT-REPORT of success carries 173 at most"},
     {kSubmitError, "01 C4", ErrorKind::kTruncated, "TP-PI is missing: the message ends before it"},
-    {kSubmitError, "01 C4 04" + kScts + "AD" + repeat("41", 152), ErrorKind::kTooLong,
+    {kSubmitError, "01 C4 04" + kScts + "AD" + repeated_octet("41", 152), ErrorKind::kTooLong,
      "TP-UDL says 173 septets but an SMS-SUBMIT-REPORT of failure carries 172 at most"},
     // Through the general decoders the error is that of the message meant
     {kFromMobile, "01", ErrorKind::kTruncated, "TP-MR is missing: the message ends before it"},
@@ -168,7 +168,7 @@ const std::vector<Row> kRows = {
 };
 
 TEST(DecodeErrors, NameTheFieldAndTheProblem) {
-    for (const Row &row : kRows) {
+    for (const DecodeErrorRow &row : kDecodeErrors) {
         const auto error = row.decode(hex(row.octets));
         ASSERT_TRUE(error) << row.octets << " was accepted; expected: " << row.message;
         EXPECT_EQ(error->message, row.message);

@@ -15,7 +15,7 @@ using tpdu::Timestamp;
 using tpdu_test::hex;
 using tpdu_test::must;
 
-struct Row {
+struct TimestampRow {
     Timestamp time;
     std::string_view octets;
     std::string_view text;
@@ -23,7 +23,7 @@ struct Row {
 };
 
 // Seconds of the epoch as `date -u -d TEXT +%s` gives them.
-const std::vector<Row> kRows = {
+const std::vector<TimestampRow> kTimestampRows = {
     {{2000, 1, 1, 0, 0, 0, 0}, "00 10 10 00 00 00 00", "2000-01-01T00:00:00+00:00", 946684800},
     {{2031, 4, 9, 8, 15, 30, 8}, "13 40 90 80 51 03 80", "2031-04-09T08:15:30+02:00", 1933481730},
     // Five hours behind UTC: 20 quarters, and the sign in the tens' top bit.
@@ -48,7 +48,7 @@ const std::vector<Row> kRows = {
 };
 
 TEST(Timestamp, BothWays) {
-    for (const Row &row : kRows) {
+    for (const TimestampRow &row : kTimestampRows) {
         EXPECT_EQ(must(tpdu::encode_timestamp(row.time)), hex(row.octets)) << row.text;
         EXPECT_EQ(must(tpdu::decode_timestamp(hex(row.octets))), row.time) << row.text;
         EXPECT_TRUE(tpdu::is_valid(row.time));
@@ -56,12 +56,12 @@ TEST(Timestamp, BothWays) {
 }
 
 TEST(Timestamp, AsText) {
-    for (const Row &row : kRows)
+    for (const TimestampRow &row : kTimestampRows)
         EXPECT_EQ(to_text(row.time), row.text);
 }
 
 TEST(Timestamp, ToAndFromSecondsOfTheEpoch) {
-    for (const Row &row : kRows) {
+    for (const TimestampRow &row : kTimestampRows) {
         EXPECT_EQ(tpdu::to_unix_seconds(row.time), row.unix_seconds) << row.text;
         EXPECT_EQ(must(tpdu::timestamp_from_unix(row.unix_seconds, row.time.zone_quarters)),
                   row.time);

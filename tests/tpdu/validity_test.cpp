@@ -26,7 +26,7 @@ using tpdu::Validity;
 using tpdu_test::hex;
 using tpdu_test::must;
 
-tpdu::Submit submit_with(const Validity &validity) {
+tpdu::Submit submit_valid_for(const Validity &validity) {
     tpdu::Submit submit;
     submit.destination = must(tpdu::number_address("1"));
     submit.validity = validity;
@@ -67,14 +67,14 @@ TEST(RelativeValidity, RoundsUpToTheNextStep) {
     EXPECT_EQ(too_long.error().message, "TP-VP cannot be 635041 minutes: 63 weeks at most");
 }
 
-struct Row {
+struct ValidityRow {
     const char *name;
     Validity validity;
     std::uint8_t first; // TP-VPF beside the type
     std::string_view octets;
 };
 
-const std::vector<Row> kRows = {
+const std::vector<ValidityRow> kValidityRows = {
     {"none", std::monostate{}, 0x01, ""},
     {"relative", RelativeValidity{0xA7}, 0x11, "A7"},
     {"absolute", Timestamp{2031, 4, 9, 8, 15, 30, -20}, 0x19, "13 40 90 80 51 03 0A"},
@@ -88,10 +88,10 @@ const std::vector<Row> kRows = {
 };
 
 TEST(Validity, EveryFormatBothWays) {
-    for (const Row &row : kRows) {
+    for (const ValidityRow &row : kValidityRows) {
         const tpdu::Octets octets = message_with(row.first, row.octets);
-        EXPECT_EQ(must(tpdu::encode(submit_with(row.validity))), octets) << row.name;
-        EXPECT_EQ(must(tpdu::decode_submit(octets)), submit_with(row.validity)) << row.name;
+        EXPECT_EQ(must(tpdu::encode(submit_valid_for(row.validity))), octets) << row.name;
+        EXPECT_EQ(must(tpdu::decode_submit(octets)), submit_valid_for(row.validity)) << row.name;
     }
 }
 
@@ -128,7 +128,7 @@ TEST(Validity, EncodingRefusesWhatCannotBeExpressed) {
          "TP-VP cannot hold 2031-02-30T00:00:00+00:00: no such time in the years 2000 to 2099"},
     };
     for (const auto &[validity, message] : misfits) {
-        const auto octets = tpdu::encode(submit_with(validity));
+        const auto octets = tpdu::encode(submit_valid_for(validity));
         ASSERT_FALSE(octets) << message;
         EXPECT_EQ(octets.error().kind, ErrorKind::kOutOfRange);
         EXPECT_EQ(octets.error().message, message);
