@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "imsctl/line/command_line.hpp"
+#include "imsctl/modules.hpp"
 
 #include <clocale>
 #include <csignal>
@@ -24,5 +25,6 @@ int main(int argc, char **argv) {
     std::signal(SIGPIPE, SIG_IGN);
     std::setlocale(LC_ALL, "");
     const std::span<const char *const> words(argv, static_cast<std::size_t>(argc));
-    return imsctl::run(words.empty() ? words : words.subspan(1), stdout, stderr);
+    return imsctl::run(imsctl::all_modules(), words.empty() ? words : words.subspan(1), stdout,
+                       stderr);
 }

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // How calls are responded to and what the radio side reports: not about one call's sound or
 // parties.
+#include "imsctl/call/module.hpp"
 #include "imsctl/call/values.hpp"
 #include "imsctl/line/requests.hpp"
 
@@ -43,7 +44,7 @@ Action prepare_ssac(Arguments &arguments) {
     };
 }
 
-constexpr Verb kVerbs[] = {
+constexpr Verb kAccessVerbs[] = {
     {"call auto-response", "have incoming calls answered or rejected by themselves",
      "call auto-response answer --delay 3", prepare_auto_response},
     {"call emergency-pdn set", "describe the packet data network for emergency calls",
@@ -79,7 +80,7 @@ constexpr Verb kVerbs[] = {
 } // namespace
 
 std::span<const Verb> access_verbs() {
-    return kVerbs;
+    return kAccessVerbs;
 }
 
 } // namespace imsctl

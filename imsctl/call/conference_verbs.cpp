@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Calls with more than two parties.
+#include "imsctl/call/module.hpp"
 #include "imsctl/call/session_value.hpp"
 #include "imsctl/call/values.hpp"
 #include "imsctl/line/requests.hpp"
@@ -75,7 +76,7 @@ Action prepare_nway_change(Arguments &arguments, PairRequest request) {
     return on_session(arguments.session_option(kConference), call, request);
 }
 
-constexpr Verb kVerbs[] = {
+constexpr Verb kConferenceVerbs[] = {
     {"call conference start", "start a conference with a list of parties",
      "call conference start +15550101 +15550150", prepare_start},
     {"call conference modify", "add parties to a conference, or remove them",
@@ -102,7 +103,7 @@ constexpr Verb kVerbs[] = {
 } // namespace
 
 std::span<const Verb> conference_verbs() {
-    return kVerbs;
+    return kConferenceVerbs;
 }
 
 } // namespace imsctl

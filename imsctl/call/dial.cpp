@@ -2,6 +2,7 @@
 // Placing a call, and following it until it is established or over.
 #include "imsctl/call/dial.hpp"
 
+#include "imsctl/call/module.hpp"
 #include "imsctl/call/values.hpp"
 #include "imsctl/line/requests.hpp"
 
@@ -96,7 +97,7 @@ class Follower {
 
 void dial_and_wait(Invocation &run, const DialArguments &given) {
     for (const int id : kFollowed)
-        run.client().watch(*find_event(id));
+        run.client().watch(*find_event(call_events(), id));
     const Fields placed = place_call(run.client(), given);
     if (placed.empty())
         throw Failure(FailureKind::kService, "the service did not say which session the call has");

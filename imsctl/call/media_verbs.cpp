@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // Sound, tones, recording and text telephony inside a call.
+#include "imsctl/call/module.hpp"
 #include "imsctl/call/session_value.hpp"
 #include "imsctl/call/values.hpp"
 #include "imsctl/line/requests.hpp"
@@ -100,7 +101,7 @@ Action prepare_speaker(Arguments &arguments) {
     return on_session(arguments.session_option(kEstablished), mode, ims_call_set_speaker_mode);
 }
 
-constexpr Verb kVerbs[] = {
+constexpr Verb kMediaVerbs[] = {
     {"call dtmf", "send DTMF digits, or start and stop one tone", "call dtmf 1234", prepare_dtmf},
     {"call record", "start or stop recording the voice", "call record start --file call.wav",
      prepare_record},
@@ -131,7 +132,7 @@ constexpr Verb kVerbs[] = {
 } // namespace
 
 std::span<const Verb> media_verbs() {
-    return kVerbs;
+    return kMediaVerbs;
 }
 
 } // namespace imsctl

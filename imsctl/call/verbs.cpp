@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Placing, answering, ending and changing calls.
 #include "imsctl/call/dial.hpp"
+#include "imsctl/call/module.hpp"
 #include "imsctl/call/session_value.hpp"
 #include "imsctl/call/values.hpp"
 #include "imsctl/line/requests.hpp"
@@ -51,7 +52,7 @@ Fields decode_change_result(void *data) {
 }
 
 Action prepare_change_to(Arguments &arguments, std::int32_t usual_type, PairRequest request,
-                         Decode decode = nullptr) {
+                         const Decode &decode = nullptr) {
     const auto session = arguments.session_place(kInConversation);
     return on_session(session,
                       arguments.choice("--type", "what it becomes", kCallTypes, usual_type),
@@ -111,7 +112,7 @@ void list_calls(Invocation &run) {
     run.output().result({{"calls", entries}}, call_table(calls));
 }
 
-constexpr Verb kVerbs[] = {
+constexpr Verb kCallVerbs[] = {
     {"call dial", "place a call", "call dial +15550101 --wait", prepare_dial},
     {"call answer", "answer an incoming call", "call answer", prepare_answer},
     {"call end", "end a call", "call end 1", prepare_end},
@@ -151,7 +152,7 @@ constexpr Verb kVerbs[] = {
 } // namespace
 
 std::span<const Verb> call_verbs() {
-    return kVerbs;
+    return kCallVerbs;
 }
 
 } // namespace imsctl

@@ -3,6 +3,7 @@
 
 #include "imsctl/client/last_words.hpp"
 
+#include <algorithm>
 #include <fmt/format.h>
 
 namespace imsctl {
@@ -58,6 +59,7 @@ CallList Client::call_list() {
 }
 
 void Client::watch(const EventRow &row) {
+    watched_.push_back(&row);
     if (const int code = ims_set_notification_cb(handle_, row.id, on_event, this);
         code != IMS_ERROR_NONE)
         throw library_failure(code);
@@ -87,9 +89,10 @@ void Client::on_response(ims_h, int result, void *data, void *user_data) {
 }
 
 void Client::on_event(ims_h, int noti_id, void *record, void *user_data) {
-    if (const EventRow *row = find_event(noti_id))
-        static_cast<Client *>(user_data)->events_.push_back(
-            {row, take_fields(*row, record), g_get_real_time()});
+    auto &client = *static_cast<Client *>(user_data);
+    const auto row = std::find_if(client.watched_.begin(), client.watched_.end(),
+                                  [&](const EventRow *each) { return each->id == noti_id; });
+    client.events_.push_back({*row, take_fields(**row, record), g_get_real_time()});
 }
 
 } // namespace imsctl

@@ -10,6 +10,7 @@
 #include <ims.h>
 #include <list>
 #include <memory>
+#include <vector>
 
 namespace imsctl {
 
@@ -83,6 +84,7 @@ class Client {
     ims_h handle_ = nullptr;
     // Kept to the end: an answer may come after nobody waits for it any more.
     std::list<Pending> pending_;
+    std::vector<const EventRow *> watched_;
     std::deque<Event> events_;
 };
 

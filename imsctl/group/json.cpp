@@ -30,7 +30,7 @@ Json list_of(Element *elements, std::int32_t count) {
     return list;
 }
 
-class Writer {
+class JsonWriter {
   public:
     void operator()(const char *name, bool flag) { object[name] = flag; }
     void operator()(const char *name, std::int32_t number) { object[name] = number; }
@@ -68,7 +68,7 @@ class Writer {
 
 template <class Record>
 Json object_of(Record &record) {
-    Writer writer;
+    JsonWriter writer;
     visit_fields(writer, record);
     return std::move(writer.object);
 }

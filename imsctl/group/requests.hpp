@@ -25,15 +25,15 @@ void put_uri(char (&buffer)[Size], const std::string &uri, const char *place) {
 }
 
 // A request about a group and one more value.
-template <class Value>
-using GroupRequest = int (*)(ims_h, const char *group_uri, Value, ims_response_cb, void *);
+template <class Content>
+using GroupRequest = int (*)(ims_h, const char *group_uri, Content, ims_response_cb, void *);
 
-template <class Value>
-void request_about(Invocation &run, const std::string &group, GroupRequest<Value> request,
-                   Value value) {
+template <class Content>
+void request_about(Invocation &run, const std::string &group, GroupRequest<Content> request,
+                   Content content) {
     run.request({{"group_uri", group}},
                 [&](ims_h handle, ims_response_cb callback, void *user_data) {
-                    return request(handle, group.c_str(), value, callback, user_data);
+                    return request(handle, group.c_str(), content, callback, user_data);
                 });
 }
 

@@ -60,9 +60,9 @@ Json or_null(const char *type) {
     return {{"type", Json::array({type, "null"})}};
 }
 
-class Writer {
+class SchemaWriter {
   public:
-    explicit Writer(Json &definitions) : definitions_(definitions) {}
+    explicit SchemaWriter(Json &definitions) : definitions_(definitions) {}
 
     void operator()(const char *name, bool) { properties[name] = or_null("boolean"); }
     void operator()(const char *name, std::int32_t) {
@@ -145,7 +145,7 @@ class Writer {
     Json &definitions_;
 };
 
-Json object_schema(const Writer &writer) {
+Json object_schema(const SchemaWriter &writer) {
     Json schema = {{"type", "object"},
                    {"properties", writer.properties},
                    {"required", writer.required_names},
@@ -156,10 +156,10 @@ Json object_schema(const Writer &writer) {
 }
 
 template <class Record>
-Json Writer::reference() {
+Json SchemaWriter::reference() {
     const std::string name = kind(static_cast<const Record *>(nullptr));
     if (!definitions_.contains(name)) {
-        Writer writer(definitions_);
+        SchemaWriter writer(definitions_);
         Record record{};
         visit_fields(writer, record);
         definitions_[name] = object_schema(writer);
@@ -171,7 +171,7 @@ Json Writer::reference() {
 
 Json group_schema() {
     Json definitions = Json::object();
-    Writer writer(definitions);
+    SchemaWriter writer(definitions);
     ims_xdm_group_info_s group{};
     visit_fields(writer, group);
     writer.properties["verb"] = {{"description", "not read: stands in what imsctl shows"}};

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // The properties of a group, one at a time.
 #include "imsctl/group/document.hpp"
+#include "imsctl/group/module.hpp"
 #include "imsctl/group/requests.hpp"
 #include "imsctl/output/failure.hpp"
 
@@ -179,7 +180,7 @@ Action prepare_default(Arguments &arguments) {
     };
 }
 
-constexpr Verb kVerbs[] = {
+constexpr Verb kGroupSetVerbs[] = {
     {"group set display-name", "set a group's display name",
      "group set display-name sip:team@example.org Team", prepare_display_name},
     {"group set subject", "set a group's subject", "group set subject sip:team@example.org Lunch",
@@ -209,7 +210,7 @@ constexpr Verb kVerbs[] = {
 } // namespace
 
 std::span<const Verb> group_set_verbs() {
-    return kVerbs;
+    return kGroupSetVerbs;
 }
 
 } // namespace imsctl

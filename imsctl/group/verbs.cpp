@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Group documents: as a whole, their members and rules, and what the service tells of groups.
 #include "imsctl/group/document.hpp"
+#include "imsctl/group/module.hpp"
 #include "imsctl/group/requests.hpp"
 #include "imsctl/group/schema.hpp"
 #include "imsctl/output/failure.hpp"
@@ -181,7 +182,7 @@ Action prepare_schema(Arguments &) {
     return [](Invocation &run) { run.output().line(group_schema().dump(2)); };
 }
 
-constexpr Verb kVerbs[] = {
+constexpr Verb kGroupVerbs[] = {
     {"group create", "create a group from a document", "group create team.json", prepare_create},
     {"group delete", "delete a group", "group delete sip:team@example.org", prepare_delete},
     {"group show", "show a group's document", "group show sip:team@example.org", prepare_show},
@@ -207,7 +208,7 @@ constexpr Verb kVerbs[] = {
 } // namespace
 
 std::span<const Verb> group_verbs() {
-    return kVerbs;
+    return kGroupVerbs;
 }
 
 } // namespace imsctl

@@ -34,7 +34,11 @@ using Completions = std::map<const CLI::Option *, std::vector<std::string>>;
 // Names are as CLI11 has them: "NUMBER" is a place, "--number" an option, "NUMBER,--number" both.
 class Arguments {
   public:
-    Arguments(CLI::App &verb, Completions &completions) : verb_(verb), completions_(completions) {}
+    Arguments(CLI::App &verb, Completions &completions, std::span<const EventRow> events)
+        : verb_(verb), completions_(completions), events_(events) {}
+
+    // All that there are: for a verb that lets its user choose among them.
+    std::span<const EventRow> events() const { return events_; }
 
     // Required.
     Argument<std::int32_t> number(const std::string &names, const std::string &help);
@@ -84,6 +88,7 @@ class Arguments {
 
     CLI::App &verb_;
     Completions &completions_;
+    std::span<const EventRow> events_;
 };
 
 // More than 0 and at most kLongestWait.

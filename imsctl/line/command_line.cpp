@@ -3,7 +3,6 @@
 
 #include "imsctl/line/completion.hpp"
 #include "imsctl/line/suggestions.hpp"
-#include "imsctl/line/verbs.hpp"
 
 #include <CLI/CLI.hpp>
 #include <algorithm>
@@ -28,7 +27,7 @@ bool is_option(std::string_view word) {
 // The verbs and options as CLI11 knows them, and what each verb does.
 class CommandLine {
   public:
-    CommandLine();
+    explicit CommandLine(const Catalogue &catalogue);
 
     CLI::App &program() { return program_; }
     const Completions &completions() const { return completions_; }
@@ -52,6 +51,7 @@ class CommandLine {
     std::string hint(const CLI::App &verb) const;
     static std::string path_of(const CLI::App &verb);
 
+    const Catalogue &catalogue_;
     CLI::App program_{"Uses the device's IMS service from a shell.", "imsctl"};
     Completions completions_;
     Argument<std::int32_t> slot_;
@@ -62,9 +62,9 @@ class CommandLine {
     std::map<const CLI::App *, std::string> examples_;
 };
 
-CommandLine::CommandLine() {
+CommandLine::CommandLine(const Catalogue &catalogue) : catalogue_(catalogue) {
     const Settings usual;
-    Arguments globals(program_, completions_);
+    Arguments globals(program_, completions_, catalogue_.events());
     slot_ = globals.number_from(0, std::numeric_limits<std::int32_t>::max(), "--slot",
                                 "the subscription slot (default 0)", usual.slot);
     json_ = globals.flag(std::string(kJsonFlag), "JSON objects instead of text");
@@ -77,7 +77,7 @@ CommandLine::CommandLine() {
     program_.get_formatter()->label("SUBCOMMAND", "VERB");
     program_.get_formatter()->label("Positionals", "Arguments");
     program_.get_formatter()->label("REQUIRED", "");
-    for (const Verb &verb : all_verbs())
+    for (const Verb &verb : catalogue_.verbs())
         add_verb(verb);
     program_.footer("Examples:\n"
                     "  imsctl call dial +15550101 --wait\n"
@@ -101,7 +101,7 @@ CLI::App &CommandLine::group_of(std::string_view path) {
     const auto known = groups_.find(name);
     if (known != groups_.end())
         return *known->second;
-    CLI::App &group = add_word(group_of(name), last_word(name), group_summary(name));
+    CLI::App &group = add_word(group_of(name), last_word(name), catalogue_.group_summary(name));
     group.require_subcommand(1);
     group.footer(fmt::format("Help for one verb: imsctl {} VERB --help", name));
     groups_[name] = &group;
@@ -110,7 +110,7 @@ CLI::App &CommandLine::group_of(std::string_view path) {
 
 void CommandLine::add_verb(const Verb &verb) {
     CLI::App &app = add_word(group_of(verb.path), last_word(verb.path), verb.summary);
-    Arguments arguments(app, completions_);
+    Arguments arguments(app, completions_, catalogue_.events());
     actions_[&app] = verb.prepare(arguments);
     examples_[&app] = fmt::format("imsctl {}", verb.example);
     app.footer(fmt::format("Example: {}\nAlso: --slot, --json and --timeout; see imsctl --help",
@@ -230,8 +230,9 @@ std::string completed(CommandLine &line, std::span<const char *const> words) {
 
 } // namespace
 
-int run(std::span<const char *const> arguments, std::FILE *out, std::FILE *err) {
-    CommandLine line;
+int run(const Catalogue &catalogue, std::span<const char *const> arguments, std::FILE *out,
+        std::FILE *err) {
+    CommandLine line(catalogue);
     const bool json = asks_for_json(arguments);
     const Output plain(false, out, err);
     if (!arguments.empty() && std::string_view(arguments.front()) == "__complete")

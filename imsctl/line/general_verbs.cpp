@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
-// What is not a request: watching, and shell completion.
+#include "imsctl/line/general_verbs.hpp"
+
 #include "imsctl/line/completion.hpp"
-#include "imsctl/line/requests.hpp"
 #include "imsctl/line/watching.hpp"
 
 #include <algorithm>
@@ -10,6 +10,7 @@ namespace imsctl {
 namespace {
 
 struct MonitorArguments {
+    std::span<const EventRow> known;
     Argument<std::vector<std::string>> events;
     Argument<std::vector<std::string>> modules;
     WatchLimits limits;
@@ -21,7 +22,7 @@ std::vector<const EventRow *> chosen_events(const MonitorArguments &given) {
         return std::find(names.begin(), names.end(), name) != names.end();
     };
     const bool all = given.events->empty() && given.modules->empty();
-    for (const EventRow &row : all_events())
+    for (const EventRow &row : given.known)
         if (all || is_named(*given.events, row.name) || is_named(*given.modules, row.module))
             rows.push_back(&row);
     return rows;
@@ -36,9 +37,12 @@ void monitor(Invocation &run, const MonitorArguments &given) {
 }
 
 Action prepare_monitor(Arguments &arguments) {
+    const std::span<const EventRow> known = arguments.events();
     const MonitorArguments given{
-        arguments.some_names("EVENT", "show these only, for example call-ended", event_names()),
-        arguments.some_names("--module", "show the events of this module", event_modules()),
+        known,
+        arguments.some_names("EVENT", "show these only, for example call-ended",
+                             event_names(known)),
+        arguments.some_names("--module", "show the events of this module", event_modules(known)),
         watch_limits(arguments)};
     return [given](Invocation &run) { monitor(run, given); };
 }
@@ -48,7 +52,7 @@ Action prepare_completion(Arguments &arguments) {
     return [](Invocation &run) { run.output().line(bash_completion_script()); };
 }
 
-constexpr Verb kVerbs[] = {
+constexpr Verb kGeneralVerbs[] = {
     {"monitor", "show events as they arrive, until it is stopped with Ctrl-C or a signal",
      "monitor call-incoming-ind call-ended --json", prepare_monitor},
     {"completion", "print a script that completes imsctl's words in a shell",
@@ -57,8 +61,8 @@ constexpr Verb kVerbs[] = {
 
 } // namespace
 
-std::span<const Verb> general_verbs() {
-    return kVerbs;
+Module general_module() {
+    return {{}, {kGeneralVerbs}, {}};
 }
 
 } // namespace imsctl

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-// Every event that imsctl knows: its name, its id and the fields of its record.
+// What is known of an event: its name, its id and the fields of its record.
 #pragma once
 
 #include "imsctl/output/fields.hpp"
@@ -24,22 +24,11 @@ struct EventRow {
     std::string (*summary)(const Fields &) = nullptr;
 };
 
-// One table a file, NAME_events.cpp, in the order of the ids. A new module takes such a file (made
-// of event_fields.hpp), a line here and one in all_events().
-std::span<const EventRow> registration_events();
-std::span<const EventRow> call_events();
-std::span<const EventRow> sms_events();
-std::span<const EventRow> poc_events();
-std::span<const EventRow> login_events();
-
-std::span<const EventRow> all_events();
-
 // nullptr when there is none.
-const EventRow *find_event(std::string_view name);
-const EventRow *find_event(int id);
+const EventRow *find_event(std::span<const EventRow> events, int id);
 
-std::vector<std::string> event_names();
-std::vector<std::string> event_modules();
+std::vector<std::string> event_names(std::span<const EventRow> events);
+std::vector<std::string> event_modules(std::span<const EventRow> events);
 
 // To be called once for a record: takes over and releases the texts in it.
 Fields take_fields(const EventRow &row, void *record);

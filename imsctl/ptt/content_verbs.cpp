@@ -2,6 +2,7 @@
 // What is sent and kept: messages, files, recordings.
 #include "imsctl/line/requests.hpp"
 #include "imsctl/ptt/file.hpp"
+#include "imsctl/ptt/module.hpp"
 #include "imsctl/ptt/parties.hpp"
 
 namespace imsctl {
@@ -107,7 +108,7 @@ Action prepare_recording(Arguments &arguments, NumberRequest request) {
     };
 }
 
-constexpr Verb kVerbs[] = {
+constexpr Verb kPttContentVerbs[] = {
     {"ptt message send", "send a message", "ptt message send Hello --to +15550101",
      prepare_message_send},
     {"ptt message notify", "tell that a received message was delivered or read",
@@ -147,7 +148,7 @@ constexpr Verb kVerbs[] = {
 } // namespace
 
 std::span<const Verb> ptt_content_verbs() {
-    return kVerbs;
+    return kPttContentVerbs;
 }
 
 } // namespace imsctl

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // What tells of push-to-talk.
 #include "imsctl/output/event_fields.hpp"
+#include "imsctl/ptt/module.hpp"
 #include "imsctl/ptt/summaries.hpp"
 
 namespace imsctl {
@@ -68,7 +69,7 @@ constexpr FieldRow pointed(std::string_view name) {
     return {name, take_pointed<Member>};
 }
 
-constexpr FieldRow kIncoming[] = {
+constexpr FieldRow kIncomingFields[] = {
     field<&ims_poc_call_incoming_s::flag_1>("flag_1"),
     field<&ims_poc_call_incoming_s::flag_2>("flag_2"),
     field<&ims_poc_call_incoming_s::flag_3>("flag_3"),
@@ -85,9 +86,9 @@ constexpr FieldRow kIncoming[] = {
     field<&ims_poc_call_incoming_s::int_set_2>("int_set_2"),
 };
 
-constexpr FieldRow kCallEvent[] = {field<&ims_poc_call_event_s::value_1>("value_1")};
+constexpr FieldRow kCallEventFields[] = {field<&ims_poc_call_event_s::value_1>("value_1")};
 
-constexpr FieldRow kEstablished[] = {
+constexpr FieldRow kEstablishedFields[] = {
     field<&ims_poc_call_established_s::value_1>("value_1"),
     field<&ims_poc_call_established_s::value_2>("value_2"),
     field<&ims_poc_call_established_s::flag_1>("flag_1"),
@@ -99,12 +100,12 @@ constexpr FieldRow kEstablished[] = {
     {"peer", take_embedded<&ims_poc_call_established_s::peer>},
 };
 
-constexpr FieldRow kEnded[] = {
+constexpr FieldRow kEndedFields[] = {
     field<&ims_poc_call_ended_s::value_1>("value_1"),
     field<&ims_poc_call_ended_s::value_2>("value_2"),
 };
 
-constexpr FieldRow kFloor[] = {
+constexpr FieldRow kFloorFields[] = {
     field<&ims_poc_floor_event_s::value_1>("value_1"),
     field<&ims_poc_floor_event_s::int_set_1>("int_set_1"),
     field<&ims_poc_floor_event_s::value_2>("value_2"),
@@ -117,7 +118,7 @@ constexpr FieldRow kFloor[] = {
     field<&ims_poc_floor_event_s::text_3>("text_3"),
 };
 
-constexpr FieldRow kModifyRequest[] = {
+constexpr FieldRow kModifyRequestFields[] = {
     field<&ims_poc_modify_request_s::flag_1>("flag_1"),
     field<&ims_poc_modify_request_s::flag_2>("flag_2"),
     field<&ims_poc_modify_request_s::value_1>("value_1"),
@@ -126,7 +127,7 @@ constexpr FieldRow kModifyRequest[] = {
     field<&ims_poc_modify_request_s::int_set_2>("int_set_2"),
 };
 
-constexpr FieldRow kModifyStatus[] = {
+constexpr FieldRow kModifyStatusFields[] = {
     field<&ims_poc_modify_status_s::flag_1>("flag_1"),
     field<&ims_poc_modify_status_s::flag_2>("flag_2"),
     field<&ims_poc_modify_status_s::flag_3>("flag_3"),
@@ -136,18 +137,18 @@ constexpr FieldRow kModifyStatus[] = {
     field<&ims_poc_modify_status_s::int_set_2>("int_set_2"),
 };
 
-constexpr FieldRow kAdvertisement[] = {
+constexpr FieldRow kAdvertisementFields[] = {
     field<&ims_poc_group_advertisement_s::value_1>("value_1"),
     pointed<&ims_poc_group_advertisement_s::group_adv>("group_adv"),
 };
 
-constexpr FieldRow kParticipantInfo[] = {
+constexpr FieldRow kParticipantInfoFields[] = {
     field<&ims_poc_participant_info_s::value_1>("value_1"),
     field<&ims_poc_participant_info_s::text_1>("text_1"),
     field<&ims_poc_participant_info_s::text_2>("text_2"),
 };
 
-constexpr FieldRow kIncomingMsg[] = {
+constexpr FieldRow kIncomingMsgFields[] = {
     field<&ims_poc_incoming_msg_s::value_1>("value_1"),
     pointed<&ims_poc_incoming_msg_s::peer_1>("peer_1"),
     field<&ims_poc_incoming_msg_s::text_1>("text_1"),
@@ -162,7 +163,7 @@ constexpr FieldRow kIncomingMsg[] = {
     pointed<&ims_poc_incoming_msg_s::peer_2>("peer_2"),
 };
 
-constexpr FieldRow kMsgNotification[] = {
+constexpr FieldRow kMsgNotificationFields[] = {
     field<&ims_poc_msg_event_s::value_1>("value_1"),
     pointed<&ims_poc_msg_event_s::peer_1>("peer_1"),
     field<&ims_poc_msg_event_s::text_1>("text_1"),
@@ -171,7 +172,7 @@ constexpr FieldRow kMsgNotification[] = {
     pointed<&ims_poc_msg_event_s::peer_2>("peer_2"),
 };
 
-constexpr FieldRow kIncomingFile[] = {
+constexpr FieldRow kIncomingFileFields[] = {
     field<&ims_poc_incoming_file_s::value_1>("value_1"),
     pointed<&ims_poc_incoming_file_s::peer_1>("peer_1"),
     pointed<&ims_poc_incoming_file_s::attributes>("attributes"),
@@ -179,66 +180,69 @@ constexpr FieldRow kIncomingFile[] = {
     pointed<&ims_poc_incoming_file_s::peer_2>("peer_2"),
 };
 
-constexpr FieldRow kFileProgress[] = {
+constexpr FieldRow kFileProgressFields[] = {
     field<&ims_poc_file_progress_s::value_1>("value_1"),
     field<&ims_poc_file_progress_s::value_2>("value_2"),
     field<&ims_poc_file_progress_s::value_3>("value_3"),
     field<&ims_poc_file_progress_s::value_4>("value_4"),
 };
 
-constexpr FieldRow kFileTerminated[] = {
+constexpr FieldRow kFileTerminatedFields[] = {
     field<&ims_poc_file_terminated_s::value_1>("value_1"),
     field<&ims_poc_file_terminated_s::value_2>("value_2"),
     field<&ims_poc_file_terminated_s::value_3>("value_3"),
 };
 
-constexpr EventRow kEvents[] = {
-    {IMS_NOTI_POC_CALL_INCOMING_IND, "poc-call-incoming-ind", "poc", kIncoming,
-     summarise_poc_incoming},
-    {IMS_NOTI_POC_CALL_IN_PROGRESS, "poc-call-in-progress", "poc", kCallEvent,
-     summarise_poc_in_progress},
-    {IMS_NOTI_POC_CALL_ALERTING, "poc-call-alerting", "poc", kCallEvent, summarise_poc_alerting},
-    {IMS_NOTI_POC_CALL_ESTABLISHED, "poc-call-established", "poc", kEstablished,
-     summarise_poc_established},
-    {IMS_NOTI_POC_CALL_ENDED, "poc-call-ended", "poc", kEnded, summarise_poc_ended},
-    {IMS_NOTI_POC_CALL_FLOOR_GRANTED, "poc-call-floor-granted", "poc", kFloor,
+constexpr EventRow kPttEvents[] = {
+    {IMS_NOTI_POC_CALL_INCOMING_IND, "poc-call-incoming-ind", "poc", kIncomingFields,
+     summarise_ptt_incoming},
+    {IMS_NOTI_POC_CALL_IN_PROGRESS, "poc-call-in-progress", "poc", kCallEventFields,
+     summarise_ptt_in_progress},
+    {IMS_NOTI_POC_CALL_ALERTING, "poc-call-alerting", "poc", kCallEventFields,
+     summarise_ptt_alerting},
+    {IMS_NOTI_POC_CALL_ESTABLISHED, "poc-call-established", "poc", kEstablishedFields,
+     summarise_ptt_established},
+    {IMS_NOTI_POC_CALL_ENDED, "poc-call-ended", "poc", kEndedFields, summarise_ptt_ended},
+    {IMS_NOTI_POC_CALL_FLOOR_GRANTED, "poc-call-floor-granted", "poc", kFloorFields,
      summarise_floor_granted},
-    {IMS_NOTI_POC_CALL_FLOOR_REJECTED, "poc-call-floor-rejected", "poc", kFloor,
+    {IMS_NOTI_POC_CALL_FLOOR_REJECTED, "poc-call-floor-rejected", "poc", kFloorFields,
      summarise_floor_refusal},
-    {IMS_NOTI_POC_CALL_FLOOR_IDLE, "poc-call-floor-idle", "poc", kFloor, summarise_floor_idle},
-    {IMS_NOTI_POC_CALL_FLOOR_QUEUE_POSITION, "poc-call-floor-queue-position", "poc", kFloor,
+    {IMS_NOTI_POC_CALL_FLOOR_IDLE, "poc-call-floor-idle", "poc", kFloorFields,
+     summarise_floor_idle},
+    {IMS_NOTI_POC_CALL_FLOOR_QUEUE_POSITION, "poc-call-floor-queue-position", "poc", kFloorFields,
      summarise_floor_position},
-    {IMS_NOTI_POC_CALL_FLOOR_CANCELED, "poc-call-floor-canceled", "poc", kFloor,
+    {IMS_NOTI_POC_CALL_FLOOR_CANCELED, "poc-call-floor-canceled", "poc", kFloorFields,
      summarise_floor_refusal},
-    {IMS_NOTI_POC_CALL_FLOOR_TAKEN, "poc-call-floor-taken", "poc", kFloor, summarise_floor_taken},
-    {IMS_NOTI_POC_CALL_MODIFY_REQUEST, "poc-call-modify-request", "poc", kModifyRequest,
-     summarise_poc_modify_request},
-    {IMS_NOTI_POC_CALL_MODIFY_STATUS, "poc-call-modify-status", "poc", kModifyStatus,
-     summarise_poc_modify_status},
-    {IMS_NOTI_POC_CALL_FLOOR_REQUEST_TIMEOUT, "poc-call-floor-request-timeout", "poc", kFloor,
+    {IMS_NOTI_POC_CALL_FLOOR_TAKEN, "poc-call-floor-taken", "poc", kFloorFields,
+     summarise_floor_taken},
+    {IMS_NOTI_POC_CALL_MODIFY_REQUEST, "poc-call-modify-request", "poc", kModifyRequestFields,
+     summarise_ptt_modify_request},
+    {IMS_NOTI_POC_CALL_MODIFY_STATUS, "poc-call-modify-status", "poc", kModifyStatusFields,
+     summarise_ptt_modify_status},
+    {IMS_NOTI_POC_CALL_FLOOR_REQUEST_TIMEOUT, "poc-call-floor-request-timeout", "poc", kFloorFields,
      summarise_floor_refusal},
-    {IMS_NOTI_POC_CALL_CRISIS_CALL_INITIATED, "poc-call-crisis-call-initiated", "poc", kCallEvent,
-     summarise_poc_crisis},
-    {IMS_NOTI_POC_GROUP_ADVERTISEMENT, "poc-group-advertisement", "poc", kAdvertisement,
-     summarise_poc_advertisement},
+    {IMS_NOTI_POC_CALL_CRISIS_CALL_INITIATED, "poc-call-crisis-call-initiated", "poc",
+     kCallEventFields, summarise_ptt_crisis},
+    {IMS_NOTI_POC_GROUP_ADVERTISEMENT, "poc-group-advertisement", "poc", kAdvertisementFields,
+     summarise_ptt_advertisement},
     {IMS_NOTI_POC_GROUP_CONF_PARTICIPANT_INFO, "poc-group-conf-participant-info", "poc",
-     kParticipantInfo, summarise_poc_participant},
-    {IMS_NOTI_POC_INCOMING_MSG_INFO, "poc-incoming-msg-info", "poc", kIncomingMsg,
-     summarise_poc_message},
-    {IMS_NOTI_POC_MSG_NOTIFICATION, "poc-msg-notification", "poc", kMsgNotification,
-     summarise_poc_notice},
-    {IMS_NOTI_POC_INCOMING_FILE_TRANSFER, "poc-incoming-file-transfer", "poc", kIncomingFile,
-     summarise_poc_file},
-    {IMS_NOTI_POC_FILE_TRANSFER_PROGRESS, "poc-file-transfer-progress", "poc", kFileProgress,
-     summarise_poc_progress},
-    {IMS_NOTI_POC_FILE_TRANSFER_TERMINATED, "poc-file-transfer-terminated", "poc", kFileTerminated,
-     summarise_poc_terminated},
+     kParticipantInfoFields, summarise_ptt_participant},
+    {IMS_NOTI_POC_INCOMING_MSG_INFO, "poc-incoming-msg-info", "poc", kIncomingMsgFields,
+     summarise_ptt_message},
+    {IMS_NOTI_POC_MSG_NOTIFICATION, "poc-msg-notification", "poc", kMsgNotificationFields,
+     summarise_ptt_notice},
+    {IMS_NOTI_POC_INCOMING_FILE_TRANSFER, "poc-incoming-file-transfer", "poc", kIncomingFileFields,
+     summarise_ptt_file},
+    {IMS_NOTI_POC_FILE_TRANSFER_PROGRESS, "poc-file-transfer-progress", "poc", kFileProgressFields,
+     summarise_ptt_progress},
+    {IMS_NOTI_POC_FILE_TRANSFER_TERMINATED, "poc-file-transfer-terminated", "poc",
+     kFileTerminatedFields, summarise_ptt_terminated},
 };
 
 } // namespace
 
-std::span<const EventRow> poc_events() {
-    return kEvents;
+std::span<const EventRow> ptt_events() {
+    return kPttEvents;
 }
 
 } // namespace imsctl

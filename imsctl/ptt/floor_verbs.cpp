@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // The floor: asking for it, giving it back, and who has it.
 #include "imsctl/line/requests.hpp"
+#include "imsctl/ptt/module.hpp"
 #include "imsctl/ptt/parties.hpp"
 #include "imsctl/ptt/talk.hpp"
 
@@ -10,8 +11,6 @@
 
 namespace imsctl {
 namespace {
-
-using FloorRequest = int (*)(ims_h, const ims_poc_floor_s *, ims_response_cb, void *);
 
 void about_floor(Invocation &run, const ims_poc_floor_s &floor, FloorRequest request) {
     run.request(session_id_field(floor.session_id), with_record(request, floor));
@@ -90,7 +89,7 @@ Action prepare_status(Arguments &arguments) {
     };
 }
 
-constexpr Verb kVerbs[] = {
+constexpr Verb kPttFloorVerbs[] = {
     {"ptt floor request", "ask for the floor", "ptt floor request 1", prepare_request},
     {"ptt floor release", "give the floor back, or wait for it no more", "ptt floor release 1",
      prepare_release},
@@ -102,7 +101,7 @@ constexpr Verb kVerbs[] = {
 } // namespace
 
 std::span<const Verb> ptt_floor_verbs() {
-    return kVerbs;
+    return kPttFloorVerbs;
 }
 
 } // namespace imsctl

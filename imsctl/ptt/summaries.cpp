@@ -55,19 +55,19 @@ std::string session(const Fields &fields) {
 
 } // namespace
 
-std::string summarise_poc_in_progress(const Fields &fields) {
+std::string summarise_ptt_in_progress(const Fields &fields) {
     return fmt::format("{}: calling", session(fields));
 }
 
-std::string summarise_poc_alerting(const Fields &fields) {
+std::string summarise_ptt_alerting(const Fields &fields) {
     return fmt::format("{}: ringing there", session(fields));
 }
 
-std::string summarise_poc_crisis(const Fields &fields) {
+std::string summarise_ptt_crisis(const Fields &fields) {
     return fmt::format("{}: a crisis call from now on", session(fields));
 }
 
-std::string summarise_poc_incoming(const Fields &fields) {
+std::string summarise_ptt_incoming(const Fields &fields) {
     const std::string group = text(fields, "text_4");
     return fmt::format("session {}: {}{} call from {}{}{}", number(fields, "value_1"),
                        get<bool>(fields, "flag_1") ? "crisis " : "",
@@ -77,13 +77,13 @@ std::string summarise_poc_incoming(const Fields &fields) {
                        get<bool>(fields, "flag_2") ? ", answered automatically" : "");
 }
 
-std::string summarise_poc_established(const Fields &fields) {
+std::string summarise_ptt_established(const Fields &fields) {
     return fmt::format(
         "{}: {}{} call with {}, {}", session(fields), get<bool>(fields, "flag_2") ? "crisis " : "",
         named(kPttTypes, fields, "value_2"), party(fields, "peer"), media(fields, "int_set_1"));
 }
 
-std::string summarise_poc_ended(const Fields &fields) {
+std::string summarise_ptt_ended(const Fields &fields) {
     return fmt::format("{}: {}", session(fields), named(kPttEndReasons, fields, "value_2"));
 }
 
@@ -112,17 +112,17 @@ std::string summarise_floor_refusal(const Fields &fields) {
                        named(kPttFloorCauses, fields, "value_6"));
 }
 
-std::string summarise_poc_modify_request(const Fields &fields) {
+std::string summarise_ptt_modify_request(const Fields &fields) {
     return fmt::format("{}: a party asks for {}", session(fields), media(fields, "int_set_1"));
 }
 
-std::string summarise_poc_modify_status(const Fields &fields) {
+std::string summarise_ptt_modify_status(const Fields &fields) {
     return fmt::format("{}: {}, {}", session(fields),
                        get<bool>(fields, "flag_1") ? "changed" : "not changed",
                        media(fields, "int_set_1"));
 }
 
-std::string summarise_poc_advertisement(const Fields &fields) {
+std::string summarise_ptt_advertisement(const Fields &fields) {
     for (const Field &field : fields)
         if (field.name == "group_adv")
             if (const auto *adv = std::get_if<Nested>(&field.value))
@@ -131,22 +131,22 @@ std::string summarise_poc_advertisement(const Fields &fields) {
     return "a group of which nothing is told";
 }
 
-std::string summarise_poc_participant(const Fields &fields) {
+std::string summarise_ptt_participant(const Fields &fields) {
     return fmt::format("{}: {} {}", session(fields), party(text(fields, "text_1"), ""),
                        escape(text(fields, "text_2")));
 }
 
-std::string summarise_poc_message(const Fields &fields) {
+std::string summarise_ptt_message(const Fields &fields) {
     return fmt::format("message {} from {}: {}", number(fields, "value_1"), party(fields, "peer_1"),
                        quote(text(fields, "text_3")));
 }
 
-std::string summarise_poc_notice(const Fields &fields) {
+std::string summarise_ptt_notice(const Fields &fields) {
     return fmt::format("message {}: {} by {}", number(fields, "value_1"),
                        named(kPttNotices, fields, "value_2"), party(fields, "peer_1"));
 }
 
-std::string summarise_poc_file(const Fields &fields) {
+std::string summarise_ptt_file(const Fields &fields) {
     const std::string from = party(fields, "peer_1");
     for (const Field &field : fields)
         if (field.name == "attributes")
@@ -158,12 +158,12 @@ std::string summarise_poc_file(const Fields &fields) {
     return fmt::format("transfer {} from {}", number(fields, "value_1"), from);
 }
 
-std::string summarise_poc_progress(const Fields &fields) {
+std::string summarise_ptt_progress(const Fields &fields) {
     return fmt::format("transfer {}: {} of {} bytes", number(fields, "value_1"),
                        number(fields, "value_2"), number(fields, "value_3"));
 }
 
-std::string summarise_poc_terminated(const Fields &fields) {
+std::string summarise_ptt_terminated(const Fields &fields) {
     return fmt::format("transfer {}: {}", number(fields, "value_1"),
                        named(kPttFileEnds, fields, "value_2"));
 }

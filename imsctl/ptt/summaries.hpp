@@ -6,12 +6,12 @@
 
 namespace imsctl {
 
-std::string summarise_poc_in_progress(const Fields &fields);
-std::string summarise_poc_alerting(const Fields &fields);
-std::string summarise_poc_crisis(const Fields &fields);
-std::string summarise_poc_incoming(const Fields &fields);
-std::string summarise_poc_established(const Fields &fields);
-std::string summarise_poc_ended(const Fields &fields);
+std::string summarise_ptt_in_progress(const Fields &fields);
+std::string summarise_ptt_alerting(const Fields &fields);
+std::string summarise_ptt_crisis(const Fields &fields);
+std::string summarise_ptt_incoming(const Fields &fields);
+std::string summarise_ptt_established(const Fields &fields);
+std::string summarise_ptt_ended(const Fields &fields);
 
 std::string summarise_floor_granted(const Fields &fields);
 std::string summarise_floor_idle(const Fields &fields);
@@ -20,14 +20,14 @@ std::string summarise_floor_taken(const Fields &fields);
 // Rejected, canceled, waited for too long.
 std::string summarise_floor_refusal(const Fields &fields);
 
-std::string summarise_poc_modify_request(const Fields &fields);
-std::string summarise_poc_modify_status(const Fields &fields);
-std::string summarise_poc_advertisement(const Fields &fields);
-std::string summarise_poc_participant(const Fields &fields);
-std::string summarise_poc_message(const Fields &fields);
-std::string summarise_poc_notice(const Fields &fields);
-std::string summarise_poc_file(const Fields &fields);
-std::string summarise_poc_progress(const Fields &fields);
-std::string summarise_poc_terminated(const Fields &fields);
+std::string summarise_ptt_modify_request(const Fields &fields);
+std::string summarise_ptt_modify_status(const Fields &fields);
+std::string summarise_ptt_advertisement(const Fields &fields);
+std::string summarise_ptt_participant(const Fields &fields);
+std::string summarise_ptt_message(const Fields &fields);
+std::string summarise_ptt_notice(const Fields &fields);
+std::string summarise_ptt_file(const Fields &fields);
+std::string summarise_ptt_progress(const Fields &fields);
+std::string summarise_ptt_terminated(const Fields &fields);
 
 } // namespace imsctl

@@ -4,6 +4,7 @@
 
 #include "imsctl/line/requests.hpp"
 #include "imsctl/line/watching.hpp"
+#include "imsctl/ptt/module.hpp"
 #include "imsctl/ptt/parties.hpp"
 #include "imsctl/ptt/push_key.hpp"
 
@@ -30,8 +31,6 @@ constexpr int kFollowed[] = {
     IMS_NOTI_POC_CALL_FLOOR_TAKEN,
     IMS_NOTI_POC_CALL_FLOOR_REQUEST_TIMEOUT,
 };
-
-using FloorRequest = int (*)(ims_h, const ims_poc_floor_s *, ims_response_cb, void *);
 
 // What a release of a floor that is not ours any more is answered with.
 constexpr int kWrongState = 13;
@@ -149,7 +148,7 @@ Action prepare_ptt_talk(Arguments &arguments) {
     return [given](Invocation &run) {
         std::vector<const EventRow *> rows;
         for (const int id : kFollowed)
-            rows.push_back(find_event(id));
+            rows.push_back(find_event(ptt_events(), id));
         Watch watch(run, given.limits, rows,
                     fmt::format("talking in session {} of", *given.session));
         Talk talk(run, given);

@@ -2,6 +2,7 @@
 // Push-to-talk calls: placing, answering, changing and ending them; channels.
 #include "imsctl/line/requests.hpp"
 #include "imsctl/line/watching.hpp"
+#include "imsctl/ptt/module.hpp"
 #include "imsctl/ptt/parties.hpp"
 
 #include <fmt/format.h>
@@ -213,9 +214,8 @@ Action prepare_watch(Arguments &arguments) {
     const WatchLimits limits = watch_limits(arguments);
     return [=](Invocation &run) {
         std::vector<const EventRow *> rows;
-        for (const EventRow &row : all_events())
-            if (row.module == "poc")
-                rows.push_back(&row);
+        for (const EventRow &row : ptt_events())
+            rows.push_back(&row);
         Watch watch(run, limits, rows, "watching push-to-talk of");
         watch.until_end([&](const Event &event) {
             if (run.output().json())
@@ -227,7 +227,7 @@ Action prepare_watch(Arguments &arguments) {
     };
 }
 
-constexpr Verb kVerbs[] = {
+constexpr Verb kPttCallVerbs[] = {
     {"ptt call", "place a push-to-talk call", "ptt call sip:all@groups.invalid --type group",
      prepare_call},
     {"ptt adhoc", "call users who are no group yet; add some, or remove them",
@@ -247,7 +247,7 @@ constexpr Verb kVerbs[] = {
 } // namespace
 
 std::span<const Verb> ptt_call_verbs() {
-    return kVerbs;
+    return kPttCallVerbs;
 }
 
 } // namespace imsctl

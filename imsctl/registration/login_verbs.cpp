@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Logging a user in and out.
 #include "imsctl/line/requests.hpp"
+#include "imsctl/registration/module.hpp"
 
 namespace imsctl {
 namespace {
@@ -25,12 +26,12 @@ Action prepare_login_state(Arguments &arguments) {
         ims_login_state_s state{};
         run.client().query(
             [&](ims_h handle) { return ims_get_login_state(handle, *kind, &state); });
-        const EventRow &row = *find_event(IMS_NOTI_LOGIN_STATE);
+        const EventRow &row = *find_event(login_events(), IMS_NOTI_LOGIN_STATE);
         run.output().result(row, take_fields(row, &state));
     };
 }
 
-constexpr Verb kVerbs[] = {
+constexpr Verb kLoginVerbs[] = {
     {"login", "log a user in", "login alice secret", prepare_login},
     {"logout", "log the user out", "logout", [](Arguments &) { return plain(ims_logout); }},
     {"login-state", "show who is logged in", "login-state", prepare_login_state},
@@ -39,7 +40,7 @@ constexpr Verb kVerbs[] = {
 } // namespace
 
 std::span<const Verb> login_verbs() {
-    return kVerbs;
+    return kLoginVerbs;
 }
 
 } // namespace imsctl

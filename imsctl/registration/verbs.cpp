@@ -2,12 +2,13 @@
 // Registration with the network, and flight mode.
 #include "imsctl/line/requests.hpp"
 #include "imsctl/line/watching.hpp"
+#include "imsctl/registration/module.hpp"
 
 namespace imsctl {
 namespace {
 
 const EventRow &registration_event() {
-    return *find_event(IMS_NOTI_REG_REGISTRATION_STATUS);
+    return *find_event(registration_events(), IMS_NOTI_REG_REGISTRATION_STATUS);
 }
 
 // The answer to the query is the event's record.
@@ -21,7 +22,8 @@ Action prepare_watch(Arguments &arguments) {
     const WatchLimits limits = watch_limits(arguments);
     return [limits](Invocation &run) {
         Watch watch(run, limits,
-                    {&registration_event(), find_event(IMS_NOTI_REG_EMERGENCY_REGISTRATION_STATUS)},
+                    {&registration_event(),
+                     find_event(registration_events(), IMS_NOTI_REG_EMERGENCY_REGISTRATION_STATUS)},
                     "watching the registration of");
         const auto show = [&](const Event &event) {
             show_event(run, event);
@@ -31,7 +33,7 @@ Action prepare_watch(Arguments &arguments) {
     };
 }
 
-constexpr Verb kVerbs[] = {
+constexpr Verb kRegistrationVerbs[] = {
     {"registration show", "show whether the device is registered", "registration show",
      [](Arguments &) -> Action { return show_registration; }},
     {"registration watch", "show changes of the registration as they happen",
@@ -45,7 +47,7 @@ constexpr Verb kVerbs[] = {
 } // namespace
 
 std::span<const Verb> registration_verbs() {
-    return kVerbs;
+    return kRegistrationVerbs;
 }
 
 } // namespace imsctl

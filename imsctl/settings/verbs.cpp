@@ -2,6 +2,7 @@
 // Settings sets and the network environment.
 #include "imsctl/settings/actions.hpp"
 #include "imsctl/settings/exchange.hpp"
+#include "imsctl/settings/module.hpp"
 
 #include <fmt/format.h>
 #include <nlohmann/json.hpp>
@@ -10,7 +11,7 @@ namespace imsctl {
 namespace {
 
 constexpr std::string_view kReadOnly = "the service tells its value, but takes none";
-constexpr FixedKey kFixedKeys[] = {
+constexpr FixedKey kFixedSettings[] = {
     {"name", "it says which set is meant; a set is copied by: imsctl settings add NEW --from OLD"},
     {kReadOnlyKeys[0], kReadOnly},
     {kReadOnlyKeys[1], kReadOnly},
@@ -19,15 +20,15 @@ constexpr FixedKey kFixedKeys[] = {
 Assignments<SettingsRecord> assignments_or_refusal(const std::vector<std::string> &texts,
                                                    const char *hint) {
     auto assignments = parse_assignments<SettingsRecord>(texts, hint);
-    refuse_fixed<SettingsRecord>(assignments, kFixedKeys, hint);
+    refuse_fixed<SettingsRecord>(assignments, kFixedSettings, hint);
     return assignments;
 }
 
-Action prepare_list_keys(Arguments &) {
+Action prepare_settings_list_keys(Arguments &) {
     return list_keys<SettingsRecord>();
 }
 
-Action prepare_get(Arguments &arguments) {
+Action prepare_settings_get(Arguments &arguments) {
     const auto name = arguments.text("NAME", "the set");
     const auto keys =
         arguments.some_names("KEY", "these only; all when left out", key_names<SettingsRecord>());
@@ -42,15 +43,15 @@ Action prepare_get(Arguments &arguments) {
     };
 }
 
-constexpr const char *kSetHint = "try: imsctl settings set default ringing_timer=180";
+constexpr const char *kSettingsSetHint = "try: imsctl settings set default ringing_timer=180";
 
-Action prepare_set(Arguments &arguments) {
+Action prepare_settings_set(Arguments &arguments) {
     const auto name = arguments.text("NAME", "the set");
     const auto texts = arguments.texts("CHANGE", "KEY=VALUE, for example ringing_timer=180",
                                        assignment_starts<SettingsRecord>());
     const auto secrets = secrets_flag(arguments);
     return [=](Invocation &run) {
-        const auto assignments = assignments_or_refusal(*texts, kSetHint);
+        const auto assignments = assignments_or_refusal(*texts, kSettingsSetHint);
         const auto set = read_set(run.client(), *name);
         const Changes changes =
             change_record<SettingsRecord>(run, ims_update_global_settings, *set, assignments);
@@ -58,7 +59,8 @@ Action prepare_set(Arguments &arguments) {
     };
 }
 
-constexpr const char *kAddHint = "try: imsctl settings add roaming --from default rcs_version=2";
+constexpr const char *kSettingsAddHint =
+    "try: imsctl settings add roaming --from default rcs_version=2";
 
 std::vector<std::string_view> lost_in_copy(const SettingsRecord &set) {
     std::vector<std::string_view> names;
@@ -68,14 +70,14 @@ std::vector<std::string_view> lost_in_copy(const SettingsRecord &set) {
     return names;
 }
 
-Action prepare_add(Arguments &arguments) {
+Action prepare_settings_add(Arguments &arguments) {
     const auto name = arguments.text("NAME", "the new set");
     const auto texts = arguments.some_texts("CHANGE", "KEY=VALUE, for example rcs_version=2",
                                             assignment_starts<SettingsRecord>());
     const auto from = arguments.text_or(
         "--from", "the set to take the other values from; empty, false or 0 when left out", "");
     return [=](Invocation &run) {
-        const auto assignments = assignments_or_refusal(*texts, kAddHint);
+        const auto assignments = assignments_or_refusal(*texts, kSettingsAddHint);
         const auto set =
             from->empty() ? new_record<SettingsRecord>() : read_set(run.client(), *from);
         store(*set, *find_key<SettingsRecord>("name"), *name);
@@ -88,7 +90,7 @@ Action prepare_add(Arguments &arguments) {
     };
 }
 
-Action prepare_delete(Arguments &arguments) {
+Action prepare_settings_delete(Arguments &arguments) {
     const auto name = arguments.text("NAME", "the set");
     return [=](Invocation &run) {
         const auto set = new_record<SettingsRecord>();
@@ -98,7 +100,7 @@ Action prepare_delete(Arguments &arguments) {
     };
 }
 
-Action prepare_diff(Arguments &arguments) {
+Action prepare_settings_diff(Arguments &arguments) {
     const auto first_name = arguments.text("FIRST", "a set");
     const auto second_name = arguments.text("SECOND", "another one");
     const auto secrets = secrets_flag(arguments);
@@ -128,18 +130,22 @@ Action prepare_set_environment(Arguments &arguments) {
                        ims_set_network_environment);
 }
 
-constexpr Verb kVerbs[] = {
+constexpr Verb kSettingsVerbs[] = {
     {"settings list-keys", "list the keys of a set and their types", "settings list-keys",
-     prepare_list_keys},
-    {"settings get", "show a set", "settings get default ringing_timer min_se", prepare_get},
-    {"settings set", "change keys of a set", "settings set default ringing_timer=180", prepare_set},
-    {"settings add", "add a set", "settings add roaming --from default rcs_version=2", prepare_add},
-    {"settings delete", "delete a set", "settings delete roaming", prepare_delete},
+     prepare_settings_list_keys},
+    {"settings get", "show a set", "settings get default ringing_timer min_se",
+     prepare_settings_get},
+    {"settings set", "change keys of a set", "settings set default ringing_timer=180",
+     prepare_settings_set},
+    {"settings add", "add a set", "settings add roaming --from default rcs_version=2",
+     prepare_settings_add},
+    {"settings delete", "delete a set", "settings delete roaming", prepare_settings_delete},
     {"settings export", "write a set to a JSON file", "settings export default default.json",
      prepare_export},
     {"settings import", "change or add the set that a JSON file holds",
      "settings import default.json", prepare_import},
-    {"settings diff", "show where two sets differ", "settings diff default roaming", prepare_diff},
+    {"settings diff", "show where two sets differ", "settings diff default roaming",
+     prepare_settings_diff},
     {"network-environment get", "show the type of network environment", "network-environment get",
      prepare_get_environment},
     {"network-environment set", "set the type of network environment", "network-environment set 1",
@@ -149,7 +155,7 @@ constexpr Verb kVerbs[] = {
 } // namespace
 
 std::span<const Verb> settings_verbs() {
-    return kVerbs;
+    return kSettingsVerbs;
 }
 
 } // namespace imsctl

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // What tells of short messages.
 #include "imsctl/output/event_fields.hpp"
+#include "imsctl/sms/module.hpp"
 #include "imsctl/sms/short_message.hpp"
 
 namespace imsctl {
@@ -10,13 +11,13 @@ std::string summarise_tpdu(const Fields &fields) {
     return describe(get<Binary>(fields, "tpdu").bytes);
 }
 
-constexpr FieldRow kIncomingSms[] = {
+constexpr FieldRow kIncomingSmsFields[] = {
     tpdu_bytes<&ims_sms_incoming_s::tpdu, &ims_sms_incoming_s::tpdu_length>("tpdu"),
     field<&ims_sms_incoming_s::member_3>("member_3"),
     field<&ims_sms_incoming_s::member_4>("member_4"),
 };
 
-constexpr FieldRow kSendSmsAck[] = {
+constexpr FieldRow kSendSmsAckFields[] = {
     field<&ims_sms_send_ack_s::member_1>("member_1"),
     field<&ims_sms_send_ack_s::member_2>("member_2"),
     field<&ims_sms_send_ack_s::member_3>("member_3"),
@@ -24,21 +25,21 @@ constexpr FieldRow kSendSmsAck[] = {
     field<&ims_sms_send_ack_s::member_6>("member_6"),
 };
 
-constexpr FieldRow kDeliveryReportAck[] = {
+constexpr FieldRow kDeliveryReportAckFields[] = {
     field<&ims_sms_delivery_report_ack_s::member_1>("member_1"),
     field<&ims_sms_delivery_report_ack_s::member_2>("member_2"),
 };
 
-constexpr EventRow kEvents[] = {
-    {IMS_NOTI_SMS_INCOMING_SMS, "sms-incoming-sms", "sms", kIncomingSms, summarise_tpdu},
-    {IMS_NOTI_SMS_SEND_SMS_ACK, "sms-send-sms-ack", "sms", kSendSmsAck, summarise_tpdu},
-    {IMS_NOTI_SMS_DELIVERY_REPORT_ACK, "sms-delivery-report-ack", "sms", kDeliveryReportAck},
+constexpr EventRow kSmsEvents[] = {
+    {IMS_NOTI_SMS_INCOMING_SMS, "sms-incoming-sms", "sms", kIncomingSmsFields, summarise_tpdu},
+    {IMS_NOTI_SMS_SEND_SMS_ACK, "sms-send-sms-ack", "sms", kSendSmsAckFields, summarise_tpdu},
+    {IMS_NOTI_SMS_DELIVERY_REPORT_ACK, "sms-delivery-report-ack", "sms", kDeliveryReportAckFields},
 };
 
 } // namespace
 
 std::span<const EventRow> sms_events() {
-    return kEvents;
+    return kSmsEvents;
 }
 
 } // namespace imsctl

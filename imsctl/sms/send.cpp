@@ -3,6 +3,7 @@
 #include "imsctl/sms/send.hpp"
 
 #include "imsctl/line/requests.hpp"
+#include "imsctl/sms/module.hpp"
 #include "imsctl/sms/short_message.hpp"
 
 #include <algorithm>
@@ -117,7 +118,7 @@ class Sending {
     Sending(Invocation &run, const Submitted &submitted, SendOptions options)
         : run_(run), submitted_(submitted), options_(std::move(options)) {
         if (options_.wait)
-            run_.client().watch(*find_event(IMS_NOTI_SMS_SEND_SMS_ACK));
+            run_.client().watch(*find_event(sms_events(), IMS_NOTI_SMS_SEND_SMS_ACK));
     }
 
     void send_all() {

@@ -2,6 +2,7 @@
 // Short messages.
 #include "imsctl/line/requests.hpp"
 #include "imsctl/sms/delivery_report.hpp"
+#include "imsctl/sms/module.hpp"
 #include "imsctl/sms/send.hpp"
 #include "imsctl/sms/watch.hpp"
 
@@ -59,7 +60,7 @@ Action prepare_report(Arguments &arguments) {
     };
 }
 
-constexpr Verb kVerbs[] = {
+constexpr Verb kSmsVerbs[] = {
     {"sms send", "send a text as one short message or as many as it takes",
      "sms send +15550101 'See you at 8' --report", prepare_sms_send},
     {"sms watch", "show short messages as they arrive, and answer them with delivery reports",
@@ -71,7 +72,7 @@ constexpr Verb kVerbs[] = {
 } // namespace
 
 std::span<const Verb> sms_verbs() {
-    return kVerbs;
+    return kSmsVerbs;
 }
 
 } // namespace imsctl

@@ -5,6 +5,7 @@
 #include "imsctl/line/requests.hpp"
 #include "imsctl/line/watching.hpp"
 #include "imsctl/sms/delivery_report.hpp"
+#include "imsctl/sms/module.hpp"
 #include "imsctl/sms/received_message.hpp"
 
 #include <fmt/format.h>
@@ -71,7 +72,7 @@ Action prepare_sms_watch(Arguments &arguments) {
     const auto silent = arguments.flag("--no-report", "do not answer with delivery reports");
     const WatchLimits limits = watch_limits(arguments);
     return [=](Invocation &run) {
-        Watch watch(run, limits, {find_event(IMS_NOTI_SMS_INCOMING_SMS)},
+        Watch watch(run, limits, {find_event(sms_events(), IMS_NOTI_SMS_INCOMING_SMS)},
                     "watching the short messages of");
         Inbox inbox(run, !*silent);
         watch.until_end([&](const Event &event) { return inbox.take(event); });

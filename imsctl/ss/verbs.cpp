@@ -2,6 +2,7 @@
 // Supplementary services: call waiting, forwarding and barring.
 #include "imsctl/line/requests.hpp"
 #include "imsctl/ss/list.hpp"
+#include "imsctl/ss/module.hpp"
 #include "imsctl/ss/values.hpp"
 
 namespace imsctl {
@@ -92,7 +93,7 @@ Action prepare_set_barring(Arguments &arguments) {
     };
 }
 
-constexpr Verb kVerbs[] = {
+constexpr Verb kSsVerbs[] = {
     {"ss waiting get", "show whether a second call waits", "ss waiting get", prepare_get_waiting},
     {"ss waiting set", "let a second call wait, or refuse it as busy", "ss waiting set off",
      prepare_set_waiting},
@@ -109,7 +110,7 @@ constexpr Verb kVerbs[] = {
 } // namespace
 
 std::span<const Verb> ss_verbs() {
-    return kVerbs;
+    return kSsVerbs;
 }
 
 } // namespace imsctl

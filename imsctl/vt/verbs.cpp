@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // Video telephony: the picture of a video call.
 #include "imsctl/line/requests.hpp"
+#include "imsctl/vt/module.hpp"
 
 namespace imsctl {
 namespace {
@@ -173,7 +174,7 @@ Action prepare_buffer(Arguments &arguments) {
     });
 }
 
-constexpr Verb kVerbs[] = {
+constexpr Verb kVtVerbs[] = {
     {"vt camera start", "start a camera", "vt camera start --camera back", prepare_start_camera},
     {"vt camera stop", "stop the camera", "vt camera stop",
      prepare_session_only<ims_vt_stop_camera>},
@@ -224,7 +225,7 @@ constexpr Verb kVerbs[] = {
 } // namespace
 
 std::span<const Verb> vt_verbs() {
-    return kVerbs;
+    return kVtVerbs;
 }
 
 } // namespace imsctl

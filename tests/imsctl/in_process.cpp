@@ -2,6 +2,7 @@
 #include "tests/imsctl/in_process.hpp"
 
 #include "imsctl/line/command_line.hpp"
+#include "imsctl/modules.hpp"
 
 #include <cstdlib>
 
@@ -33,13 +34,18 @@ class Memory {
 
 } // namespace
 
+const Catalogue &catalogue() {
+    static const Catalogue modules = all_modules();
+    return modules;
+}
+
 Outcome run_words(const std::vector<std::string> &words) {
     std::vector<const char *> arguments;
     for (const std::string &word : words)
         arguments.push_back(word.c_str());
     Memory out;
     Memory err;
-    const int status = run(arguments, out.file(), err.file());
+    const int status = run(catalogue(), arguments, out.file(), err.file());
     return {status, out.text(), err.text()};
 }
 

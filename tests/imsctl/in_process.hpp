@@ -2,6 +2,8 @@
 // imsctl called as a function: for all that needs no service.
 #pragma once
 
+#include "imsctl/line/modules.hpp"
+
 #include <string>
 #include <string_view>
 #include <vector>
@@ -13,6 +15,9 @@ struct Outcome {
     std::string output;
     std::string error;
 };
+
+// What the real program is made of.
+const Catalogue &catalogue();
 
 Outcome run_words(const std::vector<std::string> &words);
 

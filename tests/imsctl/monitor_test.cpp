@@ -15,12 +15,10 @@ namespace {
 
 using testing::HasSubstr;
 
-constexpr const char *kPath = "/org/kelvo/ims/sub0";
-constexpr const char *kInterface = "org.kelvo.ims.Call";
-constexpr const char *kRegistration = "org.kelvo.ims.Registration";
-constexpr const char *kSms = "org.kelvo.ims.Sms";
+constexpr const char *kCallInterface = "org.kelvo.ims.Call";
+constexpr const char *kRegistrationInterface = "org.kelvo.ims.Registration";
 
-struct EventRow {
+struct MonitoredRow {
     const char *name;
     int id;
     const char *signal;
@@ -28,25 +26,25 @@ struct EventRow {
     const char *body;
     const char *json; // without event, id, slot and time
     const char *text;
-    const char *interface = kInterface;
+    const char *interface = kCallInterface;
 };
 
-void PrintTo(const EventRow &row, std::ostream *out) {
+void PrintTo(const MonitoredRow &row, std::ostream *out) {
     *out << row.name;
 }
 
-const EventRow kRows[] = {
+const MonitoredRow kMonitoredEvents[] = {
     {"reg-registration-status", 0x101, "RegistrationStatus", "(buuiii)",
      "(true, 1, 5, 0, 200, 3600)",
      R"({"registered":true,"value_1":1,"value_2":5,"value_3":0,"value_4":200,"value_5":3600})",
      "registered=true value_1=1 value_2=5 value_3=0 value_4=200 value_5=3600: "
      "registered over LTE for voice, short messages",
-     kRegistration},
+     kRegistrationInterface},
     {"reg-emergency-registration-status", 0x102, "EmergencyRegistrationStatus", "(bui)",
      "(false, 4294967295, 2)", R"({"registered":false,"value_1":4294967295,"value_2":2})",
      "registered=false value_1=4294967295 value_2=2: "
      "not registered for emergency calls: flight mode",
-     kRegistration},
+     kRegistrationInterface},
     {"call-incoming-ind", 0x201, "CallIncomingInd", "(isisssssb)",
      "(1, 'tel:+1', 2, 'a', 'b', 'c', 'd', 'e', true)",
      R"({"session_id":1,"number":"tel:+1","call_type":2,"text_1":"a","text_2":"b","text_3":"c",
@@ -99,14 +97,14 @@ const EventRow kRows[] = {
      R"({"tpdu":"BAiRUVUQEAAAE0CQgFEDAAPotAI=","member_3":3,"member_4":-1})",
      "tpdu=0408915155101000001340908051030003e8b402 member_3=3 member_4=-1: "
      R"(message from +15550101: "hi\n")",
-     kSms},
+     kSmsInterface},
     {"sms-send-sms-ack", 0x302, "SendSmsAck", "(iiisii)", "(1, -2, 3, 'AcMAE0CQgFEDAA==', 99, 4)",
      R"({"member_1":1,"member_2":-2,"member_3":3,"tpdu":"AcMAE0CQgFEDAA==","member_6":4})",
      "member_1=1 member_2=-2 member_3=3 tpdu=01c30013409080510300 member_6=4: "
      "refused by the service centre: invalid address (cause 195)",
-     kSms},
+     kSmsInterface},
     {"sms-delivery-report-ack", 0x303, "DeliveryReportAck", "(ii)", "(1, -2)",
-     R"({"member_1":1,"member_2":-2})", "member_1=1 member_2=-2", kSms},
+     R"({"member_1":1,"member_2":-2})", "member_1=1 member_2=-2", kSmsInterface},
     {"login-state", 0x501, "LoginState", "(iuii)", "(-7, 4294967295, 0, 1)",
      R"({"value_1":-7,"value_2":4294967295,"value_3":0})",
      "value_1=-7 value_2=4294967295 value_3=0: -7", "org.kelvo.ims.Login"},
@@ -129,11 +127,11 @@ class Monitor : public ::testing::Test {
         return *process_;
     }
 
-    void emit(const EventRow &row) {
-        peer_.emit_signal(kPath, row.interface, row.signal, parse(row.type, row.body));
+    void emit(const MonitoredRow &row) {
+        peer_.emit_signal(kSlotPath, row.interface, row.signal, parse(row.type, row.body));
     }
-    void emit_ended(int session_id, const char *path = kPath) {
-        peer_.emit_signal(path, kInterface, "CallEnded",
+    void emit_ended(int session_id, const char *path = kSlotPath) {
+        peer_.emit_signal(path, kCallInterface, "CallEnded",
                           Variant(g_variant_ref_sink(g_variant_new("(ii)", session_id, 0))));
     }
 
@@ -142,10 +140,10 @@ class Monitor : public ::testing::Test {
     std::optional<Process> process_;
 };
 
-class MonitoredEvent : public Monitor, public ::testing::WithParamInterface<EventRow> {};
+class MonitoredEvent : public Monitor, public ::testing::WithParamInterface<MonitoredRow> {};
 
 TEST_P(MonitoredEvent, IsOneLineForPeople) {
-    const EventRow &row = GetParam();
+    const MonitoredRow &row = GetParam();
     Process &monitor = start({"--count", "1"});
     emit(row);
     EXPECT_EQ(monitor.wait(), 0);
@@ -157,7 +155,7 @@ TEST_P(MonitoredEvent, IsOneLineForPeople) {
 }
 
 TEST_P(MonitoredEvent, IsOneJsonObjectForPrograms) {
-    const EventRow &row = GetParam();
+    const MonitoredRow &row = GetParam();
     Process &monitor = start({row.name, "--json", "--count", "1"});
     emit(row);
     EXPECT_EQ(monitor.wait(), 0);
@@ -171,20 +169,20 @@ TEST_P(MonitoredEvent, IsOneJsonObjectForPrograms) {
     EXPECT_EQ(object.dump(), expected.dump());
 }
 
-INSTANTIATE_TEST_SUITE_P(All, MonitoredEvent, ::testing::ValuesIn(kRows),
-                         [](const ::testing::TestParamInfo<EventRow> &row) {
+INSTANTIATE_TEST_SUITE_P(All, MonitoredEvent, ::testing::ValuesIn(kMonitoredEvents),
+                         [](const ::testing::TestParamInfo<MonitoredRow> &row) {
                              return std::string(row.param.signal);
                          });
 
 TEST_F(Monitor, ShowsAllEventsInTheirOrder) {
-    Process &monitor = start({"--json", "--count", std::to_string(std::size(kRows))});
-    for (const EventRow &row : kRows)
+    Process &monitor = start({"--json", "--count", std::to_string(std::size(kMonitoredEvents))});
+    for (const MonitoredRow &row : kMonitoredEvents)
         emit(row);
     EXPECT_EQ(monitor.wait(), 0);
     const auto lines = json_lines(monitor.output());
-    ASSERT_EQ(lines.size(), std::size(kRows));
+    ASSERT_EQ(lines.size(), std::size(kMonitoredEvents));
     for (std::size_t i = 0; i < lines.size(); ++i)
-        EXPECT_EQ(lines[i]["event"], kRows[i].name);
+        EXPECT_EQ(lines[i]["event"], kMonitoredEvents[i].name);
 }
 
 TEST_F(Monitor, ShowsEachEventAtOnce) {
@@ -199,7 +197,7 @@ TEST_F(Monitor, ShowsEachEventAtOnce) {
 
 TEST_F(Monitor, ShowsOnlyTheEventsThatWereNamed) {
     Process &monitor = start({"call-busy", "call-held", "--json", "--count", "2"});
-    for (const EventRow &row : kRows)
+    for (const MonitoredRow &row : kMonitoredEvents)
         emit(row);
     EXPECT_EQ(monitor.wait(), 0);
     const auto lines = json_lines(monitor.output());

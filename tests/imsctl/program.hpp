@@ -12,6 +12,10 @@ namespace test {
 using Json = nlohmann::ordered_json;
 using Environment = Process::Environment;
 
+// Where the scripted service sends the events of the first slot from, and whose they are.
+inline constexpr const char *kSlotPath = "/org/kelvo/ims/sub0";
+inline constexpr const char *kSmsInterface = "org.kelvo.ims.Sms";
+
 // What ran to its end.
 struct Outcome {
     int status;

@@ -17,7 +17,7 @@ constexpr const char *kBarringList =
     "(0, 1, [{'ss_class': <9>, 'ss_status': <0>, 'cb_type': <3>}])";
 
 // The application id is 42.
-const VerbRow kRows[] = {
+const VerbRow kServiceVerbs[] = {
     {"flight-mode", 1, "Registration.EnableFlightMode", "", "", "(i)", "(0,)", "(77,)", "{}", "ok"},
     {"login alice secret", 1, "Login.Login", "(ssii)", "('alice', 'secret', 0, 42)", "(i)", "(0,)",
      "(77,)", "{}", "ok"},
@@ -76,7 +76,7 @@ const VerbRow kRows[] = {
      "CLASS  STATUS  CALLS\n9      off     incoming"},
 };
 
-INSTANTIATE_TEST_SUITE_P(All, ServiceVerbs, ::testing::ValuesIn(kRows), verb_name);
+INSTANTIATE_TEST_SUITE_P(All, ServiceVerbs, ::testing::ValuesIn(kServiceVerbs), verb_name);
 
 constexpr const char *kGetRegistrationInfo = "Registration.GetRegistrationInfo";
 constexpr const char *kGetLoginState = "Login.GetLoginState";

@@ -8,7 +8,7 @@ namespace test {
 namespace {
 
 // The application id is 42.
-const VerbRow kRows[] = {
+const VerbRow kCallVerbs[] = {
     {"call dial +15550101", 2, "Call.MakeCall", "(isissss)", "(42, '+15550101', 0, '', '', '', '')",
      "(ii)", "(0, 7)", "(77, 7)", R"({"session_id":7})", "session_id=7"},
     {"call dial tel:1 --type video --text-1 a --text-2=b --text-3 c --text-4 d", 2, "Call.MakeCall",
@@ -111,11 +111,11 @@ const VerbRow kRows[] = {
      R"({"session_id":3,"value_1":-4})", "session_id=3 value_1=-4"},
 };
 
-INSTANTIATE_TEST_SUITE_P(Call, ServiceVerbs, ::testing::ValuesIn(kRows), verb_name);
+INSTANTIATE_TEST_SUITE_P(Call, ServiceVerbs, ::testing::ValuesIn(kCallVerbs), verb_name);
 
 TEST(CallVerbs, ReachEveryRequest) {
     std::set<std::string> methods;
-    for (const VerbRow &row : kRows)
+    for (const VerbRow &row : kCallVerbs)
         methods.insert(row.method);
     EXPECT_EQ(methods.size(), 41u);
 }

@@ -16,7 +16,7 @@ ims_call_info_s call(std::int32_t session_id, std::int32_t state, bool conferenc
     return info;
 }
 
-std::string refusal(const Fitting &fitting, std::span<const ims_call_info_s> calls) {
+std::string session_refusal(const Fitting &fitting, std::span<const ims_call_info_s> calls) {
     try {
         return "chose " + std::to_string(choose_session(fitting, calls));
     } catch (const Failure &failure) {
@@ -61,14 +61,15 @@ TEST(SessionChoice, FindsAConference) {
 }
 
 TEST(SessionChoice, SaysThatThereAreNoCalls) {
-    EXPECT_EQ(refusal(kAnyCall, {}), "there are no calls");
+    EXPECT_EQ(session_refusal(kAnyCall, {}), "there are no calls");
 }
 
 TEST(SessionChoice, SaysWhichCallsThereAre) {
     const ims_call_info_s calls[] = {call(1, call_state::kActive), call(2, 99, true)};
-    EXPECT_EQ(refusal(kOnHold, calls),
+    EXPECT_EQ(session_refusal(kOnHold, calls),
               "there are no calls on hold; all calls: 1 (-, active), 2 (-, 99, conference)");
-    EXPECT_EQ(refusal(kAnyCall, calls), "there are 2 calls: 1 (-, active), 2 (-, 99, conference)");
+    EXPECT_EQ(session_refusal(kAnyCall, calls),
+              "there are 2 calls: 1 (-, active), 2 (-, 99, conference)");
 }
 
 } // namespace

@@ -14,7 +14,7 @@ namespace {
 
 using testing::HasSubstr;
 
-struct VerbRow {
+struct GroupVerbRow {
     const char *line;
     std::size_t verb_words; // how many of the words are the verb
     const char *method;
@@ -24,7 +24,7 @@ struct VerbRow {
     const char *text = "group_uri=\"sip:g\"";
 };
 
-void PrintTo(const VerbRow &row, std::ostream *out) {
+void PrintTo(const GroupVerbRow &row, std::ostream *out) {
     *out << row.line;
 }
 
@@ -46,7 +46,7 @@ std::string two_members() {
 
 const std::string kTwoMembers = two_members();
 
-const VerbRow kRows[] = {
+const GroupVerbRow kGroupVerbs[] = {
     {"group delete sip:g", 2, "DeleteGroup", "(s)", "('sip:g',)"},
     {"group add-user sip:g sip:a sip:b", 2, "AddUserToSharedGroup", "(sa{sv})",
      kTwoMembers.c_str()},
@@ -94,10 +94,10 @@ class WithGroups : public ::testing::Test {
     ScriptedPeer peer_{bus_.address()};
 };
 
-class GroupVerbs : public WithGroups, public ::testing::WithParamInterface<VerbRow> {};
+class GroupVerbs : public WithGroups, public ::testing::WithParamInterface<GroupVerbRow> {};
 
 TEST_P(GroupVerbs, SendTheirRequestOnceAndShowTheReply) {
-    const VerbRow &row = GetParam();
+    const GroupVerbRow &row = GetParam();
     answer(row.method, "(i)", "(0,)");
     const Outcome outcome = run_imsctl(split(row.line));
     EXPECT_EQ(outcome.status, 0) << outcome.error;
@@ -107,7 +107,7 @@ TEST_P(GroupVerbs, SendTheirRequestOnceAndShowTheReply) {
 }
 
 TEST_P(GroupVerbs, ShowTheReplyAsOneJsonObjectAndARefusalAsAFailure) {
-    const VerbRow &row = GetParam();
+    const GroupVerbRow &row = GetParam();
     answer(row.method, "(i)", "(0,)");
     const auto words = split(row.line + std::string(" --json"));
     std::string verb = words[0];
@@ -123,7 +123,7 @@ TEST_P(GroupVerbs, ShowTheReplyAsOneJsonObjectAndARefusalAsAFailure) {
     EXPECT_EQ(refused.json()["error"]["result"], 77);
 }
 
-INSTANTIATE_TEST_SUITE_P(Rows, GroupVerbs, ::testing::ValuesIn(kRows));
+INSTANTIATE_TEST_SUITE_P(Rows, GroupVerbs, ::testing::ValuesIn(kGroupVerbs));
 
 class GroupFiles : public WithGroups {};
 

@@ -1,7 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // What happens before anything is asked of the service: help, and output that nobody takes.
 #include "imsctl/line/command_line.hpp"
-#include "imsctl/line/verbs.hpp"
 #include "tests/imsctl/in_process.hpp"
 
 #include <csignal>
@@ -55,7 +54,7 @@ TEST_P(EveryVerb, TakesItsOwnExampleButNoUnknownOption) {
     EXPECT_THAT(outcome.error, HasSubstr("try: imsctl " + std::string(GetParam().example)));
 }
 
-INSTANTIATE_TEST_SUITE_P(All, EveryVerb, ::testing::ValuesIn(all_verbs()),
+INSTANTIATE_TEST_SUITE_P(All, EveryVerb, ::testing::ValuesIn(catalogue().verbs()),
                          [](const ::testing::TestParamInfo<Verb> &row) {
                              std::string name(row.param.path);
                              for (char &letter : name)
@@ -65,10 +64,10 @@ INSTANTIATE_TEST_SUITE_P(All, EveryVerb, ::testing::ValuesIn(all_verbs()),
                          });
 
 TEST(Verbs, HaveGroupsWithASummary) {
-    for (const Verb &verb : all_verbs())
+    for (const Verb &verb : catalogue().verbs())
         for (auto space = verb.path.find(' '); space != std::string_view::npos;
              space = verb.path.find(' ', space + 1))
-            EXPECT_NE(group_summary(verb.path.substr(0, space)), "") << verb.path;
+            EXPECT_NE(catalogue().group_summary(verb.path.substr(0, space)), "") << verb.path;
 }
 
 TEST(CommandLine, EscapesWhatItRepeats) {
@@ -97,7 +96,7 @@ TEST(CommandLine, FailsWhenItsHelpCannotBeWritten) {
     for (const auto &words : lines) {
         const Stream full(std::fopen("/dev/full", "w"), std::fclose);
         const Stream err(std::tmpfile(), std::fclose);
-        EXPECT_EQ(run(words, full.get(), err.get()), 1) << words.front();
+        EXPECT_EQ(run(catalogue(), words, full.get(), err.get()), 1) << words.front();
         EXPECT_GT(std::ftell(err.get()), 0) << words.front();
     }
 }
@@ -110,7 +109,7 @@ TEST(CommandLine, EndsWithoutAWordWhenNobodyReads) {
     const Stream out(fdopen(ends[1], "w"), std::fclose);
     const Stream err(std::tmpfile(), std::fclose);
     const std::vector<const char *> words = {"settings", "list-keys"};
-    EXPECT_EQ(run(words, out.get(), err.get()), 1);
+    EXPECT_EQ(run(catalogue(), words, out.get(), err.get()), 1);
     EXPECT_EQ(std::ftell(err.get()), 0);
 }
 

@@ -1,9 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 // That docs/imsctl.md tells of everything there is.
-#include "imsctl/line/verbs.hpp"
-#include "imsctl/output/events.hpp"
 #include "imsctl/output/failure.hpp"
 #include "imsctl/sms/short_message.hpp"
+#include "tests/imsctl/in_process.hpp"
 
 #include <fmt/format.h>
 #include <fstream>
@@ -28,21 +27,21 @@ class Documentation : public ::testing::Test {
 };
 
 TEST_F(Documentation, HasEveryVerb) {
-    for (const Verb &verb : all_verbs())
+    for (const Verb &verb : catalogue().verbs())
         EXPECT_TRUE(tells(fmt::format("`{}", verb.path)) ||
                     tells(fmt::format("\nimsctl {} ", verb.path)))
             << verb.path;
 }
 
 TEST_F(Documentation, HasEveryEventWithItsIdAndFields) {
-    for (const EventRow &event : all_events())
+    for (const EventRow &event : catalogue().events())
         EXPECT_TRUE(tells(
             fmt::format("\n| `{}` | {} | `{}`", event.name, event.id, event.fields.front().name)))
             << event.name;
 }
 
 TEST_F(Documentation, HasEveryModuleOfEvents) {
-    for (const std::string &module : event_modules())
+    for (const std::string &module : event_modules(catalogue().events()))
         EXPECT_TRUE(tells(fmt::format("`{}`", module))) << module;
 }
 

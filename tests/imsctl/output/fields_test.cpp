@@ -1,8 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
+#include "imsctl/call/module.hpp"
 #include "imsctl/output/fields.hpp"
 #include "imsctl/output/output.hpp"
 
 #include <gtest/gtest.h>
+#include <ims.h>
 #include <nlohmann/json.hpp>
 
 namespace imsctl {
@@ -72,7 +74,7 @@ TEST(Dump, TakesTextsThatAreNotUtf8) {
 }
 
 TEST(Event, HasBothForms) {
-    const Event event{find_event("call-ended"),
+    const Event event{find_event(call_events(), IMS_NOTI_CALL_ENDED),
                       {{"session_id", std::int64_t{3}}, {"reason", std::int64_t{16}}},
                       1'700'000'000'123'456};
     EXPECT_EQ(dump(to_json(event, 1)),

@@ -29,7 +29,7 @@ struct PttEventRow {
     R"({"value_1":1,"int_set_1":[1,0,0,0],"value_2":2,"text_1":"tel:+1","value_3":3,)"             \
     R"("text_2":"Ann","value_4":4,"value_5":5,"value_6":6,"text_3":"six"})"
 
-const PttEventRow kRows[] = {
+const PttEventRow kPttEvents[] = {
     {"poc-call-incoming-ind", 0x401, "PocCallIncomingInd", "(bbbbssssssiivv)",
      "(true, true, false, true, 'tel:+1', 'Ann', 'tel:+2', 'sip:g@x', 'Group', 'tel:+3', 1, 1, "
      "<[1, 0, 1, 1]>, <[0, 0, 0, 0]>)",
@@ -109,7 +109,7 @@ const PttEventRow kRows[] = {
     {"poc-file-transfer-terminated", 0x416, "PocFileTransferTerminated", "(iii)", "(1, 0, 2)",
      R"({"value_1":1,"value_2":0,"value_3":2})", "transfer 1: complete"},
 };
-static_assert(std::size(kRows) == 22);
+static_assert(std::size(kPttEvents) == 22);
 
 class PttEvents : public ::testing::Test {
   protected:
@@ -117,7 +117,7 @@ class PttEvents : public ::testing::Test {
     std::string output_of(const std::string &words) {
         Process process(imsctl_command(split(words + " --count 22")), strict_environment());
         process.wait_for_error(" slot 0\n");
-        for (const PttEventRow &row : kRows)
+        for (const PttEventRow &row : kPttEvents)
             peer_.emit_signal("/org/kelvo/ims/sub0", "org.kelvo.ims.Poc", row.signal,
                               parse(row.type, row.body));
         EXPECT_EQ(process.wait(), 0) << process.both();
@@ -126,12 +126,13 @@ class PttEvents : public ::testing::Test {
 
     void expect_json(const std::string &words) {
         const auto lines = json_lines(output_of(words));
-        ASSERT_EQ(lines.size(), std::size(kRows));
+        ASSERT_EQ(lines.size(), std::size(kPttEvents));
         for (std::size_t at = 0; at < lines.size(); ++at) {
             Json object = lines[at];
             object.erase("time");
-            Json expected = {{"event", kRows[at].name}, {"id", kRows[at].id}, {"slot", 0}};
-            expected.update(Json::parse(kRows[at].json));
+            Json expected = {
+                {"event", kPttEvents[at].name}, {"id", kPttEvents[at].id}, {"slot", 0}};
+            expected.update(Json::parse(kPttEvents[at].json));
             EXPECT_EQ(object.dump(), expected.dump());
         }
     }
@@ -147,7 +148,7 @@ TEST_F(PttEvents, AreJsonObjectsForPrograms) {
 
 TEST_F(PttEvents, AreToldInWords) {
     std::string expected;
-    for (const PttEventRow &row : kRows)
+    for (const PttEventRow &row : kPttEvents)
         expected += std::string(row.words) + "\n";
     std::istringstream output{output_of("ptt watch")};
     std::string told;
@@ -158,7 +159,7 @@ TEST_F(PttEvents, AreToldInWords) {
 
 TEST_F(PttEvents, HaveTheirFieldsAndTheirWordsInTheMonitor) {
     const std::string output = output_of("monitor");
-    for (const PttEventRow &row : kRows)
+    for (const PttEventRow &row : kPttEvents)
         EXPECT_THAT(output, testing::HasSubstr(std::string(": ") + row.words + "\n")) << row.name;
     EXPECT_THAT(output,
                 testing::HasSubstr(R"(peer_1={uri_type=0 uri="tel:+1" display_name="Ann \x1b" )"

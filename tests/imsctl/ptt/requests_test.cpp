@@ -25,7 +25,7 @@ constexpr const char *kTwoValues = R"({"value_1":5,"value_2":6})";
 constexpr const char *kThreeValues = R"({"value_1":5,"value_2":6,"value_3":7})";
 
 // No application id anywhere.
-const VerbRow kRows[] = {
+const VerbRow kPttVerbs[] = {
     {"ptt call +15550101", 2, "Poc.PocMakeCall", "(bbbsisvvi)",
      "(false, false, false, '+15550101', 0, '', " NO_SETS ", 0)", "(ii)", "(0, 7)", "(77, 0)",
      R"({"session_id":7})", "session_id=7"},
@@ -126,7 +126,7 @@ const VerbRow kRows[] = {
      kSession, "session_id=1"},
 };
 
-INSTANTIATE_TEST_SUITE_P(Ptt, ServiceVerbs, ::testing::ValuesIn(kRows), verb_name);
+INSTANTIATE_TEST_SUITE_P(Ptt, ServiceVerbs, ::testing::ValuesIn(kPttVerbs), verb_name);
 
 TEST_F(WithService, PttFileSendTellsWhatTheFileIs) {
     answer("Poc.PocTransferFile", "(iii)", "(0, 5, 6)");
@@ -162,7 +162,7 @@ TEST_F(WithService, PttFileSendTellsWhatTheFileIs) {
 
 TEST(PttVerbTable, ReachesEveryRequest) {
     std::set<std::string_view> methods = {"Poc.PocTransferFile"}; // above
-    for (const VerbRow &row : kRows)
+    for (const VerbRow &row : kPttVerbs)
         methods.insert(row.method);
     EXPECT_EQ(methods.size(), 27u);
 }

@@ -9,7 +9,7 @@
 namespace imsctl {
 namespace {
 
-std::string refusal(const std::string &text, std::size_t count) {
+std::string profile_refusal(const std::string &text, std::size_t count) {
     std::vector<ProfileRecord> profiles(count);
     for (std::size_t i = 0; i < count; ++i)
         profiles[i].id = static_cast<std::int32_t>(i / 2);
@@ -31,15 +31,17 @@ TEST(ProfileChoice, IsAnIdOrAName) {
 }
 
 TEST(ProfileChoice, SaysWhyNoneIsChosen) {
-    EXPECT_EQ(refusal("99", 63), "there is no profile \"99\"");
-    EXPECT_EQ(refusal("0", 63), "there is more than one profile \"0\"");
+    EXPECT_EQ(profile_refusal("99", 63), "there is no profile \"99\"");
+    EXPECT_EQ(profile_refusal("0", 63), "there is more than one profile \"0\"");
 }
 
 // The library keeps 64 profiles: what comes after them may well exist.
 TEST(ProfileChoice, SaysThatAFullListMayHideOne) {
-    EXPECT_EQ(refusal("99", 64), "there is no profile \"99\"; only the first 64 can be seen");
-    EXPECT_EQ(refusal("home", 64), "there is no profile \"home\"; only the first 64 can be seen");
-    EXPECT_EQ(refusal("0", 64), "there is more than one profile \"0\"");
+    EXPECT_EQ(profile_refusal("99", 64),
+              "there is no profile \"99\"; only the first 64 can be seen");
+    EXPECT_EQ(profile_refusal("home", 64),
+              "there is no profile \"home\"; only the first 64 can be seen");
+    EXPECT_EQ(profile_refusal("0", 64), "there is more than one profile \"0\"");
 }
 
 } // namespace

@@ -1,10 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
 // From a text to TPDUs and back, without a bus.
+#include "imsctl/sms/module.hpp"
 #include "imsctl/sms/received_message.hpp"
 #include "imsctl/sms/short_message.hpp"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
+#include <ims.h>
 #include <nlohmann/json.hpp>
 
 namespace imsctl {
@@ -173,13 +175,14 @@ tpdu::StatusReport status_report() {
 }
 
 std::string words(const Received &received) {
-    Event event{find_event("sms-incoming-sms"), {{"member_3", std::int64_t{3}}}, 0};
+    Event event{
+        find_event(sms_events(), IMS_NOTI_SMS_INCOMING_SMS), {{"member_3", std::int64_t{3}}}, 0};
     return to_text(received, event).substr(std::string_view("00:00:00.000 ").size());
 }
 
 Json json(const Received &received) {
     const Event event{
-        find_event("sms-incoming-sms"),
+        find_event(sms_events(), IMS_NOTI_SMS_INCOMING_SMS),
         {{"tpdu", Binary{{1}}}, {"member_3", std::int64_t{3}}, {"member_4", std::int64_t{0}}},
         0};
     return to_json(received, event, 1);

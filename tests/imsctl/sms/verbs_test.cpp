@@ -17,8 +17,6 @@ namespace {
 
 using testing::HasSubstr;
 
-constexpr const char *kPath = "/org/kelvo/ims/sub0";
-constexpr const char *kSms = "org.kelvo.ims.Sms";
 constexpr const char *kSendSms = "org.kelvo.ims.Sms.SendSms";
 constexpr const char *kSendDeliverReport = "org.kelvo.ims.Sms.SendDeliverReport";
 
@@ -69,7 +67,8 @@ class Sms : public ::testing::Test {
 
     void emit_incoming(const tpdu::Octets &octets, int number, int kind = 0) {
         GVariant *body = g_variant_new("(isii)", 0, base64(octets).c_str(), number, kind);
-        peer_.emit_signal(kPath, kSms, "IncomingSms", Variant(g_variant_ref_sink(body)));
+        peer_.emit_signal(kSlotPath, kSmsInterface, "IncomingSms",
+                          Variant(g_variant_ref_sink(body)));
     }
 
     void emit_ack(int cause, int reference, std::optional<std::uint8_t> failure = std::nullopt) {
@@ -77,7 +76,8 @@ class Sms : public ::testing::Test {
         report.failure_cause = failure;
         GVariant *body = g_variant_new("(iiisii)", 9, cause, reference,
                                        base64(tpdu::encode(report).value()).c_str(), 0, 0);
-        peer_.emit_signal(kPath, kSms, "SendSmsAck", Variant(g_variant_ref_sink(body)));
+        peer_.emit_signal(kSlotPath, kSmsInterface, "SendSmsAck",
+                          Variant(g_variant_ref_sink(body)));
     }
 
     Process &watch(const std::string &words) {

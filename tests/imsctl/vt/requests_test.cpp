@@ -11,7 +11,7 @@ namespace {
 
 using testing::HasSubstr;
 
-const VerbRow kRows[] = {
+const VerbRow kVtVerbs[] = {
     {"vt camera start --session 7", 3, "Vt.StartCamera", "(ii)", "(7, 0)", "(i)", "(0,)", "(77,)",
      R"({"session_id":7})", "session_id=7"},
     {"vt camera start --camera back --session 7", 3, "Vt.StartCamera", "(ii)", "(7, 1)", "(i)",
@@ -94,11 +94,11 @@ const VerbRow kRows[] = {
      "(77,)", R"({"session_id":7})", "session_id=7"},
 };
 
-INSTANTIATE_TEST_SUITE_P(Vt, ServiceVerbs, ::testing::ValuesIn(kRows), verb_name);
+INSTANTIATE_TEST_SUITE_P(Vt, ServiceVerbs, ::testing::ValuesIn(kVtVerbs), verb_name);
 
 TEST(VtVerbTable, ReachesEveryRequest) {
     std::set<std::string> methods;
-    for (const VerbRow &row : kRows)
+    for (const VerbRow &row : kVtVerbs)
         methods.insert(row.method);
     EXPECT_EQ(methods.size(), 28u);
 }

@@ -1,0 +1,21 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "imsctl/ptt/module.hpp"
+
+namespace imsctl {
+namespace {
+
+constexpr VerbGroup kPttGroups[] = {
+    {"ptt", "push-to-talk"},
+    {"ptt floor", "the right to talk"},
+    {"ptt message", "messages"},
+    {"ptt file", "file transfer"},
+    {"ptt record", "recording of calls"},
+};
+
+} // namespace
+
+Module ptt_module() {
+    return {kPttGroups, {ptt_call_verbs(), ptt_floor_verbs(), ptt_content_verbs()}, {ptt_events()}};
+}
+
+} // namespace imsctl

@@ -1,0 +1,19 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "imsctl/registration/module.hpp"
+
+namespace imsctl {
+namespace {
+
+constexpr VerbGroup kRegistrationGroups[] = {
+    {"registration", "registration with the network"},
+};
+
+} // namespace
+
+Module registration_module() {
+    return {kRegistrationGroups,
+            {registration_verbs(), login_verbs()},
+            {registration_events(), login_events()}};
+}
+
+} // namespace imsctl

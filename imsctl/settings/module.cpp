@@ -1,0 +1,19 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "imsctl/settings/module.hpp"
+
+namespace imsctl {
+namespace {
+
+constexpr VerbGroup kSettingsGroups[] = {
+    {"settings", "sets of global settings"},
+    {"network-environment", "the type of network environment"},
+    {"profile", "registration profiles"},
+};
+
+} // namespace
+
+Module settings_module() {
+    return {kSettingsGroups, {settings_verbs(), profile_verbs()}, {}};
+}
+
+} // namespace imsctl

@@ -1,0 +1,17 @@
+// SPDX-License-Identifier: Apache-2.0
+#include "imsctl/sms/module.hpp"
+
+namespace imsctl {
+namespace {
+
+constexpr VerbGroup kSmsGroups[] = {
+    {"sms", "short messages"},
+};
+
+} // namespace
+
+Module sms_module() {
+    return {kSmsGroups, {sms_verbs()}, {sms_events()}};
+}
+
+} // namespace imsctl
