@@ -18,21 +18,24 @@ std::string LibraryOnTheBus::last_call(const std::string &reply_type) {
 }
 
 std::string LibraryOnTheBus::made_by(const RequestRow &row) {
-    peer().on(row.interface + "." + row.method, reply(row.reply_type, row.reply));
+    peer().on(std::string{row.module.interface} + "." + row.method,
+              reply(row.reply_type, row.reply));
     ResponseRecorder recorder{[&](const Response &, void *data) {
         if (row.check_data)
             row.check_data(data); // also releases what the application takes over
     }};
-    EXPECT_EQ(row.call(handle_, ResponseRecorder::callback, &recorder), IMS_ERROR_NONE);
-    pump_until([&] { return recorder.count() > 0; }, "the callback of " + row.function);
-    EXPECT_EQ(recorder.last().result, 0) << row.function << " does not take " << row.reply_type;
+    EXPECT_EQ(row.function.call(handle_, ResponseRecorder::callback, &recorder), IMS_ERROR_NONE);
+    pump_until([&] { return recorder.count() > 0; }, "the callback of " + row.function.name);
+    EXPECT_EQ(recorder.last().result, 0)
+        << row.function.name << " does not take " << row.reply_type;
     return last_call(row.reply_type);
 }
 
 std::string LibraryOnTheBus::made_by(const QueryRow &row) {
-    peer().on(row.interface + "." + row.method, reply(row.reply_type, row.reply));
-    EXPECT_EQ(row.call(handle_), IMS_ERROR_NONE)
-        << row.function << " does not take " << row.reply_type;
+    peer().on(std::string{row.module.interface} + "." + row.method,
+              reply(row.reply_type, row.reply));
+    EXPECT_EQ(row.function.call(handle_), IMS_ERROR_NONE)
+        << row.function.name << " does not take " << row.reply_type;
     return last_call(row.reply_type);
 }
 
@@ -60,7 +63,8 @@ std::map<std::string, std::string> LibraryOnTheBus::observe_calls() {
     // A function with several rows has the same method in each.
     const auto observe = [&](const auto &row) {
         const std::string line = made_by(row);
-        EXPECT_EQ(lines.try_emplace(row.function, line).first->second, line) << row.function;
+        EXPECT_EQ(lines.try_emplace(row.function.name, line).first->second, line)
+            << row.function.name;
     };
     for (const ModuleRows &module : all_modules()) {
         for (const RequestRow &row : module.requests)

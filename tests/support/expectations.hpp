@@ -3,6 +3,7 @@
 // made.
 #pragma once
 
+#include "tests/support/function_name.hpp"
 #include "tests/support/scripted_peer.hpp"
 
 #include <string>
@@ -11,6 +12,11 @@ namespace test {
 
 // Both answers of a gate that is not on, with every argument 0 or NULL.
 void check_gate(const std::string &unit, const std::string &function, int (*call_with_nothing)());
+
+template <auto Function>
+void check_gate(const std::string &unit) {
+    check_gate(unit, std::string{name_of<Function>()}, with_nothing<Function>);
+}
 
 // The one line that a function writes.
 void expect_one_line(const std::string &unit, const std::string &function,

@@ -7,21 +7,22 @@ namespace test {
 namespace {
 
 std::string full_method(const QueryRow &row) {
-    return row.interface + "." + row.method;
+    return std::string{row.module.interface} + "." + row.method;
 }
 
 } // namespace
 
 TEST_P(QueryGates, LookAtNoArgumentWhenTheFeatureIsOffOrUnknown) {
-    check_gate(GetParam().unit, GetParam().function, GetParam().call_with_nothing);
+    check_gate(GetParam().module.unit, GetParam().function.name,
+               GetParam().function.call_with_nothing);
 }
 
 TEST_P(Queries, RefuseMissingPointersAndSendNothing) {
     const QueryRow &row = GetParam();
-    for (const QueryRow::Missing &missing : row.missing_pointers) {
+    for (const Variation<MakeQuery> &missing : row.function.null_arguments) {
         SCOPED_TRACE(missing.what);
         EXPECT_EQ(missing.call(handle_), IMS_ERROR_INVALID_PARAMETER);
-        expect_one_line(row.unit, row.function, "Invalid parameter");
+        expect_one_line(row.module.unit, row.function.name, "Invalid parameter");
         EXPECT_TRUE(requests().empty());
     }
 }
@@ -30,29 +31,29 @@ TEST_P(Queries, SendTheirTupleToTheirMethod) {
     const QueryRow &row = GetParam();
     peer().on(full_method(row), reply(row.reply_type, row.reply));
     const int queries_before = gate_queries();
-    EXPECT_EQ(row.call(handle_), IMS_ERROR_NONE);
+    EXPECT_EQ(row.function.call(handle_), IMS_ERROR_NONE);
     EXPECT_EQ(gate_queries(), queries_before + 1);
     const std::vector<Call> sent = requests();
     ASSERT_EQ(sent.size(), 1U);
-    EXPECT_EQ(sent[0].interface, row.interface);
+    EXPECT_EQ(sent[0].interface, row.module.interface);
     EXPECT_EQ(sent[0].member, row.method);
-    expect_sent(sent[0], row.sent_type, row.sent);
+    expect_sent(sent[0], row.type, row.arguments);
     EXPECT_TRUE(take_log().empty());
 }
 
 TEST_P(Queries, CallWithoutFlagsAndCancellableAndWithTheTimeLimit) {
     const QueryRow &row = GetParam();
     peer().on(full_method(row), reply(row.reply_type, row.reply));
-    EXPECT_EQ(row.call(handle_), IMS_ERROR_NONE);
-    expect_call_arguments(true, row.interface, row.method);
+    EXPECT_EQ(row.function.call(handle_), IMS_ERROR_NONE);
+    expect_call_arguments(true, row.module.interface, row.method);
 }
 
 TEST_P(Queries, ReportARefusalUnderTheirOwnName) {
     const QueryRow &row = GetParam();
     for (const Answer &answer : {failure(error_name::kAccessDenied), failure(G_IO_ERROR, 9)}) {
         peer().on(full_method(row), answer);
-        EXPECT_EQ(row.call(handle_), IMS_ERROR_PERMISSION_DENIED);
-        expect_one_line(row.unit, row.function, "Permission denied");
+        EXPECT_EQ(row.function.call(handle_), IMS_ERROR_PERMISSION_DENIED);
+        expect_one_line(row.module.unit, row.function.name, "Permission denied");
     }
 }
 
@@ -66,7 +67,7 @@ TEST_P(Queries, FailWithoutALineOnEveryOtherError) {
                               failure("org.example.Error.Unheard")};
     for (const Answer &answer : answers) {
         peer().on(full_method(row), answer);
-        EXPECT_EQ(row.call(handle_), IMS_ERROR_OPERATION_FAILED);
+        EXPECT_EQ(row.function.call(handle_), IMS_ERROR_OPERATION_FAILED);
     }
     EXPECT_TRUE(take_log().empty());
 }
@@ -74,15 +75,15 @@ TEST_P(Queries, FailWithoutALineOnEveryOtherError) {
 TEST_P(Queries, FailWithTheModulesMessageWhenTheServiceRefuses) {
     const QueryRow &row = GetParam();
     peer().on(full_method(row), reply(row.reply_type, row.refused_reply));
-    EXPECT_EQ(row.call(handle_), IMS_ERROR_OPERATION_FAILED);
-    expect_one_line(row.unit, row.function, row.refused_message);
+    EXPECT_EQ(row.function.call(handle_), IMS_ERROR_OPERATION_FAILED);
+    expect_one_line(row.module.unit, row.function.name, row.refused_message);
 }
 
 TEST_P(Queries, SurviveACallThatYieldsNeitherReplyNorError) {
     const QueryRow &row = GetParam();
     peer().on(full_method(row), reply(row.reply_type, row.reply));
     set_fault(Fault::kNothing);
-    EXPECT_EQ(row.call(handle_), IMS_ERROR_OPERATION_FAILED);
+    EXPECT_EQ(row.function.call(handle_), IMS_ERROR_OPERATION_FAILED);
     EXPECT_TRUE(take_log().empty());
 }
 
@@ -90,8 +91,8 @@ TEST_P(Queries, ReportAnErrorBesideAReply) {
     const QueryRow &row = GetParam();
     peer().on(full_method(row), reply(row.reply_type, row.reply));
     set_fault(Fault::kErrorBesideReply);
-    EXPECT_EQ(row.call(handle_), IMS_ERROR_OPERATION_FAILED);
-    expect_one_line(row.unit, row.function, "dbus error = 5 (odd)");
+    EXPECT_EQ(row.function.call(handle_), IMS_ERROR_OPERATION_FAILED);
+    expect_one_line(row.module.unit, row.function.name, "dbus error = 5 (odd)");
 }
 
 TEST_P(Queries, FailOnAReplyOfAnotherShape) {
@@ -121,7 +122,7 @@ TEST_P(Queries, FailOnAReplyOfAnotherShape) {
             answers.push_back(reply(type, value));
     for (const Answer &answer : answers) {
         peer().on(full_method(row), answer);
-        EXPECT_EQ(row.call(handle_), IMS_ERROR_OPERATION_FAILED);
+        EXPECT_EQ(row.function.call(handle_), IMS_ERROR_OPERATION_FAILED);
     }
 }
 

@@ -7,7 +7,7 @@ namespace test {
 namespace {
 
 std::string full_method(const RequestRow &row) {
-    return row.interface + "." + row.method;
+    return std::string{row.module.interface} + "." + row.method;
 }
 
 Answer row_reply(const RequestRow &row) {
@@ -30,8 +30,8 @@ Response outcome(const RequestRow &row, ims_h handle, bool with_data) {
         else
             EXPECT_EQ(data, nullptr);
     }};
-    EXPECT_EQ(row.call(handle, ResponseRecorder::callback, &recorder), IMS_ERROR_NONE);
-    pump_until([&] { return recorder.count() > 0; }, "the callback of " + row.function);
+    EXPECT_EQ(row.function.call(handle, ResponseRecorder::callback, &recorder), IMS_ERROR_NONE);
+    pump_until([&] { return recorder.count() > 0; }, "the callback of " + row.function.name);
     return recorder.last();
 }
 
@@ -44,17 +44,18 @@ void expect_failure(const RequestRow &row, ims_h handle, int result) {
 } // namespace
 
 TEST_P(RequestGates, LookAtNoArgumentWhenTheFeatureIsOffOrUnknown) {
-    check_gate(GetParam().unit, GetParam().function, GetParam().call_with_nothing);
+    check_gate(GetParam().module.unit, GetParam().function.name,
+               GetParam().function.call_with_nothing);
 }
 
 TEST_P(Requests, RefuseMissingPointersAndSendNothing) {
     const RequestRow &row = GetParam();
-    for (const Variation &missing : row.missing_pointers) {
+    for (const Variation<MakeRequest> &missing : null_arguments(row)) {
         SCOPED_TRACE(missing.what);
         ResponseRecorder &recorder = lasting_recorder();
         EXPECT_EQ(missing.call(handle_, ResponseRecorder::callback, &recorder),
                   IMS_ERROR_INVALID_PARAMETER);
-        expect_one_line(row.unit, row.function, "Invalid parameter");
+        expect_one_line(row.module.unit, row.function.name, "Invalid parameter");
         EXPECT_TRUE(requests().empty());
         EXPECT_EQ(recorder.count(), 0U);
     }
@@ -62,12 +63,12 @@ TEST_P(Requests, RefuseMissingPointersAndSendNothing) {
 
 TEST_P(Requests, RefuseTextsThatAreNotUtf8AndSendNothing) {
     const RequestRow &row = GetParam();
-    for (const Variation &bad : row.bad_texts) {
+    for (const Variation<MakeRequest> &bad : bad_texts(row)) {
         SCOPED_TRACE(bad.what);
         ResponseRecorder &recorder = lasting_recorder();
         EXPECT_EQ(bad.call(handle_, ResponseRecorder::callback, &recorder),
                   IMS_ERROR_INVALID_PARAMETER);
-        expect_one_line(row.unit, row.function, "Invalid parameter");
+        expect_one_line(row.module.unit, row.function.name, "Invalid parameter");
         EXPECT_TRUE(requests().empty());
         EXPECT_EQ(recorder.count(), 0U);
     }
@@ -81,9 +82,9 @@ TEST_P(Requests, SendTheirTupleToTheirMethod) {
     EXPECT_EQ(gate_queries(), queries_before + 1);
     const std::vector<Call> sent = requests();
     ASSERT_EQ(sent.size(), 1U);
-    EXPECT_EQ(sent[0].interface, row.interface);
+    EXPECT_EQ(sent[0].interface, row.module.interface);
     EXPECT_EQ(sent[0].member, row.method);
-    expect_sent(sent[0], row.sent_type, row.sent);
+    expect_sent(sent[0], row.type, row.arguments);
     EXPECT_TRUE(take_log().empty());
 }
 
@@ -91,14 +92,14 @@ TEST_P(Requests, CallWithoutFlagsAndCancellableAndWithTheTimeLimit) {
     const RequestRow &row = GetParam();
     peer().on(full_method(row), row_reply(row));
     outcome(row, handle_, true);
-    expect_call_arguments(false, row.interface, row.method);
+    expect_call_arguments(false, row.module.interface, row.method);
 }
 
 TEST_P(Requests, HandTheReplyToTheCallbackOnce) {
     const RequestRow &row = GetParam();
     peer().on(full_method(row), row_reply(row));
     ResponseRecorder recorder{[&](const Response &, void *data) { expect_data(row, data); }};
-    ASSERT_EQ(row.call(handle_, ResponseRecorder::callback, &recorder), IMS_ERROR_NONE);
+    ASSERT_EQ(row.function.call(handle_, ResponseRecorder::callback, &recorder), IMS_ERROR_NONE);
     EXPECT_EQ(recorder.count(), 0U); // never before the request returns
     fence();
     ASSERT_EQ(recorder.count(), 1U);
@@ -119,7 +120,8 @@ TEST_P(Requests, PassTheServicesOwnResultsThrough) {
         EXPECT_EQ(response.handle, handle_);
         EXPECT_EQ(response.result, result);
         if (is_logged)
-            expect_one_line(row.unit, row.handler, row.refused_message + std::to_string(result));
+            expect_one_line(row.module.unit, row.handler,
+                            row.refused_message + std::to_string(result));
     }
     EXPECT_TRUE(take_log().empty());
 }
@@ -131,30 +133,30 @@ TEST_P(Requests, AreSentWithoutACallbackAndLeaveNothingBehind) {
                               empty_reply()};
     for (const Answer &answer : answers) {
         peer().on(full_method(row), answer);
-        EXPECT_EQ(row.call(handle_, nullptr, nullptr), IMS_ERROR_NONE);
+        EXPECT_EQ(row.function.call(handle_, nullptr, nullptr), IMS_ERROR_NONE);
         fence();
     }
     EXPECT_EQ(requests().size(), std::size(answers));
     EXPECT_TRUE(take_log().empty());
 
     peer().on(full_method(row), failure(error_name::kAccessDenied));
-    EXPECT_EQ(row.call(handle_, nullptr, nullptr), IMS_ERROR_NONE);
+    EXPECT_EQ(row.function.call(handle_, nullptr, nullptr), IMS_ERROR_NONE);
     fence();
-    expect_one_line(row.unit, row.handler, "Permission denied");
+    expect_one_line(row.module.unit, row.handler, "Permission denied");
 }
 
 TEST_P(Requests, TellOfARefusalWithTwoAndOneLine) {
     const RequestRow &row = GetParam();
     peer().on(full_method(row), failure(error_name::kAccessDenied));
     expect_failure(row, handle_, 2);
-    expect_one_line(row.unit, row.handler, "Permission denied");
+    expect_one_line(row.module.unit, row.handler, "Permission denied");
 }
 
 TEST_P(Requests, TakeCodeNineOfAnyDomainForARefusal) {
     const RequestRow &row = GetParam();
     peer().on(full_method(row), failure(G_IO_ERROR, 9));
     expect_failure(row, handle_, 2);
-    expect_one_line(row.unit, row.handler, "Permission denied");
+    expect_one_line(row.module.unit, row.handler, "Permission denied");
 }
 
 TEST_P(Requests, TellOfEveryOtherErrorWithOneAndNoLine) {
@@ -174,7 +176,7 @@ TEST_P(Requests, SayNothingOfACancelledCall) {
     const RequestRow &row = GetParam();
     peer().on(full_method(row), failure(G_IO_ERROR, 19));
     ResponseRecorder &recorder = lasting_recorder();
-    ASSERT_EQ(row.call(handle_, ResponseRecorder::callback, &recorder), IMS_ERROR_NONE);
+    ASSERT_EQ(row.function.call(handle_, ResponseRecorder::callback, &recorder), IMS_ERROR_NONE);
     fence();
     EXPECT_EQ(recorder.count(), 0U);
     EXPECT_TRUE(take_log().empty());

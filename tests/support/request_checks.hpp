@@ -17,7 +17,7 @@ class QueryGates : public ::testing::TestWithParam<QueryRow> {};
 
 template <typename Row>
 std::string row_name(const ::testing::TestParamInfo<Row> &info) {
-    return info.param.function;
+    return info.param.function.name;
 }
 
 } // namespace test

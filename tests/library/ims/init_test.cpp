@@ -3,7 +3,6 @@
 #include "tests/support/bus_observer.hpp"
 #include "tests/support/expectations.hpp"
 #include "tests/support/glib_watch.hpp"
-#include "tests/support/request_row.hpp"
 #include "tests/support/with_peer.hpp"
 
 #include <cerrno>
@@ -42,13 +41,13 @@ TEST(InitGate, ComesBeforeTheArgumentCheck) {
 }
 
 TEST(InitGate, IsTheFirstStepOfEveryCoreFunction) {
-    check_gate("ims.cpp", "ims_init", with_nothing<ims_init>);
+    check_gate<ims_init>("ims.cpp");
     reset_platform();
-    check_gate("ims.cpp", "ims_deinit", with_nothing<ims_deinit>);
+    check_gate<ims_deinit>("ims.cpp");
     reset_platform();
-    check_gate("ims.cpp", "ims_set_notification_cb", with_nothing<ims_set_notification_cb>);
+    check_gate<ims_set_notification_cb>("ims.cpp");
     reset_platform();
-    check_gate("ims.cpp", "ims_unset_notification_cb", with_nothing<ims_unset_notification_cb>);
+    check_gate<ims_unset_notification_cb>("ims.cpp");
 }
 
 TEST(InitArguments, ANullHandlePointerIsRefused) {

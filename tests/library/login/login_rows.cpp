@@ -8,50 +8,40 @@ namespace {
 
 constexpr Module kLogin{"ims_login.cpp", "org.kelvo.ims.Login"};
 
-RequestRow login_row() {
-    RequestRow row =
-        named_row<ims_login>(kLogin, "ims_login", "Login", "(ssii)", "('a', 'b', 1, 42)");
-    row.call = [](ims_h handle, ims_response_cb callback, void *user_data) {
-        return ims_login(handle, "a", "b", 1, callback, user_data);
-    };
-    row.missing_pointers = {{"handle", [](ims_h, ims_response_cb callback, void *user_data) {
-                                 return ims_login(nullptr, "a", "b", 1, callback, user_data);
-                             }}};
-    row.bad_texts = {{"text_1",
-                      [](ims_h handle, ims_response_cb callback, void *user_data) {
-                          return ims_login(handle, kNotUtf8, "b", 1, callback, user_data);
-                      }},
-                     {"text_2", [](ims_h handle, ims_response_cb callback, void *user_data) {
-                          return ims_login(handle, "a", kNotUtf8, 1, callback, user_data);
-                      }}};
-    return row;
-}
+const char *const kUser = "a";
+const char *const kPassword = "b";
+constexpr std::int32_t kNumber = 1;
+constexpr std::int32_t kAsked = 2;
 
 } // namespace
 
 std::vector<RequestRow> login_request_rows() {
-    return {login_row(), plain_row<ims_logout>(kLogin, "ims_logout", "Logout", "(i)", "(42,)")};
+    const std::vector<RequestRow> rows{
+        {.function = request<ims_login, kUser, kPassword, kNumber>(),
+         .method = "Login",
+         .type = "(ssii)",
+         .arguments = "('a', 'b', 1, 42)",
+         .checked = Checked::kHandle},
+        {.function = request<ims_logout>(),
+         .method = "Logout",
+         .type = "(i)",
+         .arguments = "(42,)"},
+    };
+    return requests_of(kLogin, rows);
 }
 
 std::vector<QueryRow> login_query_rows() {
-    static ims_login_state_s state;
-    QueryRow row;
-    row.function = "ims_get_login_state";
-    row.unit = kLogin.unit;
-    row.interface = kLogin.interface;
-    row.method = "GetLoginState";
-    row.sent_type = "(ii)";
-    row.sent = "(2, 42)";
-    row.call = [](ims_h handle) { return ims_get_login_state(handle, 2, &state); };
-    row.call_with_nothing = with_nothing<ims_get_login_state>;
-    row.missing_pointers = {
-        {"handle", [](ims_h) { return ims_get_login_state(nullptr, 2, &state); }},
-        {"state", [](ims_h handle) { return ims_get_login_state(handle, 2, nullptr); }}};
-    row.reply_type = "(iiui)";
-    row.reply = "(0, 1, 2, 3)";
-    row.refused_reply = "(5, 1, 2, 3)";
-    row.refused_message = "Failed to get Login Status: [5]";
-    return {row};
+    const std::vector<QueryRow> rows{
+        {.function = query<ims_get_login_state, kAsked>(),
+         .method = "GetLoginState",
+         .type = "(ii)",
+         .arguments = "(2, 42)",
+         .reply_type = "(iiui)",
+         .reply = "(0, 1, 2, 3)",
+         .refused_reply = "(5, 1, 2, 3)",
+         .refused_message = "Failed to get Login Status: [5]"},
+    };
+    return queries_of(kLogin, rows);
 }
 
 } // namespace test

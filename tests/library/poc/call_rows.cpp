@@ -16,7 +16,7 @@ constexpr ims_poc_ad_hoc_call_s kAdHoc{{1, 2, 3, 4}, true, {5, 6, 7, 8}, "one", 
 constexpr ims_poc_content_s kContent{"text/plain", "render", "id", "8bit", "a note", "Welcome"};
 constexpr ims_poc_users_s kUsers{7, 2, -8, &kFirst, 9, &kContent};
 constexpr ims_poc_value_pair_s kPair{7, -8};
-constexpr std::int32_t kValue = -7;
+constexpr std::int32_t kSession = -7;
 constexpr ims_poc_floor_s kFloor{7, {1, 2, 3, 4}, 8, -9, "talk"};
 constexpr ims_poc_floor_query_s kQuery{5, {7, 8, 9, 10, 11}};
 
@@ -62,100 +62,112 @@ constexpr ims_poc_content_s kBadContent = [] {
     return content;
 }();
 
-template <auto Function>
-RequestRow users_row(const char *function, const char *method) {
+std::vector<BadText> bad_users() {
     using Users = ims_poc_users_s;
     using Content = ims_poc_content_s;
-    return with_bad_texts(
-        record_row<Function, kUsers>(kPoc, function, method, "(iiiviv)", CHANGE_AS_SENT),
-        {bad_part<Function, kUsers, &Users::user_list, kBadUser>("uri"),
-         bad_part<Function, kUsers, &Users::user_list, kBadName>("display_name"),
-         bad_part<Function, kUsers, &Users::user_list, kBadSecond>("second user"),
-         bad_part<Function, kUsers, &Users::content, kBadContent<&Content::content_type>>("type"),
-         bad_part<Function, kUsers, &Users::content, kBadContent<&Content::content>>("content")});
+    return {bad_part<&Users::user_list, kBadUser>("uri"),
+            bad_part<&Users::user_list, kBadName>("display_name"),
+            bad_part<&Users::user_list, kBadSecond>("second user"),
+            bad_part<&Users::content, kBadContent<&Content::content_type>>("type"),
+            bad_part<&Users::content, kBadContent<&Content::content>>("content")};
 }
 
-template <auto Function>
-RequestRow media_row(const char *function, const char *method) {
-    return record_row<Function, kMedia>(kPoc, function, method, "(bbiivv)", MEDIA_AS_SENT);
-}
-
-template <auto Function>
-RequestRow pair_row(const char *function, const char *method) {
-    return record_row<Function, kPair>(kPoc, function, method, "(ii)", "(7, -8)");
-}
-
-RequestRow make_call_row() {
+std::vector<RequestRow> making_rows() {
     using Make = ims_poc_make_call_s;
-    constexpr auto call = ims_poc_call_make_call;
-    return with_reply(
-        with_bad_texts(record_row<call, kMake>(
-                           kPoc, "ims_poc_call_make_call", "PocMakeCall", "(bbbsisvvi)",
-                           "(true, false, true, 'tel:+4912345', 2, 'subject', <[1, 2, 3, 4]>, "
-                           "<[5, -6, 7, -2147483648]>, -9)"),
-                       {bad_text<call, kMake, &Make::text_1>("text_1"),
-                        bad_text<call, kMake, &Make::text_2>("text_2")}),
-        "(ii)", "(0, 7)", is_pointer_to_seven);
-}
-
-RequestRow make_ad_hoc_call_row() {
     using AdHoc = ims_poc_ad_hoc_call_s;
-    constexpr auto call = ims_poc_make_ad_hoc_call;
-    return with_reply(
-        with_bad_texts(record_row<call, kAdHoc>(
-                           kPoc, "ims_poc_make_ad_hoc_call", "PocMakeAdHocConfCall",
-                           "(vbvssbibivi)",
-                           "(<[1, 2, 3, 4]>, true, <[5, 6, 7, 8]>, 'one', 'two', false, 2, true, "
-                           "-9, " USERS_AS_SENT ", 1000000000)"),
-                       {bad_text<call, kAdHoc, &AdHoc::text_1>("text_1"),
-                        bad_text<call, kAdHoc, &AdHoc::text_2>("text_2"),
-                        bad_part<call, kAdHoc, &AdHoc::user_list, kBadUser>("uri"),
-                        bad_part<call, kAdHoc, &AdHoc::user_list, kBadSecond>("second user")}),
-        "(ii)", "(0, 7)", is_pointer_to_seven);
+    return {
+        {.function = request<ims_poc_call_make_call, kMake>(),
+         .method = "PocMakeCall",
+         .type = "(bbbsisvvi)",
+         .arguments = "(true, false, true, 'tel:+4912345', 2, 'subject', <[1, 2, 3, 4]>, "
+                      "<[5, -6, 7, -2147483648]>, -9)",
+         .bad_texts = {bad_text<&Make::text_1>(), bad_text<&Make::text_2>()},
+         .reply_type = "(ii)",
+         .reply = "(0, 7)",
+         .check_data = is_pointer_to_seven},
+        {.function = request<ims_poc_make_ad_hoc_call, kAdHoc>(),
+         .method = "PocMakeAdHocConfCall",
+         .type = "(vbvssbibivi)",
+         .arguments = "(<[1, 2, 3, 4]>, true, <[5, 6, 7, 8]>, 'one', 'two', false, 2, true, "
+                      "-9, " USERS_AS_SENT ", 1000000000)",
+         .bad_texts = {bad_text<&AdHoc::text_1>(), bad_text<&AdHoc::text_2>(),
+                       bad_part<&AdHoc::user_list, kBadUser>("uri"),
+                       bad_part<&AdHoc::user_list, kBadSecond>("second user")},
+         .reply_type = "(ii)",
+         .reply = "(0, 7)",
+         .check_data = is_pointer_to_seven},
+        {.function = request<ims_poc_add_users_to_ad_hoc_call, kUsers>(),
+         .method = "PocAddUsersToAdHocConfCall",
+         .type = "(iiiviv)",
+         .arguments = CHANGE_AS_SENT,
+         .bad_texts = bad_users()},
+        {.function = request<ims_poc_remove_users_from_ad_hoc_call, kUsers>(),
+         .method = "PocRemoveUsersFromAdHocConfCall",
+         .type = "(iiiviv)",
+         .arguments = CHANGE_AS_SENT,
+         .bad_texts = bad_users()},
+    };
 }
 
-RequestRow request_floor_row() {
-    using Floor = ims_poc_floor_s;
-    constexpr auto call = ims_poc_call_request_floor;
-    return with_bad_texts(record_row<call, kFloor>(kPoc, "ims_poc_call_request_floor",
-                                                   "PocRequestFloor", "(iviis)",
-                                                   "(7, <[1, 2, 3, 4]>, 8, -9, 'talk')"),
-                          {bad_text<call, kFloor, &Floor::text>("text")});
+std::vector<RequestRow> session_rows() {
+    return {
+        {.function = request<ims_poc_call_convert_normal_call_to_crisis_call, kSession>(),
+         .method = "PocCallConvertToCrisisCall",
+         .type = "(i)",
+         .arguments = "(-7,)"},
+        {.function = request<ims_poc_call_answer_call, kMedia>(),
+         .method = "PocAnswerCall",
+         .type = "(bbiivv)",
+         .arguments = MEDIA_AS_SENT},
+        {.function = request<ims_poc_call_reject_call, kPair>(),
+         .method = "PocRejectCall",
+         .type = "(ii)",
+         .arguments = "(7, -8)"},
+        {.function = request<ims_poc_call_end_call, kPair>(),
+         .method = "PocEndCall",
+         .type = "(ii)",
+         .arguments = "(7, -8)"},
+        {.function = request<ims_poc_call_request_floor, kFloor>(),
+         .method = "PocRequestFloor",
+         .type = "(iviis)",
+         .arguments = "(7, <[1, 2, 3, 4]>, 8, -9, 'talk')",
+         .bad_texts = {bad_text<&ims_poc_floor_s::text>()}},
+        {.function = request<ims_poc_call_release_floor, kFloor>(),
+         .method = "PocReleaseFloor",
+         .type = "(iv)",
+         .arguments = "(7, <[1, 2, 3, 4]>)"},
+        {.function = request<ims_poc_call_request_floor_status, kQuery>(),
+         .method = "PocRequestFloorStatus",
+         .type = "(v)",
+         .arguments = "(<[7, 8, 9, 10, 11]>,)",
+         .reply_type = "(iaa{sv})",
+         .reply = "(0, [{'session_id': <int64 7>, 'status': <int64 2>, 'participant_count': "
+                  "<int64 3>, 'floor_taken_uri': <'sip:a@example.org'>}, "
+                  "{'session_id': <int64 8>}])",
+         .check_data = is_status_list},
+        {.function = request<ims_poc_modify_call, kMedia>(),
+         .method = "PocModifyCall",
+         .type = "(bbiivv)",
+         .arguments = MEDIA_AS_SENT},
+        {.function = request<ims_poc_accept_call_modify, kMedia>(),
+         .method = "PocAcceptModifyCall",
+         .type = "(bbiivv)",
+         .arguments = MEDIA_AS_SENT},
+        {.function = request<ims_poc_reject_call_modify, kSession>(),
+         .method = "PocRejectModifyCall",
+         .type = "(i)",
+         .arguments = "(-7,)"},
+        {.function = request<ims_poc_set_channel, kPair>(),
+         .method = "PocSetChannel",
+         .type = "(ii)",
+         .arguments = "(7, -8)"},
+    };
 }
 
 } // namespace
 
 std::vector<RequestRow> poc_call_rows() {
-    return {
-        make_call_row(),
-        make_ad_hoc_call_row(),
-        users_row<ims_poc_add_users_to_ad_hoc_call>("ims_poc_add_users_to_ad_hoc_call",
-                                                    "PocAddUsersToAdHocConfCall"),
-        users_row<ims_poc_remove_users_from_ad_hoc_call>("ims_poc_remove_users_from_ad_hoc_call",
-                                                         "PocRemoveUsersFromAdHocConfCall"),
-        record_row<ims_poc_call_convert_normal_call_to_crisis_call, kValue>(
-            kPoc, "ims_poc_call_convert_normal_call_to_crisis_call", "PocCallConvertToCrisisCall",
-            "(i)", "(-7,)"),
-        media_row<ims_poc_call_answer_call>("ims_poc_call_answer_call", "PocAnswerCall"),
-        pair_row<ims_poc_call_reject_call>("ims_poc_call_reject_call", "PocRejectCall"),
-        pair_row<ims_poc_call_end_call>("ims_poc_call_end_call", "PocEndCall"),
-        request_floor_row(),
-        record_row<ims_poc_call_release_floor, kFloor>(
-            kPoc, "ims_poc_call_release_floor", "PocReleaseFloor", "(iv)", "(7, <[1, 2, 3, 4]>)"),
-        with_reply(record_row<ims_poc_call_request_floor_status, kQuery>(
-                       kPoc, "ims_poc_call_request_floor_status", "PocRequestFloorStatus", "(v)",
-                       "(<[7, 8, 9, 10, 11]>,)"),
-                   "(iaa{sv})",
-                   "(0, [{'session_id': <int64 7>, 'status': <int64 2>, 'participant_count': "
-                   "<int64 3>, 'floor_taken_uri': <'sip:a@example.org'>}, "
-                   "{'session_id': <int64 8>}])",
-                   is_status_list),
-        media_row<ims_poc_modify_call>("ims_poc_modify_call", "PocModifyCall"),
-        media_row<ims_poc_accept_call_modify>("ims_poc_accept_call_modify", "PocAcceptModifyCall"),
-        value_row<ims_poc_reject_call_modify, -7>(kPoc, "ims_poc_reject_call_modify",
-                                                  "PocRejectModifyCall", "(i)", "(-7,)"),
-        pair_row<ims_poc_set_channel>("ims_poc_set_channel", "PocSetChannel"),
-    };
+    return joined({making_rows(), session_rows()});
 }
 
 } // namespace test

@@ -6,20 +6,21 @@
 namespace test {
 namespace {
 
-constexpr ims_poc_peer_info_s kSecond{2, nullptr, "B", true, nullptr};
-constexpr ims_poc_peer_info_s kFirst{1, "sip:a@example.org", nullptr, false, &kSecond};
-constexpr ims_poc_peer_info_s kOriginator{-3, "sip:me@example.org", "Me", false, &kFirst};
+constexpr ims_poc_peer_info_s kSecondTarget{2, nullptr, "B", true, nullptr};
+constexpr ims_poc_peer_info_s kFirstTarget{1, "sip:a@example.org", nullptr, false, &kSecondTarget};
+constexpr ims_poc_peer_info_s kOriginator{-3, "sip:me@example.org", "Me", false, &kFirstTarget};
 constexpr ims_poc_record_request_s kRecord{7, -8, 9, "/tmp/talk.wav"};
-constexpr ims_poc_message_s kMessage{7,          "id",      &kFirst,      -8,        "text/plain",
-                                     "Hello!\n", INT32_MAX, &kOriginator, 1000000000};
+constexpr ims_poc_message_s kMessage{7,          "id",      &kFirstTarget, -8,        "text/plain",
+                                     "Hello!\n", INT32_MAX, &kOriginator,  1000000000};
 constexpr ims_poc_name_node_s kLastName{nullptr, nullptr, nullptr};
 constexpr ims_poc_name_node_s kNextName{nullptr, "C", &kLastName};
 constexpr ims_poc_name_node_s kFirstName{"sip:a@example.org", "A", &kNextName};
 constexpr ims_poc_msg_notification_s kNotice{7, "id", &kOriginator, &kFirstName, "when", -8};
 constexpr ims_poc_file_attributes_s kFile{"map.png", "where", 1048576,     true,   1,
                                           -2,        "t-1",   "image/png", "image"};
-constexpr ims_poc_file_transfer_s kTransfer{7, &kFirst, &kFile, &kOriginator};
+constexpr ims_poc_file_transfer_s kTransfer{7, &kFirstTarget, &kFile, &kOriginator};
 constexpr ims_poc_transfer_answer_s kAnswer{7, "t-1"};
+constexpr std::int32_t kAnySession = -7;
 
 #define TARGETS_AS_SENT                                                                            \
     "<[{'uri_type': <int64 1>, 'uri': <'sip:a@example.org'>, 'is_group_uri': <false>}, "           \
@@ -55,115 +56,126 @@ void is_transfer_result(void *data) {
     EXPECT_EQ(result->value_2, -2);
 }
 
-RequestRow with_message_result(RequestRow row) {
-    return with_reply(std::move(row), "(iiii)", "(0, 1, -2, 3)", is_message_result);
-}
-RequestRow with_transfer_result(RequestRow row) {
-    return with_reply(std::move(row), "(iii)", "(0, 1, -2)", is_transfer_result);
-}
-
 constexpr ims_poc_peer_info_s kBadPeer{1, kNotUtf8, nullptr, false, nullptr};
 constexpr ims_poc_peer_info_s kBadNextPeer{1, nullptr, nullptr, false, &kBadPeer};
-constexpr ims_poc_name_node_s kBadName{nullptr, kNotUtf8, nullptr};
+constexpr ims_poc_name_node_s kBadParty{nullptr, kNotUtf8, nullptr};
 constexpr ims_poc_file_attributes_s kBadFile{nullptr, nullptr, 0,       false,   0,
                                              0,       nullptr, nullptr, kNotUtf8};
 
-RequestRow start_recording_row() {
-    using Recording = ims_poc_record_request_s;
-    constexpr auto call = ims_poc_start_call_recording;
-    return with_reply(
-        with_bad_texts(record_row<call, kRecord>(kPoc, "ims_poc_start_call_recording",
-                                                 "PocStartCallRecording", "(iiis)",
-                                                 "(7, -8, 9, '/tmp/talk.wav')"),
-                       {bad_text<call, kRecord, &Recording::text>("text")}),
-        "(ia{sv})",
-        "(0, {'session_id': <int64 7>, 'record_state': <int64 1>, 'record_error': <int64 -2>, "
-        "'record_file_path': <'/tmp/talk.wav'>})",
-        is_recording);
+std::vector<RequestRow> recording_rows() {
+    return {
+        {.function = request<ims_poc_start_call_recording, kRecord>(),
+         .method = "PocStartCallRecording",
+         .type = "(iiis)",
+         .arguments = "(7, -8, 9, '/tmp/talk.wav')",
+         .bad_texts = {bad_text<&ims_poc_record_request_s::text>()},
+         .reply_type = "(ia{sv})",
+         .reply = "(0, {'session_id': <int64 7>, 'record_state': <int64 1>, 'record_error': "
+                  "<int64 -2>, 'record_file_path': <'/tmp/talk.wav'>})",
+         .check_data = is_recording},
+        {.function = request<ims_poc_pause_call_recording, kAnySession>(),
+         .method = "PocPauseCallRecording",
+         .type = "(i)",
+         .arguments = "(-7,)"},
+        {.function = request<ims_poc_resume_call_recording, kAnySession>(),
+         .method = "PocResumeCallRecording",
+         .type = "(i)",
+         .arguments = "(-7,)"},
+        {.function = request<ims_poc_stop_call_recording, kAnySession>(),
+         .method = "PocStopCallRecording",
+         .type = "(i)",
+         .arguments = "(-7,)"},
+        {.function = request<ims_poc_cancel_call_recording, kAnySession>(),
+         .method = "PocCancelCallRecording",
+         .type = "(i)",
+         .arguments = "(-7,)"},
+    };
 }
 
-RequestRow send_msg_row() {
+std::vector<RequestRow> sending_rows() {
     using Message = ims_poc_message_s;
-    constexpr auto call = ims_poc_send_msg;
-    return with_message_result(with_bad_texts(
-        record_row<call, kMessage>(kPoc, "ims_poc_send_msg", "PocSendMsg", "(isvissivi)",
-                                   "(7, 'id', " TARGETS_AS_SENT ", -8, 'text/plain', 'Hello!\\n', "
-                                   "2147483647, " ORIGINATOR_AS_SENT ", 1000000000)"),
-        {bad_text<call, kMessage, &Message::text_1>("text_1"),
-         bad_text<call, kMessage, &Message::text_2>("text_2"),
-         bad_text<call, kMessage, &Message::text_3>("text_3"),
-         bad_part<call, kMessage, &Message::targets, kBadNextPeer>("targets"),
-         bad_part<call, kMessage, &Message::originator, kBadPeer>("originator")}));
-}
-
-RequestRow send_notification_row() {
     using Notice = ims_poc_msg_notification_s;
-    constexpr auto call = ims_poc_send_received_msg_notification;
-    return with_message_result(with_bad_texts(
-        record_row<call, kNotice>(kPoc, "ims_poc_send_received_msg_notification",
-                                  "PocSendReceivedMsgNoti", "(isvvsi)",
-                                  "(7, 'id', " ORIGINATOR_AS_SENT
-                                  ", <[{'uri': <'sip:a@example.org'>, 'display_name': <'A'>}, "
-                                  "{'display_name': <'C'>}, @a{sv} {}]>, 'when', -8)"),
-        {bad_text<call, kNotice, &Notice::text_1>("text_1"),
-         bad_text<call, kNotice, &Notice::text_2>("text_2"),
-         bad_part<call, kNotice, &Notice::originator, kBadPeer>("originator"),
-         bad_part<call, kNotice, &Notice::parties, kBadName>("parties")}));
+    return {
+        {.function = request<ims_poc_send_msg, kMessage>(),
+         .method = "PocSendMsg",
+         .type = "(isvissivi)",
+         .arguments = "(7, 'id', " TARGETS_AS_SENT ", -8, 'text/plain', 'Hello!\\n', "
+                      "2147483647, " ORIGINATOR_AS_SENT ", 1000000000)",
+         .bad_texts = {bad_text<&Message::text_1>(), bad_text<&Message::text_2>(),
+                       bad_text<&Message::text_3>(),
+                       bad_part<&Message::targets, kBadNextPeer>("targets"),
+                       bad_part<&Message::originator, kBadPeer>("originator")},
+         .reply_type = "(iiii)",
+         .reply = "(0, 1, -2, 3)",
+         .check_data = is_message_result},
+        {.function = request<ims_poc_send_received_msg_notification, kNotice>(),
+         .method = "PocSendReceivedMsgNoti",
+         .type = "(isvvsi)",
+         .arguments = "(7, 'id', " ORIGINATOR_AS_SENT
+                      ", <[{'uri': <'sip:a@example.org'>, 'display_name': <'A'>}, "
+                      "{'display_name': <'C'>}, @a{sv} {}]>, 'when', -8)",
+         .bad_texts = {bad_text<&Notice::text_1>(), bad_text<&Notice::text_2>(),
+                       bad_part<&Notice::originator, kBadPeer>("originator"),
+                       bad_part<&Notice::parties, kBadParty>("parties")},
+         .reply_type = "(iiii)",
+         .reply = "(0, 1, -2, 3)",
+         .check_data = is_message_result},
+        {.function = request<ims_poc_send_keep_alive, kAnySession>(),
+         .method = "PocSendKeepAlive",
+         .type = "(i)",
+         .arguments = "(-7,)"},
+    };
 }
 
-RequestRow transfer_file_row() {
+std::vector<RequestRow> file_rows() {
     using Transfer = ims_poc_file_transfer_s;
-    constexpr auto call = ims_poc_transfer_file;
-    return with_transfer_result(with_bad_texts(
-        record_row<call, kTransfer>(
-            kPoc, "ims_poc_transfer_file", "PocTransferFile", "(ivvv)",
-            "(7, " TARGETS_AS_SENT ", <{'file_name': <'map.png'>, 'file_description': <'where'>, "
-            "'file_size': <int64 1048576>, 'push': <true>, 'start': <int64 1>, 'end': <int64 -2>, "
-            "'transfer_id': <'t-1'>, 'content_type': <'image/png'>, 'file_type': "
-            "<'image'>}>, " ORIGINATOR_AS_SENT ")"),
-        {bad_part<call, kTransfer, &Transfer::targets, kBadPeer>("targets"),
-         bad_part<call, kTransfer, &Transfer::attributes, kBadFile>("attributes"),
-         bad_part<call, kTransfer, &Transfer::originator, kBadPeer>("originator")}));
-}
-
-template <auto Function>
-RequestRow answer_row(const char *function, const char *method) {
     using Answer = ims_poc_transfer_answer_s;
-    return with_transfer_result(
-        with_bad_texts(record_row<Function, kAnswer>(kPoc, function, method, "(is)", "(7, 't-1')"),
-                       {bad_text<Function, kAnswer, &Answer::transfer_id>("transfer_id")}));
-}
-
-template <auto Function>
-RequestRow session_row(const char *function, const char *method) {
-    return value_row<Function, -7>(kPoc, function, method, "(i)", "(-7,)");
+    return {
+        {.function = request<ims_poc_transfer_file, kTransfer>(),
+         .method = "PocTransferFile",
+         .type = "(ivvv)",
+         .arguments =
+             "(7, " TARGETS_AS_SENT ", <{'file_name': <'map.png'>, 'file_description': <'where'>, "
+             "'file_size': <int64 1048576>, 'push': <true>, 'start': <int64 1>, 'end': "
+             "<int64 -2>, 'transfer_id': <'t-1'>, 'content_type': <'image/png'>, "
+             "'file_type': <'image'>}>, " ORIGINATOR_AS_SENT ")",
+         .bad_texts = {bad_part<&Transfer::targets, kBadPeer>("targets"),
+                       bad_part<&Transfer::attributes, kBadFile>("attributes"),
+                       bad_part<&Transfer::originator, kBadPeer>("originator")},
+         .reply_type = "(iii)",
+         .reply = "(0, 1, -2)",
+         .check_data = is_transfer_result},
+        {.function = request<ims_poc_accept_file_transfer, kAnswer>(),
+         .method = "PocAcceptFileTransfer",
+         .type = "(is)",
+         .arguments = "(7, 't-1')",
+         .bad_texts = {bad_text<&Answer::transfer_id>()},
+         .reply_type = "(iii)",
+         .reply = "(0, 1, -2)",
+         .check_data = is_transfer_result},
+        // The service has the method under this name, with an A too many.
+        {.function = request<ims_poc_reject_file_transfer, kAnswer>(),
+         .method = "PocARejectFileTransfer",
+         .type = "(is)",
+         .arguments = "(7, 't-1')",
+         .bad_texts = {bad_text<&Answer::transfer_id>()},
+         .reply_type = "(iii)",
+         .reply = "(0, 1, -2)",
+         .check_data = is_transfer_result},
+        {.function = request<ims_poc_cancel_file_transfer, kAnySession>(),
+         .method = "PocCancelFileTransfer",
+         .type = "(i)",
+         .arguments = "(-7,)",
+         .reply_type = "(iii)",
+         .reply = "(0, 1, -2)",
+         .check_data = is_transfer_result},
+    };
 }
 
 } // namespace
 
 std::vector<RequestRow> poc_message_rows() {
-    return {
-        start_recording_row(),
-        session_row<ims_poc_pause_call_recording>("ims_poc_pause_call_recording",
-                                                  "PocPauseCallRecording"),
-        session_row<ims_poc_resume_call_recording>("ims_poc_resume_call_recording",
-                                                   "PocResumeCallRecording"),
-        session_row<ims_poc_stop_call_recording>("ims_poc_stop_call_recording",
-                                                 "PocStopCallRecording"),
-        session_row<ims_poc_cancel_call_recording>("ims_poc_cancel_call_recording",
-                                                   "PocCancelCallRecording"),
-        send_msg_row(),
-        send_notification_row(),
-        transfer_file_row(),
-        answer_row<ims_poc_accept_file_transfer>("ims_poc_accept_file_transfer",
-                                                 "PocAcceptFileTransfer"),
-        // The service has the method under this name, with an A too many.
-        answer_row<ims_poc_reject_file_transfer>("ims_poc_reject_file_transfer",
-                                                 "PocARejectFileTransfer"),
-        with_transfer_result(session_row<ims_poc_cancel_file_transfer>(
-            "ims_poc_cancel_file_transfer", "PocCancelFileTransfer")),
-        session_row<ims_poc_send_keep_alive>("ims_poc_send_keep_alive", "PocSendKeepAlive"),
-    };
+    return joined({recording_rows(), sending_rows(), file_rows()});
 }
 
 } // namespace test

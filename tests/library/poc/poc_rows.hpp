@@ -8,11 +8,15 @@
 
 namespace test {
 
-inline constexpr Module kPoc{"ims_poc.cpp", "org.kelvo.ims.Poc"};
-
 // Calls and the floor.
 std::vector<RequestRow> poc_call_rows();
 // Recording, messages, file transfer, keep-alive.
 std::vector<RequestRow> poc_message_rows();
+
+// All of them.
+inline std::vector<RequestRow> poc_request_rows() {
+    return requests_of({.unit = "ims_poc.cpp", .interface = "org.kelvo.ims.Poc"},
+                       joined({poc_call_rows(), poc_message_rows()}));
+}
 
 } // namespace test

@@ -437,8 +437,7 @@ TEST_F(NetworkEnvironment, IsUntouchedOnFailure) {
 }
 
 TEST(NetworkEnvironmentGate, ComesBeforeTheArguments) {
-    check_gate("ims_settings.cpp", "ims_get_network_environment",
-               [] { return ims_get_network_environment(nullptr, nullptr); });
+    check_gate<ims_get_network_environment>("ims_settings.cpp");
 }
 
 } // namespace

@@ -11,34 +11,42 @@ constexpr Module kSms{"ims_sms.cpp", "org.kelvo.ims.Sms"};
 constexpr std::uint8_t kTpdu[] = {1, 0, 255};
 constexpr ims_sms_deliver_report_s kReport{-7, kTpdu, sizeof kTpdu, 8};
 
-// Each request has an address of its own, because sending rewrites it.
+// Sending rewrites the address of the service centre, so each request needs one of its own.
+constexpr ims_sms_send_info_s kSend{kTpdu, sizeof kTpdu, nullptr, 9};
+
 int send_sample(ims_h handle, ims_response_cb callback, void *user_data) {
     std::uint8_t sca[] = {11, 0x91, 0x44, 0x77, 0x58, 0x10, 0x06, 0xF0};
     const ims_sms_send_info_s info{kTpdu, sizeof kTpdu, sca, 9};
     return ims_sms_send_sms(handle, &info, callback, user_data);
 }
 
-RequestRow send_row() {
-    RequestRow row = named_row<ims_sms_send_sms>(kSms, "ims_sms_send_sms", "SendSms", "(isisi)",
-                                                 "(42, 'AQD/', 3, 'B5FEd1gQBvA=', 9)");
-    row.call = send_sample;
-    row.missing_pointers = {
-        {"handle", [](ims_h, ims_response_cb callback,
-                      void *user_data) { return send_sample(nullptr, callback, user_data); }},
-        {"info", [](ims_h handle, ims_response_cb callback, void *user_data) {
-             return ims_sms_send_sms(handle, nullptr, callback, user_data);
-         }}};
-    return row;
+RequestFunction sending() {
+    RequestFunction function = request<ims_sms_send_sms, kSend>();
+    function.call = send_sample;
+    function.no_handle.call = [](ims_h, ims_response_cb callback, void *user_data) {
+        return send_sample(nullptr, callback, user_data);
+    };
+    return function;
 }
 
 } // namespace
 
 std::vector<RequestRow> sms_request_rows() {
-    return {with_reply(send_row(), "(iiii)", "(0, 7, 8, 9)"),
-            with_reply(record_row<ims_sms_send_deliver_report, kReport>(
-                           kSms, "ims_sms_send_deliver_report", "SendDeliverReport", "(iisii)",
-                           "(42, -7, 'AQD/', 3, 8)"),
-                       "(iiii)", "(0, 7, 8, 9)")};
+    const std::vector<RequestRow> rows{
+        {.function = sending(),
+         .method = "SendSms",
+         .type = "(isisi)",
+         .arguments = "(42, 'AQD/', 3, 'B5FEd1gQBvA=', 9)",
+         .reply_type = "(iiii)",
+         .reply = "(0, 7, 8, 9)"},
+        {.function = request<ims_sms_send_deliver_report, kReport>(),
+         .method = "SendDeliverReport",
+         .type = "(iisii)",
+         .arguments = "(42, -7, 'AQD/', 3, 8)",
+         .reply_type = "(iiii)",
+         .reply = "(0, 7, 8, 9)"},
+    };
+    return requests_of(kSms, rows);
 }
 
 } // namespace test

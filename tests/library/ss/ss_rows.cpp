@@ -46,6 +46,7 @@ constexpr ims_ss_cw_info_s kWaiting{1, -2};
 constexpr ims_ss_cf_info_s kForwarding{1, -2, 3, 4, 5, 6, "tel:+4912345"};
 constexpr ims_ss_cb_set_s kBarring{1, -2, 3, "0000"};
 constexpr ims_ss_query_s kQuery{7, -8};
+constexpr std::int32_t kClass = 7;
 
 const ims_ss_status_list_s &list_of_one(void *data) {
     const auto &list = *static_cast<ims_ss_status_list_s *>(data);
@@ -83,48 +84,62 @@ void is_barring(void *data) {
     EXPECT_EQ(entry->cb_type, 3);
 }
 
-// A get request: its data is a list, and a refusal is logged and brings none.
-RequestRow with_list(RequestRow row, const char *dictionary, void (*check_data)(void *),
-                     const char *refused_message) {
-    row.reply_type = "(iuaa{sv})";
-    row.reply = std::string{"(0, 1, ["} + dictionary + "])";
-    row.check_data = check_data;
-    row.refused_message = refused_message;
-    return row;
+// What a get request is answered: one entry.
+std::string list_of(const char *dictionary) {
+    return std::string{"(0, 1, ["} + dictionary + "])";
+}
+
+std::vector<RequestRow> all_rows() {
+    constexpr const char *kListType = "(iuaa{sv})";
+    return {
+        {.function = request<ims_ss_set_call_waiting, kWaiting>(),
+         .method = "SetCallWaiting",
+         .type = "(iii)",
+         .arguments = "(42, 1, -2)",
+         .checked = Checked::kNothing},
+        {.function = request<ims_ss_get_call_waiting, kClass>(),
+         .method = "GetCallWaiting",
+         .type = "(ii)",
+         .arguments = "(42, 7)",
+         .checked = Checked::kNothing,
+         .reply_type = kListType,
+         .reply = list_of("{'ss_class': <1>, 'ss_status': <2>}"),
+         .check_data = is_waiting,
+         .refused_message = "Failed to get waiting status: "},
+        {.function = request<ims_ss_set_call_forwarding, kForwarding>(),
+         .method = "SetCallForwarding",
+         .type = "(iiiiiiis)",
+         .arguments = "(42, 1, -2, 3, 4, 5, 6, 'tel:+4912345')",
+         .bad_texts = {bad_text<&ims_ss_cf_info_s::cf_uri>()}},
+        {.function = request<ims_ss_get_call_forwarding, kQuery>(),
+         .method = "GetCallForwarding",
+         .type = "(iii)",
+         .arguments = "(42, 7, -8)",
+         .reply_type = kListType,
+         .reply =
+             list_of("{'ss_class': <1>, 'ss_status': <2>, 'cf_type': <3>, 'cf_uri': <'tel:1'>}"),
+         .check_data = is_forwarding,
+         .refused_message = "Failed to get forwarding status: "},
+        {.function = request<ims_ss_set_call_barring, kBarring>(),
+         .method = "SetCallBarring",
+         .type = "(iiiis)",
+         .arguments = "(42, 1, -2, 3, '0000')",
+         .bad_texts = {bad_text<&ims_ss_cb_set_s::cb_password>()}},
+        {.function = request<ims_ss_get_call_barring, kQuery>(),
+         .method = "GetCallBarring",
+         .type = "(iii)",
+         .arguments = "(42, 7, -8)",
+         .reply_type = kListType,
+         .reply = list_of("{'ss_class': <1>, 'ss_status': <2>, 'cb_type': <3>}"),
+         .check_data = is_barring,
+         .refused_message = "Failed to get barring status: "},
+    };
 }
 
 } // namespace
 
 std::vector<RequestRow> ss_request_rows() {
-    using Forwarding = ims_ss_cf_info_s;
-    using Barring = ims_ss_cb_set_s;
-    return {
-        without_checks(record_row<ims_ss_set_call_waiting, kWaiting>(
-            kSs, "ims_ss_set_call_waiting", "SetCallWaiting", "(iii)", "(42, 1, -2)")),
-        with_list(without_checks(value_row<ims_ss_get_call_waiting, 7>(
-                      kSs, "ims_ss_get_call_waiting", "GetCallWaiting", "(ii)", "(42, 7)")),
-                  "{'ss_class': <1>, 'ss_status': <2>}", is_waiting,
-                  "Failed to get waiting status: "),
-        with_bad_texts(
-            record_row<ims_ss_set_call_forwarding, kForwarding>(
-                kSs, "ims_ss_set_call_forwarding", "SetCallForwarding", "(iiiiiiis)",
-                "(42, 1, -2, 3, 4, 5, 6, 'tel:+4912345')"),
-            {bad_text<ims_ss_set_call_forwarding, kForwarding, &Forwarding::cf_uri>("cf_uri")}),
-        with_list(record_row<ims_ss_get_call_forwarding, kQuery>(kSs, "ims_ss_get_call_forwarding",
-                                                                 "GetCallForwarding", "(iii)",
-                                                                 "(42, 7, -8)"),
-                  "{'ss_class': <1>, 'ss_status': <2>, 'cf_type': <3>, 'cf_uri': <'tel:1'>}",
-                  is_forwarding, "Failed to get forwarding status: "),
-        with_bad_texts(
-            record_row<ims_ss_set_call_barring, kBarring>(kSs, "ims_ss_set_call_barring",
-                                                          "SetCallBarring", "(iiiis)",
-                                                          "(42, 1, -2, 3, '0000')"),
-            {bad_text<ims_ss_set_call_barring, kBarring, &Barring::cb_password>("cb_password")}),
-        with_list(record_row<ims_ss_get_call_barring, kQuery>(
-                      kSs, "ims_ss_get_call_barring", "GetCallBarring", "(iii)", "(42, 7, -8)"),
-                  "{'ss_class': <1>, 'ss_status': <2>, 'cb_type': <3>}", is_barring,
-                  "Failed to get barring status: "),
-    };
+    return requests_of(kSs, all_rows());
 }
 
 } // namespace test

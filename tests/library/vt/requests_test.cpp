@@ -60,8 +60,8 @@ TEST_F(VtRequest, NoTupleCarriesTheApplicationId) {
     peer().on(kRegisterApplication, reply("(ii)", "(0, 4711)"));
     const ims_h other = init();
     for (const RequestRow &row : vt_request_rows()) {
-        EXPECT_EQ(row.call(other, nullptr, nullptr), IMS_ERROR_NONE);
-        expect_sent(requests().back(), row.sent_type, row.sent);
+        EXPECT_EQ(row.function.call(other, nullptr, nullptr), IMS_ERROR_NONE);
+        expect_sent(requests().back(), row.type, row.arguments);
     }
 }
 
