@@ -11,19 +11,19 @@
 namespace test {
 
 struct EventRow {
-    const char *name;
-    int id;
-    const char *member;
-    const char *type;
-    const char *value;
+    const char *name = nullptr;
+    int id = 0;
+    const char *member = nullptr;
+    const char *type = nullptr;
+    const char *value = nullptr;
     // Looks at the record and releases what the application takes over.
-    void (*check)(const void *event);
+    void (*check)(const void *event) = nullptr;
 };
 
 struct EventModule {
-    const char *unit;      // "ims_call.cpp"
-    const char *interface; // "org.kelvo.ims.Call"
-    const char *decoder;   // "on_call_signal_emit_handler"
+    const char *unit = nullptr;      // "ims_call.cpp"
+    const char *interface = nullptr; // "org.kelvo.ims.Call"
+    const char *decoder = nullptr;   // "on_call_signal_emit_handler"
 };
 
 struct ModuleEvent {

@@ -10,7 +10,7 @@
 namespace test {
 namespace {
 
-constexpr Module kCall{"ims_call.cpp", "org.kelvo.ims.Call"};
+constexpr Module kCall{.unit = "ims_call.cpp", .interface = "org.kelvo.ims.Call"};
 
 constexpr ims_call_make_info_s kMake{"+4912345", 2, "one", "two", "three", "four"};
 char ussd_text[] = "*100#";

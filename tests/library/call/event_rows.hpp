@@ -6,8 +6,9 @@
 
 namespace test {
 
-inline constexpr EventModule kCallEvents{"ims_call.cpp", "org.kelvo.ims.Call",
-                                         "on_call_signal_emit_handler"};
+inline constexpr EventModule kCallEvents{.unit = "ims_call.cpp",
+                                         .interface = "org.kelvo.ims.Call",
+                                         .decoder = "on_call_signal_emit_handler"};
 
 // At least one of each notification, more where there are booleans.
 std::span<const EventRow> call_event_rows();

@@ -30,12 +30,25 @@ void is_extreme(const void *event) {
 }
 
 constexpr EventRow kRows[] = {
-    {"OneTwoThreeFour", 0x501, "LoginState", "(iuii)", "(1, 2, 3, 4)", is_one_two_three},
+    {.name = "OneTwoThreeFour",
+     .id = 0x501,
+     .member = "LoginState",
+     .type = "(iuii)",
+     .value = "(1, 2, 3, 4)",
+     .check = is_one_two_three},
     // The last member is nobody's, whatever it is.
-    {"NegativeFourthMember", 0x501, "LoginState", "(iuii)", "(1, 2, 3, -2147483648)",
-     is_one_two_three},
-    {"Extremes", 0x501, "LoginState", "(iuii)", "(-2147483648, 4294967295, 2147483647, 0)",
-     is_extreme},
+    {.name = "NegativeFourthMember",
+     .id = 0x501,
+     .member = "LoginState",
+     .type = "(iuii)",
+     .value = "(1, 2, 3, -2147483648)",
+     .check = is_one_two_three},
+    {.name = "Extremes",
+     .id = 0x501,
+     .member = "LoginState",
+     .type = "(iuii)",
+     .value = "(-2147483648, 4294967295, 2147483647, 0)",
+     .check = is_extreme},
 };
 
 } // namespace

@@ -6,8 +6,9 @@
 
 namespace test {
 
-inline constexpr EventModule kLoginEvents{"ims_login.cpp", "org.kelvo.ims.Login",
-                                          "on_login_signal_emit_handler"};
+inline constexpr EventModule kLoginEvents{.unit = "ims_login.cpp",
+                                          .interface = "org.kelvo.ims.Login",
+                                          .decoder = "on_login_signal_emit_handler"};
 
 std::span<const EventRow> login_event_rows();
 

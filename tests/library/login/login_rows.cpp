@@ -6,7 +6,7 @@
 namespace test {
 namespace {
 
-constexpr Module kLogin{"ims_login.cpp", "org.kelvo.ims.Login"};
+constexpr Module kLogin{.unit = "ims_login.cpp", .interface = "org.kelvo.ims.Login"};
 
 const char *const kUser = "a";
 const char *const kPassword = "b";

@@ -6,8 +6,9 @@
 
 namespace test {
 
-inline constexpr EventModule kPocEvents{"ims_poc.cpp", "org.kelvo.ims.Poc",
-                                        "on_poc_signal_emit_handler"};
+inline constexpr EventModule kPocEvents{.unit = "ims_poc.cpp",
+                                        .interface = "org.kelvo.ims.Poc",
+                                        .decoder = "on_poc_signal_emit_handler"};
 
 // At least one of each notification, with everything in it that it can hold.
 std::span<const EventRow> poc_event_rows();

@@ -58,13 +58,30 @@ void is_no_emergency(const void *event) {
 }
 
 constexpr EventRow kRows[] = {
-    {"Registered", 0x101, "RegistrationStatus", "(buuiii)", "(true, 1, 2, 3, 4, 5)", is_registered},
-    {"NotRegisteredWithExtremes", 0x101, "RegistrationStatus", "(buuiii)",
-     "(false, 4294967295, 2147483648, -1, -2147483648, 2147483647)", is_not_registered},
-    {"EmergencyWithExtremes", 0x102, "EmergencyRegistrationStatus", "(bui)",
-     "(true, 4294967295, -2147483648)", is_emergency},
-    {"EmergencyFalseSevenMinusOne", 0x102, "EmergencyRegistrationStatus", "(bui)", "(false, 7, -1)",
-     is_no_emergency},
+    {.name = "Registered",
+     .id = 0x101,
+     .member = "RegistrationStatus",
+     .type = "(buuiii)",
+     .value = "(true, 1, 2, 3, 4, 5)",
+     .check = is_registered},
+    {.name = "NotRegisteredWithExtremes",
+     .id = 0x101,
+     .member = "RegistrationStatus",
+     .type = "(buuiii)",
+     .value = "(false, 4294967295, 2147483648, -1, -2147483648, 2147483647)",
+     .check = is_not_registered},
+    {.name = "EmergencyWithExtremes",
+     .id = 0x102,
+     .member = "EmergencyRegistrationStatus",
+     .type = "(bui)",
+     .value = "(true, 4294967295, -2147483648)",
+     .check = is_emergency},
+    {.name = "EmergencyFalseSevenMinusOne",
+     .id = 0x102,
+     .member = "EmergencyRegistrationStatus",
+     .type = "(bui)",
+     .value = "(false, 7, -1)",
+     .check = is_no_emergency},
 };
 
 } // namespace

@@ -6,8 +6,9 @@
 
 namespace test {
 
-inline constexpr EventModule kRegEvents{"ims_reg.cpp", "org.kelvo.ims.Registration",
-                                        "on_reg_signal_emit_handler"};
+inline constexpr EventModule kRegEvents{.unit = "ims_reg.cpp",
+                                        .interface = "org.kelvo.ims.Registration",
+                                        .decoder = "on_reg_signal_emit_handler"};
 
 std::span<const EventRow> reg_event_rows();
 

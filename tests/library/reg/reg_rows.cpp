@@ -6,7 +6,7 @@
 namespace test {
 namespace {
 
-constexpr Module kReg{"ims_reg.cpp", "org.kelvo.ims.Registration"};
+constexpr Module kReg{.unit = "ims_reg.cpp", .interface = "org.kelvo.ims.Registration"};
 
 // "(ii)" "(0, 9)"
 void is_pointer_to_nine(void *data) {

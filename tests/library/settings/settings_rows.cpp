@@ -8,7 +8,7 @@
 namespace test {
 namespace {
 
-constexpr Module kModule{"ims_settings.cpp", "org.kelvo.ims.Settings"};
+constexpr Module kModule{.unit = "ims_settings.cpp", .interface = "org.kelvo.ims.Settings"};
 
 template <typename Record>
 Record filled(std::span<const KeyRow> keys) {

@@ -6,8 +6,9 @@
 
 namespace test {
 
-inline constexpr EventModule kSmsEvents{"ims_sms.cpp", "org.kelvo.ims.Sms",
-                                        "on_sms_signal_emit_handler"};
+inline constexpr EventModule kSmsEvents{.unit = "ims_sms.cpp",
+                                        .interface = "org.kelvo.ims.Sms",
+                                        .decoder = "on_sms_signal_emit_handler"};
 
 // At least one of each notification, more where the service's length is not the text's.
 std::span<const EventRow> sms_event_rows();

@@ -6,7 +6,7 @@
 namespace test {
 namespace {
 
-constexpr Module kSms{"ims_sms.cpp", "org.kelvo.ims.Sms"};
+constexpr Module kSms{.unit = "ims_sms.cpp", .interface = "org.kelvo.ims.Sms"};
 
 constexpr std::uint8_t kTpdu[] = {1, 0, 255};
 constexpr ims_sms_deliver_report_s kReport{-7, kTpdu, sizeof kTpdu, 8};

@@ -40,7 +40,7 @@ static_assert(sizeof(ims_ss_status_list_s) == 16);
 static_assert(offsetof(ims_ss_status_list_s, count) == 0);
 static_assert(offsetof(ims_ss_status_list_s, entries) == 8);
 
-constexpr Module kSs{"ims_ss.cpp", "org.kelvo.ims.Ss"};
+constexpr Module kSs{.unit = "ims_ss.cpp", .interface = "org.kelvo.ims.Ss"};
 
 constexpr ims_ss_cw_info_s kWaiting{1, -2};
 constexpr ims_ss_cf_info_s kForwarding{1, -2, 3, 4, 5, 6, "tel:+4912345"};
