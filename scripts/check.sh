@@ -1,8 +1,8 @@
 #!/usr/bin/env bash
 # SPDX-License-Identifier: Apache-2.0
-# The checks beyond the tests: formatting, shell scripts, the reference documentation, the library and
-# the programs with a second compiler and under sanitizers, static analysis, and an installation that
-# others can build against.
+# The checks beyond the tests: formatting, shell scripts, who includes whom, the reference
+# documentation, the library and the programs with a second compiler and under sanitizers, static
+# analysis, and an installation that others can build against.
 set -euo pipefail
 cd "$(dirname "$0")/.."
 
@@ -15,6 +15,9 @@ git ls-files '*.c' '*.h' '*.cpp' '*.hpp' | xargs clang-format --dry-run --Werror
 
 step "Shell scripts"
 git ls-files '*.sh' .ci/run | xargs shellcheck
+
+step "Who may know whom"
+scripts/check-layers.py
 
 step "Reference documentation"
 scripts/check-reference.py --self-test
