@@ -11,6 +11,7 @@ namespace {
 
 std::string describe_all(const std::vector<const ims_call_info_s *> &calls) {
     std::vector<std::string> parts;
+    parts.reserve(calls.size());
     for (const auto *call : calls)
         parts.push_back(describe(*call));
     return fmt::format("{}", fmt::join(parts, ", "));

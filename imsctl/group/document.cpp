@@ -224,7 +224,8 @@ class Reader {
 template <class Record, class Use>
 Record *read_file_as(const std::string &file, const char *what, bool (*fits)(const Json &),
                      const Use &use) {
-    const auto [document, wrong] = parse_json(read_file(file));
+    std::vector<std::string> wrong;
+    const Json document = parse_json(read_file(file), wrong);
     Problems problems;
     for (const std::string &problem : wrong)
         problems.add("", problem);

@@ -273,7 +273,7 @@ Argument<double> Arguments::seconds(const std::string &names, const std::string 
 }
 
 SessionChoice Arguments::session(const std::string &names, const Fitting &fitting) {
-    const SessionChoice choice(fitting);
+    SessionChoice choice(fitting);
     const std::string help =
         fmt::format("the session; when left out, the only one of the {}", fitting.what);
     add(verb_, names, "N", help,

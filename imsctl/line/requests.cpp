@@ -3,12 +3,12 @@
 
 namespace imsctl {
 
-Action plain(PlainRequest request, Decode decode) {
+Action plain(PlainRequest request, const Decode &decode) {
     return [=](Invocation &run) { run.request({}, request, decode); };
 }
 
 Action on_session(Arguments &arguments, const Fitting &fitting, NumberRequest request,
-                  Decode decode) {
+                  const Decode &decode) {
     const SessionChoice session = arguments.session_place(fitting);
     return [=](Invocation &run) {
         const std::int32_t id = session.resolve(run.client());

@@ -10,11 +10,11 @@ using PlainRequest = int (*)(ims_h, ims_response_cb, void *);
 using NumberRequest = int (*)(ims_h, std::int32_t, ims_response_cb, void *);
 
 // Without arguments.
-Action plain(PlainRequest request, Decode decode = nullptr);
+Action plain(PlainRequest request, const Decode &decode = nullptr);
 
 // About a session, and nothing else.
 Action on_session(Arguments &arguments, const Fitting &fitting, NumberRequest request,
-                  Decode decode = nullptr);
+                  const Decode &decode = nullptr);
 
 // With one value that is no session.
 Action with_number(Argument<std::int32_t> value, NumberRequest request);

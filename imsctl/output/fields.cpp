@@ -60,6 +60,7 @@ std::string quote_all(const Texts &texts) {
 
 std::string list_all(const std::vector<Fields> &entries) {
     std::vector<std::string> parts;
+    parts.reserve(entries.size());
     for (const Fields &fields : entries)
         parts.push_back(fmt::format("{{{}}}", to_text(fields)));
     return fmt::format("[{}]", fmt::join(parts, ","));

@@ -52,12 +52,9 @@ class Check : public nlohmann::json_sax<Json> {
 
 } // namespace
 
-JsonText parse_json(const std::string &text) {
-    JsonText parsed;
-    Check check(text, parsed.problems);
-    if (Json::sax_parse(text, &check))
-        parsed.value = Json::parse(text);
-    return parsed;
+Json parse_json(const std::string &text, std::vector<std::string> &problems) {
+    Check check(text, problems);
+    return Json::sax_parse(text, &check) ? Json::parse(text) : Json();
 }
 
 } // namespace imsctl

@@ -10,12 +10,8 @@
 
 namespace imsctl {
 
-struct JsonText {
-    Json value;
-    // What is wrong with the text: keys that an object has twice, and where it is not JSON.
-    std::vector<std::string> problems;
-};
-
-JsonText parse_json(const std::string &text);
+// Adds to `problems` what is wrong with the text: keys that an object has twice, and where it is
+// not JSON.
+Json parse_json(const std::string &text, std::vector<std::string> &problems);
 
 } // namespace imsctl

@@ -59,7 +59,7 @@ std::string summarise_emergency_registration(const Fields &fields) {
 }
 
 std::string summarise_login(const Fields &fields) {
-    const std::string state = named(kLoginStates, fields, "value_1");
+    std::string state = named(kLoginStates, fields, "value_1");
     if (get<std::int64_t>(fields, "value_1") == kLoggedOut)
         return fmt::format("{}: {}", state, named(kUnregisteredReasons, fields, "value_3"));
     return state;

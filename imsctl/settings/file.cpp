@@ -52,6 +52,10 @@ struct Problem {
     std::string text;
 };
 
+bool is_empty_text(const Json &json) {
+    return json.is_string() && json.get_ref<const std::string &>().empty();
+}
+
 struct Entry {
     std::size_t line;
     std::string name;
@@ -183,7 +187,7 @@ class Checker {
                 return fmt::format("{} already stands in line {}", entry.name, (*earlier)->line);
             });
         seen_.push_back(&entry);
-        if (entry.name == "name" && (entry.value.is_null() || entry.value == ""))
+        if (entry.name == "name" && (entry.value.is_null() || is_empty_text(entry.value)))
             return refuse(entry,
                           [] { return "name: it says which set is meant: it cannot be empty"; });
         // The service left the key out when the file was made.

@@ -13,7 +13,9 @@ struct ValidityUnit {
     std::int64_t minutes;
 };
 
-constexpr ValidityUnit kValidityUnits[] = {{'m', 1}, {'h', 60}, {'d', 24 * 60}, {'w', 7 * 24 * 60}};
+constexpr std::int64_t kHour = 60;
+constexpr std::int64_t kDay = 24 * kHour;
+constexpr ValidityUnit kValidityUnits[] = {{'m', 1}, {'h', kHour}, {'d', kDay}, {'w', 7 * kDay}};
 
 constexpr std::int32_t kMostSeconds = 255;
 

@@ -41,8 +41,8 @@ Action prepare_set_waiting(Arguments &arguments) {
 
 using Query = int (*)(ims_h, const ims_ss_query_s *, ims_response_cb, void *);
 
-Action get_list(Argument<std::int32_t> ss_class, Argument<std::int32_t> type, Query query,
-                const StatusList &list) {
+Action get_list(const Argument<std::int32_t> &ss_class, const Argument<std::int32_t> &type,
+                Query query, const StatusList &list) {
     return [=, &list](Invocation &run) {
         const ims_ss_query_s asked{*ss_class, *type};
         show_list(run, with_record(query, asked), list);

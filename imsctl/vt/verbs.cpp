@@ -15,8 +15,9 @@ constexpr NamedValue kVideoFormats[] = {{"3gp", 0}, {"mp4", kMp4}};
 
 // What a verb about a video call does: `record` makes the request's record for the session.
 template <class Record, class Make>
-Action about(SessionChoice session, int (*request)(ims_h, const Record *, ims_response_cb, void *),
-             Make record, Decode decode = nullptr) {
+Action about(const SessionChoice &session,
+             int (*request)(ims_h, const Record *, ims_response_cb, void *), Make record,
+             const Decode &decode = nullptr) {
     return [=](Invocation &run) {
         const std::int32_t id = session.resolve(run.client());
         const Record info = record(id);
