@@ -4,7 +4,7 @@
 namespace imsctl {
 namespace {
 
-constexpr VerbGroup kCallGroups[] = {
+constexpr VerbGroup kCallVerbGroups[] = {
     {"call", "voice and video calls"},
     {"call tty", "text telephony"},
     {"call tty mode", "the text telephony mode"},
@@ -20,7 +20,7 @@ constexpr VerbGroup kCallGroups[] = {
 } // namespace
 
 Module call_module() {
-    return {kCallGroups,
+    return {kCallVerbGroups,
             {call_verbs(), media_verbs(), conference_verbs(), access_verbs()},
             {call_events()}};
 }

@@ -4,7 +4,7 @@
 namespace imsctl {
 namespace {
 
-constexpr VerbGroup kGroupGroups[] = {
+constexpr VerbGroup kGroupVerbGroups[] = {
     {"group", "group documents of push-to-talk"},
     {"group rule", "the rules of a group"},
     {"group set", "the properties of a group"},
@@ -13,7 +13,7 @@ constexpr VerbGroup kGroupGroups[] = {
 } // namespace
 
 Module group_module() {
-    return {kGroupGroups, {group_verbs(), group_set_verbs()}, {}};
+    return {kGroupVerbGroups, {group_verbs(), group_set_verbs()}, {}};
 }
 
 } // namespace imsctl

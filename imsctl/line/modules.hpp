@@ -3,6 +3,7 @@
 #pragma once
 
 #include "imsctl/line/verbs.hpp"
+#include "imsctl/output/events.hpp"
 
 #include <span>
 #include <string_view>

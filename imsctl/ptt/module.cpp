@@ -4,7 +4,7 @@
 namespace imsctl {
 namespace {
 
-constexpr VerbGroup kPttGroups[] = {
+constexpr VerbGroup kPttVerbGroups[] = {
     {"ptt", "push-to-talk"},
     {"ptt floor", "the right to talk"},
     {"ptt message", "messages"},
@@ -15,7 +15,8 @@ constexpr VerbGroup kPttGroups[] = {
 } // namespace
 
 Module ptt_module() {
-    return {kPttGroups, {ptt_call_verbs(), ptt_floor_verbs(), ptt_content_verbs()}, {ptt_events()}};
+    return {
+        kPttVerbGroups, {ptt_call_verbs(), ptt_floor_verbs(), ptt_content_verbs()}, {ptt_events()}};
 }
 
 } // namespace imsctl

@@ -4,14 +4,14 @@
 namespace imsctl {
 namespace {
 
-constexpr VerbGroup kRegistrationGroups[] = {
+constexpr VerbGroup kRegistrationVerbGroups[] = {
     {"registration", "registration with the network"},
 };
 
 } // namespace
 
 Module registration_module() {
-    return {kRegistrationGroups,
+    return {kRegistrationVerbGroups,
             {registration_verbs(), login_verbs()},
             {registration_events(), login_events()}};
 }

@@ -4,7 +4,7 @@
 namespace imsctl {
 namespace {
 
-constexpr VerbGroup kSettingsGroups[] = {
+constexpr VerbGroup kSettingsVerbGroups[] = {
     {"settings", "sets of global settings"},
     {"network-environment", "the type of network environment"},
     {"profile", "registration profiles"},
@@ -13,7 +13,7 @@ constexpr VerbGroup kSettingsGroups[] = {
 } // namespace
 
 Module settings_module() {
-    return {kSettingsGroups, {settings_verbs(), profile_verbs()}, {}};
+    return {kSettingsVerbGroups, {settings_verbs(), profile_verbs()}, {}};
 }
 
 } // namespace imsctl

@@ -4,14 +4,14 @@
 namespace imsctl {
 namespace {
 
-constexpr VerbGroup kSmsGroups[] = {
+constexpr VerbGroup kSmsVerbGroups[] = {
     {"sms", "short messages"},
 };
 
 } // namespace
 
 Module sms_module() {
-    return {kSmsGroups, {sms_verbs()}, {sms_events()}};
+    return {kSmsVerbGroups, {sms_verbs()}, {sms_events()}};
 }
 
 } // namespace imsctl

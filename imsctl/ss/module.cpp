@@ -4,7 +4,7 @@
 namespace imsctl {
 namespace {
 
-constexpr VerbGroup kSsGroups[] = {
+constexpr VerbGroup kSsVerbGroups[] = {
     {"ss", "supplementary services"},
     {"ss waiting", "call waiting"},
     {"ss forwarding", "call forwarding"},
@@ -14,7 +14,7 @@ constexpr VerbGroup kSsGroups[] = {
 } // namespace
 
 Module ss_module() {
-    return {kSsGroups, {ss_verbs()}, {}};
+    return {kSsVerbGroups, {ss_verbs()}, {}};
 }
 
 } // namespace imsctl

@@ -4,7 +4,7 @@
 namespace imsctl {
 namespace {
 
-constexpr VerbGroup kVtGroups[] = {
+constexpr VerbGroup kVtVerbGroups[] = {
     {"vt", "video telephony: the picture of a video call"},
     {"vt camera", "the camera"},
     {"vt zoom", "a camera's zoom"},
@@ -18,7 +18,7 @@ constexpr VerbGroup kVtGroups[] = {
 } // namespace
 
 Module vt_module() {
-    return {kVtGroups, {vt_verbs()}, {}};
+    return {kVtVerbGroups, {vt_verbs()}, {}};
 }
 
 } // namespace imsctl
