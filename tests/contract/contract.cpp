@@ -1,11 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "tests/contract/contract.hpp"
 
+#include "tests/support/files.hpp"
+#include "tests/support/glib_ref.hpp"
+
 #include <gio/gio.h>
 
 #include <filesystem>
-#include <fstream>
-#include <iterator>
 #include <memory>
 #include <stdexcept>
 
@@ -22,15 +23,10 @@ using Node = std::unique_ptr<GDBusNodeInfo, NodeUnref>;
 }
 
 Node parsed(const std::filesystem::path &path) {
-    std::ifstream file{path};
-    const std::string text{std::istreambuf_iterator<char>{file}, {}};
     GError *error = nullptr;
-    Node node{g_dbus_node_info_new_for_xml(text.c_str(), &error)};
-    if (!node) {
-        const std::string why = error->message;
-        g_error_free(error);
-        fail(path, why);
-    }
+    Node node{g_dbus_node_info_new_for_xml(content_of(path).c_str(), &error)};
+    if (!node)
+        throw_error(path.string(), error);
     return node;
 }
 

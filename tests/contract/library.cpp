@@ -18,8 +18,7 @@ std::string LibraryOnTheBus::last_call(const std::string &reply_type) {
 }
 
 std::string LibraryOnTheBus::made_by(const RequestRow &row) {
-    peer().on(std::string{row.module.interface} + "." + row.method,
-              reply(row.reply_type, row.reply));
+    peer().on(full_method(row), reply(row.reply_type, row.reply));
     ResponseRecorder recorder{[&](const Response &, void *data) {
         if (row.check_data)
             row.check_data(data); // also releases what the application takes over
@@ -32,8 +31,7 @@ std::string LibraryOnTheBus::made_by(const RequestRow &row) {
 }
 
 std::string LibraryOnTheBus::made_by(const QueryRow &row) {
-    peer().on(std::string{row.module.interface} + "." + row.method,
-              reply(row.reply_type, row.reply));
+    peer().on(full_method(row), reply(row.reply_type, row.reply));
     EXPECT_EQ(row.function.call(handle_), IMS_ERROR_NONE)
         << row.function.name << " does not take " << row.reply_type;
     return last_call(row.reply_type);

@@ -2,14 +2,12 @@
 // The bus policy, as a dbus-daemon applies it. The service and its clients are this very user, so
 // the names in the policy are replaced; everything else is the file's.
 #include "tests/support/expectations.hpp"
+#include "tests/support/files.hpp"
 #include "tests/support/with_peer.hpp"
 
 #include <gmock/gmock.h>
 
 #include <algorithm>
-#include <filesystem>
-#include <fstream>
-#include <iterator>
 
 #include <grp.h>
 #include <pwd.h>
@@ -68,32 +66,18 @@ void replace_once(std::string &text, const std::string &from, const std::string 
 // The policy in a file of its own.
 class Policy {
   public:
-    Policy() {
-        std::string pattern = "/tmp/ims-policy-XXXXXX";
-        if (mkdtemp(pattern.data()) == nullptr)
-            throw std::runtime_error("no temporary directory");
-        directory_ = pattern;
-    }
-    ~Policy() {
-        std::error_code ignored;
-        std::filesystem::remove_all(directory_, ignored);
-    }
-    Policy(const Policy &) = delete;
-    Policy &operator=(const Policy &) = delete;
-
     void write(const std::string &service_user, const std::string &client_group) const {
-        std::ifstream policy{IMS_TEST_POLICY};
-        std::string text{std::istreambuf_iterator<char>{policy}, {}};
+        std::string text = content_of(IMS_TEST_POLICY);
         replace_once(text, "<policy user=\"root\">", "<policy user=\"" + service_user + "\">");
         replace_once(text, "<policy group=\"kelvo-ims\">",
                      "<policy group=\"" + client_group + "\">");
-        std::ofstream{path()} << text;
+        put_content(path(), text);
     }
-    std::string path() const { return directory_ + "/org.kelvo.ims.conf"; }
+    std::string path() const { return directory_.file("org.kelvo.ims.conf"); }
     std::string element() const { return "<include>" + path() + "</include>\n"; }
 
   private:
-    std::string directory_;
+    TemporaryDirectory directory_;
 };
 
 class BusPolicy : public WithPeer {

@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "tests/support/bus_client.hpp"
 
+#include "tests/support/glib_ref.hpp"
 #include "tests/support/pump.hpp"
 
 #include <optional>
-#include <stdexcept>
 
 namespace test {
 namespace {
@@ -13,19 +13,13 @@ constexpr const char *kBusName = "org.freedesktop.DBus";
 constexpr const char *kBusPath = "/org/freedesktop/DBus";
 constexpr guint32 kPrimaryOwner = 1;
 
-[[noreturn]] void fail_at(const char *what, GError *error) {
-    std::string text = std::string{what} + ": " + (error ? error->message : "no reason given");
-    g_clear_error(&error);
-    throw std::runtime_error(text);
-}
-
 Variant ask_bus(GDBusConnection *connection, const char *method, GVariant *parameters) {
     GError *error = nullptr;
     Variant reply{g_dbus_connection_call_sync(connection, kBusName, kBusPath, kBusName, method,
                                               parameters, nullptr, G_DBUS_CALL_FLAGS_NONE, 20000,
                                               nullptr, &error)};
     if (!reply)
-        fail_at(method, error);
+        throw_error(method, error);
     return reply;
 }
 
@@ -62,7 +56,7 @@ BusClient::BusClient(const std::string &address) {
                                           G_DBUS_CONNECTION_FLAGS_MESSAGE_BUS_CONNECTION),
         nullptr, nullptr, &error);
     if (!connection_)
-        fail_at("connecting to the private bus", error);
+        throw_error("connecting to the private bus", error);
 }
 
 BusClient::~BusClient() {
@@ -87,7 +81,7 @@ void BusClient::emit_signal(const char *path, const char *interface, const char 
         connection_, message, G_DBUS_SEND_MESSAGE_FLAGS_NONE, nullptr, &error);
     g_object_unref(message);
     if (!sent)
-        fail_at(member, error);
+        throw_error(member, error);
 }
 
 void BusClient::settle(GDBusConnection *connection) {

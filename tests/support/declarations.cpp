@@ -1,18 +1,17 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "tests/support/declarations.hpp"
 
-#include <fstream>
-#include <iterator>
+#include "tests/support/files.hpp"
+
 #include <stdexcept>
 #include <string_view>
 
 namespace test {
 
 std::set<std::string> declared_functions(const std::string &header) {
-    std::ifstream file{std::string{IMS_TEST_INCLUDE_DIR} + "/" + header};
-    if (!file)
+    const std::string text = content_of(std::string{IMS_TEST_INCLUDE_DIR} + "/" + header);
+    if (text.empty())
         throw std::runtime_error("no header " + header);
-    const std::string text{std::istreambuf_iterator<char>{file}, {}};
     constexpr std::string_view mark = "\nIMS_API ";
     std::set<std::string> names;
     for (auto at = text.find(mark); at != std::string::npos; at = text.find(mark, at + 1)) {

@@ -11,7 +11,7 @@
 namespace test {
 namespace {
 
-std::mutex mutex;
+std::mutex watch_mutex;
 std::optional<std::string> expected_part;
 int expected_seen = 0;
 
@@ -19,7 +19,7 @@ void judge(GLogLevelFlags level, const char *domain, const char *message) {
     if ((level & (G_LOG_LEVEL_ERROR | G_LOG_LEVEL_CRITICAL | G_LOG_LEVEL_WARNING)) == 0)
         return;
     {
-        const std::lock_guard lock{mutex};
+        const std::lock_guard lock{watch_mutex};
         if (expected_part && (level & G_LOG_LEVEL_CRITICAL) != 0 &&
             std::strstr(message, expected_part->c_str())) {
             ++expected_seen;
@@ -55,13 +55,13 @@ void watch_glib() {
 }
 
 ExpectGlibCritical::ExpectGlibCritical(std::string part) {
-    const std::lock_guard lock{mutex};
+    const std::lock_guard lock{watch_mutex};
     expected_part = std::move(part);
     expected_seen = 0;
 }
 
 ExpectGlibCritical::~ExpectGlibCritical() {
-    const std::lock_guard lock{mutex};
+    const std::lock_guard lock{watch_mutex};
     EXPECT_GT(expected_seen, 0) << "no critical that contains \"" << *expected_part << "\"";
     expected_part.reset();
 }

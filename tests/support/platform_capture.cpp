@@ -12,15 +12,13 @@
 #include <mutex>
 #include <utility>
 
-#define TEST_EXPORT __attribute__((visibility("default")))
-
 namespace test {
 namespace {
 
-std::mutex mutex;
+std::mutex capture_mutex;
 Gate current_gate = Gate::kOn;
-int queries = 0;
-std::vector<LogLine> lines;
+int queries_seen = 0;
+std::vector<LogLine> captured_lines;
 
 // "file: function(line) > message"
 bool split_prefix(const std::string &text, LogLine &line) {
@@ -45,13 +43,13 @@ bool split_prefix(const std::string &text, LogLine &line) {
 } // namespace
 
 void set_gate(Gate gate) {
-    const std::lock_guard lock{mutex};
+    const std::lock_guard lock{capture_mutex};
     current_gate = gate;
 }
 
 int gate_queries() {
-    const std::lock_guard lock{mutex};
-    return queries;
+    const std::lock_guard lock{capture_mutex};
+    return queries_seen;
 }
 
 std::ostream &operator<<(std::ostream &out, const LogLine &line) {
@@ -60,31 +58,32 @@ std::ostream &operator<<(std::ostream &out, const LogLine &line) {
 }
 
 std::vector<LogLine> take_log() {
-    const std::lock_guard lock{mutex};
-    return std::exchange(lines, {});
+    const std::lock_guard lock{capture_mutex};
+    return std::exchange(captured_lines, {});
 }
 
 void reset_platform() {
-    const std::lock_guard lock{mutex};
+    const std::lock_guard lock{capture_mutex};
     current_gate = Gate::kOn;
-    queries = 0;
-    lines.clear();
+    queries_seen = 0;
+    captured_lines.clear();
 }
 
 } // namespace test
 
-extern "C" TEST_EXPORT int system_info_get_custom_bool(const char *key, bool *value) {
-    const std::lock_guard lock{test::mutex};
+extern "C" [[gnu::visibility("default")]] int system_info_get_custom_bool(const char *key,
+                                                                          bool *value) {
+    const std::lock_guard lock{test::capture_mutex};
     EXPECT_STREQ(key, "kelvo.org/feature/network.telephony.ims");
-    ++test::queries;
+    ++test::queries_seen;
     if (test::current_gate == test::Gate::kFailing)
         return -5;
     *value = test::current_gate == test::Gate::kOn;
     return 0;
 }
 
-extern "C" TEST_EXPORT int __dlog_print(int log_id, int priority, const char *tag,
-                                        const char *format, ...) {
+extern "C" [[gnu::visibility("default")]] int
+__dlog_print(int log_id, int priority, const char *tag, const char *format, ...) {
     std::va_list arguments;
     va_start(arguments, format);
     std::va_list again;
@@ -99,7 +98,7 @@ extern "C" TEST_EXPORT int __dlog_print(int log_id, int priority, const char *ta
     test::LogLine line{log_id, priority, tag, {}, {}, -1, {}};
     if (!test::split_prefix(text, line))
         ADD_FAILURE() << "a log line without its prefix: " << text;
-    const std::lock_guard lock{test::mutex};
-    test::lines.push_back(std::move(line));
+    const std::lock_guard lock{test::capture_mutex};
+    test::captured_lines.push_back(std::move(line));
     return length;
 }

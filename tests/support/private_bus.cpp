@@ -4,9 +4,7 @@
 #include <cerrno>
 #include <csignal>
 #include <cstdlib>
-#include <filesystem>
 #include <fstream>
-#include <iterator>
 #include <stdexcept>
 #include <system_error>
 
@@ -22,18 +20,9 @@ constexpr const char *kAddressVariable = "DBUS_SYSTEM_BUS_ADDRESS";
     throw std::system_error(errno, std::generic_category(), what);
 }
 
-std::string content_of(const std::string &path) {
-    std::ifstream file{path};
-    return {std::istreambuf_iterator<char>{file}, {}};
-}
-
 } // namespace
 
 PrivateBus::PrivateBus(std::string_view policy_rules, std::string_view elements) {
-    std::string pattern = "/tmp/ims-test-XXXXXX";
-    if (!mkdtemp(pattern.data()))
-        fail_to_make("mkdtemp");
-    directory_ = pattern;
     write_configuration(policy_rules, elements);
     start();
     if (const char *before = std::getenv(kAddressVariable); before != nullptr)
@@ -47,8 +36,6 @@ PrivateBus::~PrivateBus() {
     else
         unsetenv(kAddressVariable);
     stop();
-    std::error_code ignored;
-    std::filesystem::remove_all(directory_, ignored);
 }
 
 void PrivateBus::stop() {
@@ -57,14 +44,14 @@ void PrivateBus::stop() {
 
 void PrivateBus::write_configuration(std::string_view policy_rules,
                                      std::string_view elements) const {
-    std::ofstream file{directory_ + "/bus.conf"};
+    std::ofstream file{directory_.file("bus.conf")};
     file << "<!DOCTYPE busconfig PUBLIC \"-//freedesktop//DTD D-BUS Bus Configuration 1.0//EN\"\n"
             " \"http://www.freedesktop.org/standards/dbus/1.0/busconfig.dtd\">\n"
             "<busconfig>\n"
             "  <type>session</type>\n"
             "  <listen>unix:path="
-         << directory_
-         << "/bus</listen>\n"
+         << directory_.file("bus")
+         << "</listen>\n"
             "  <auth>EXTERNAL</auth>\n"
             "  <policy context=\"default\">\n"
             "    <allow user=\"*\"/>\n"
@@ -83,12 +70,12 @@ void PrivateBus::write_configuration(std::string_view policy_rules,
 
 // What it says goes to a file, for nobody reads a pipe of it.
 void PrivateBus::start() {
-    const std::string log = directory_ + "/log";
+    const std::string log = directory_.file("log");
     const int errors = open(log.c_str(), O_WRONLY | O_CREAT | O_CLOEXEC, 0600);
     if (errors < 0)
         fail_to_make("the log of the bus");
     daemon_.emplace(std::vector<std::string>{"dbus-daemon",
-                                             "--config-file=" + directory_ + "/bus.conf",
+                                             "--config-file=" + directory_.file("bus.conf"),
                                              "--print-address=1", "--nofork", "--nopidfile"},
                     Process::Environment{}, ProcessStreams{.errors = errors});
     close(errors);

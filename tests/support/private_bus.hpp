@@ -4,6 +4,7 @@
 // of the programs that it runs; two that overlap end in the other order.
 #pragma once
 
+#include "tests/support/files.hpp"
 #include "tests/support/process.hpp"
 
 #include <optional>
@@ -30,7 +31,7 @@ class PrivateBus {
     void write_configuration(std::string_view policy_rules, std::string_view elements) const;
     void start();
 
-    std::string directory_;
+    TemporaryDirectory directory_;
     std::string address_;
     std::optional<std::string> system_bus_before_;
     std::optional<Process> daemon_;

@@ -4,13 +4,6 @@
 #include "tests/support/bus_observer.hpp"
 
 namespace test {
-namespace {
-
-std::string full_method(const QueryRow &row) {
-    return std::string{row.module.interface} + "." + row.method;
-}
-
-} // namespace
 
 TEST_P(QueryGates, LookAtNoArgumentWhenTheFeatureIsOffOrUnknown) {
     check_gate(GetParam().module.unit, GetParam().function.name,

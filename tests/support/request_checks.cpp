@@ -6,10 +6,6 @@
 namespace test {
 namespace {
 
-std::string full_method(const RequestRow &row) {
-    return std::string{row.module.interface} + "." + row.method;
-}
-
 Answer row_reply(const RequestRow &row) {
     return reply(row.reply_type, row.reply);
 }

@@ -155,6 +155,12 @@ inline std::vector<QueryRow> queries_of(const Module &module, std::vector<QueryR
     return rows;
 }
 
+// "org.kelvo.ims.Call.HoldCall"
+template <typename Row>
+std::string full_method(const Row &row) {
+    return std::string{row.module.interface} + "." + row.method;
+}
+
 // What a row says its function refuses.
 inline std::vector<Variation<MakeRequest>> null_arguments(const RequestRow &row) {
     if (row.checked == Checked::kNothing)

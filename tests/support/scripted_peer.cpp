@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "tests/support/scripted_peer.hpp"
 
+#include "tests/support/glib_ref.hpp"
 #include "tests/support/pump.hpp"
 
 #include <condition_variable>
@@ -11,7 +12,7 @@
 namespace test {
 namespace {
 
-std::string text(const gchar *value) {
+std::string text_or_empty(const gchar *value) {
     return value ? value : "";
 }
 
@@ -19,19 +20,16 @@ std::shared_ptr<GVariant> shared(GVariant *value) {
     return value ? std::shared_ptr<GVariant>{g_variant_ref_sink(value), g_variant_unref} : nullptr;
 }
 
-struct ObjectUnref {
-    void operator()(gpointer object) const { g_object_unref(object); }
-};
-using Message = std::unique_ptr<GDBusMessage, ObjectUnref>;
+using Message = ObjectRef<GDBusMessage>;
 
 Call read_call(GDBusMessage *message) {
     return {0,
-            text(g_dbus_message_get_path(message)),
-            text(g_dbus_message_get_interface(message)),
-            text(g_dbus_message_get_member(message)),
-            text(g_dbus_message_get_destination(message)),
-            text(g_dbus_message_get_sender(message)),
-            text(g_dbus_message_get_signature(message)),
+            text_or_empty(g_dbus_message_get_path(message)),
+            text_or_empty(g_dbus_message_get_interface(message)),
+            text_or_empty(g_dbus_message_get_member(message)),
+            text_or_empty(g_dbus_message_get_destination(message)),
+            text_or_empty(g_dbus_message_get_sender(message)),
+            text_or_empty(g_dbus_message_get_signature(message)),
             g_dbus_message_get_header(message, G_DBUS_MESSAGE_HEADER_FIELD_SIGNATURE) != nullptr,
             shared(g_dbus_message_get_body(message))};
 }

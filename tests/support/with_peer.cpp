@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "tests/support/with_peer.hpp"
 
+#include "tests/support/glib_ref.hpp"
+
 #include <algorithm>
 
 namespace test {
@@ -8,21 +10,15 @@ namespace {
 
 constexpr const char *kFence = "test.Fence";
 
-struct ObjectUnref {
-    void operator()(gpointer object) const { g_object_unref(object); }
-};
-using Reference = std::unique_ptr<GDBusConnection, ObjectUnref>;
+using Reference = ObjectRef<GDBusConnection>;
 
 } // namespace
 
 SharedConnection::SharedConnection() {
     GError *error = nullptr;
     GDBusConnection *connection = g_bus_get_sync(G_BUS_TYPE_SYSTEM, nullptr, &error);
-    if (!connection) {
-        const std::string why = error->message;
-        g_error_free(error);
-        throw std::runtime_error("the private bus: " + why);
-    }
+    if (!connection)
+        throw_error("the private bus", error);
     g_dbus_connection_set_exit_on_close(connection, FALSE);
     g_weak_ref_init(&weak_, connection);
     g_object_unref(connection);

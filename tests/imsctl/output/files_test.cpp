@@ -2,6 +2,7 @@
 #include "imsctl/output/files.hpp"
 
 #include "imsctl/output/failure.hpp"
+#include "tests/support/files.hpp"
 
 #include <cstdlib>
 #include <fcntl.h>
@@ -18,18 +19,10 @@ namespace fs = std::filesystem;
 
 class WriteFile : public ::testing::Test {
   protected:
-    WriteFile() {
-        std::string pattern = fs::temp_directory_path() / "imsctl-files-XXXXXX";
-        if (mkdtemp(pattern.data()) == nullptr)
-            throw std::runtime_error("no temporary directory");
-        directory_ = pattern;
-    }
-    ~WriteFile() override { fs::remove_all(directory_); }
-
-    std::string path(const char *name) const { return directory_ / name; }
+    std::string path(const char *name) const { return directory_.file(name); }
 
     std::ptrdiff_t files() const {
-        return std::distance(fs::directory_iterator(directory_), fs::directory_iterator());
+        return std::distance(fs::directory_iterator(directory_.path()), fs::directory_iterator());
     }
 
     static std::string failure_of(const std::string &name) {
@@ -44,7 +37,7 @@ class WriteFile : public ::testing::Test {
 
     static constexpr fs::perms kOwnerOnly = fs::perms::owner_read | fs::perms::owner_write;
 
-    fs::path directory_;
+    ::test::TemporaryDirectory directory_;
 };
 
 TEST_F(WriteFile, MakesAFileOfTheOwnersOwn) {
@@ -82,7 +75,7 @@ TEST_F(WriteFile, LeavesTheOldFileAndOthersNewOneWhenItFails) {
 
 TEST_F(WriteFile, FailsWhereNoFileCanBe) {
     EXPECT_THAT(failure_of(path("none/a")), testing::HasSubstr("No such file"));
-    EXPECT_THAT(failure_of(directory_), testing::HasSubstr("Is a directory"));
+    EXPECT_THAT(failure_of(directory_.path()), testing::HasSubstr("Is a directory"));
     EXPECT_EQ(files(), 0);
 }
 

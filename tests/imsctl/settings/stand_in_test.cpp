@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 // Settings, profiles and the network environment from end to end, with the stand-in service.
 #include "tests/imsctl/with_stand_in.hpp"
+#include "tests/support/files.hpp"
 
 #include <filesystem>
-#include <fstream>
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 #include <sys/stat.h>
@@ -13,41 +13,13 @@ namespace {
 
 using testing::HasSubstr;
 
-// A directory that is gone afterwards.
-class Directory {
-  public:
-    Directory() {
-        std::string pattern = std::filesystem::temp_directory_path() / "imsctl-XXXXXX";
-        if (mkdtemp(pattern.data()) == nullptr)
-            throw std::runtime_error("no temporary directory");
-        path_ = pattern;
-    }
-    ~Directory() { std::filesystem::remove_all(path_); }
-    Directory(const Directory &) = delete;
-    Directory &operator=(const Directory &) = delete;
-
-    std::string file(const char *name) const { return path_ / name; }
-
-  private:
-    std::filesystem::path path_;
-};
-
-std::string content_of(const std::string &file) {
-    std::ifstream stream(file);
-    return {std::istreambuf_iterator<char>(stream), {}};
-}
-
-void write(const std::string &file, const std::string &content) {
-    std::ofstream(file) << content;
-}
-
 class Settings : public WithStandIn {
   protected:
     static Json get(const std::string &set) {
         return run_imsctl({"settings", "get", set, "--json"}).json()["settings"];
     }
 
-    Directory directory_;
+    TemporaryDirectory directory_;
 };
 
 TEST_F(Settings, AreShownWithTheirTypes) {
@@ -144,7 +116,7 @@ TEST_F(Settings, SurviveExportAndImport) {
 
 TEST_F(Settings, AreChangedByAFileThatHasAPartOfThem) {
     const std::string file = directory_.file("part.json");
-    write(file, R"({"name": "default", "ringing_timer": 5, "audio_port_end": 1})");
+    put_content(file, R"({"name": "default", "ringing_timer": 5, "audio_port_end": 1})");
     const Outcome outcome = run_imsctl({"settings", "import", file, "--json"});
     EXPECT_EQ(outcome.status, 0);
     EXPECT_EQ(outcome.json()["not_written"], Json({"audio_port_end"}));
@@ -156,18 +128,18 @@ TEST_F(Settings, AreChangedByAFileThatHasAPartOfThem) {
 TEST_F(Settings, ComeFromNoFileThatIsWrong) {
     const Json before = get("default");
     const std::string file = directory_.file("wrong.json");
-    write(file, "{\n\"name\": \"default\",\n\"ringing_timer\": 5,\n\"ringing_timr\": 5\n}");
+    put_content(file, "{\n\"name\": \"default\",\n\"ringing_timer\": 5,\n\"ringing_timr\": 5\n}");
     const Outcome wrong = run_imsctl({"settings", "import", file, "--json"});
     EXPECT_EQ(wrong.status, 1);
     EXPECT_EQ(wrong.json()["error"]["kind"], "input");
     EXPECT_EQ(wrong.json()["error"]["lines"], Json({4}));
-    write(file, R"({"name": "defualt", "ringing_timer": 5})");
+    put_content(file, R"({"name": "defualt", "ringing_timer": 5})");
     EXPECT_THAT(run_imsctl({"settings", "import", file}).error,
                 HasSubstr("the set \"defualt\" cannot be read, and for a new one the file has no "
                           "value for id, network, "));
     EXPECT_THAT(run_imsctl({"settings", "import", file}).error,
                 testing::ContainsRegex(" network(, [a-z_0-9]+){3} and 325 more\n"));
-    write(file, R"({"ringing_timer": 5})");
+    put_content(file, R"({"ringing_timer": 5})");
     EXPECT_THAT(run_imsctl({"settings", "import", file}).error, HasSubstr("there is no \"name\""));
     EXPECT_EQ(get("default").dump(), before.dump());
 }

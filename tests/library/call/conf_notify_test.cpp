@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // CallConfNotifyReceived carries two counts beside its two arrays, and the service may be wrong
 // about them.
+#include "tests/library/call/event_rows.hpp"
 #include "tests/support/with_peer.hpp"
 
 #include <climits>
@@ -10,7 +11,6 @@
 namespace test {
 namespace {
 
-constexpr const char *kInterface = "org.kelvo.ims.Call";
 constexpr std::size_t kLimit = 65536;
 
 // What the callback found.
@@ -38,7 +38,7 @@ class ConfNotify : public WithPeer {
     void send(const Variant &body, std::size_t values, std::size_t texts) {
         readable_values_ = values;
         readable_texts_ = texts;
-        emit(kInterface, "CallConfNotifyReceived", body);
+        emit(kCallEvents.interface, "CallConfNotifyReceived", body);
         fence();
     }
 

@@ -15,8 +15,6 @@ INSTANTIATE_TEST_SUITE_P(Call, Events,
 
 namespace {
 
-constexpr const char *kInterface = kCallEvents.interface;
-
 TEST(CallEventRows, CoverEveryCallNotification) {
     std::set<int> expected{0x223};
     for (int id = 0x201; id <= 0x213; ++id)
@@ -34,7 +32,7 @@ TEST_F(CallNotification, BytesOfAUssdIndicationAreGoneAfterTheCallback) {
         bytes = record.data;
     }};
     listen(IMS_NOTI_CALL_USSD_INDICATION, recorder);
-    emit(kInterface, "CallUssdIndication", parse("(iiis)", "(1, 2, 3, 'aGVsbG8=')"));
+    emit(kCallEvents.interface, "CallUssdIndication", parse("(iiis)", "(1, 2, 3, 'aGVsbG8=')"));
     fence();
     expect_released(bytes);
 }
@@ -45,7 +43,7 @@ TEST_F(CallNotification, TextsStayTheApplicationsAfterTheCallback) {
         text = static_cast<ims_call_error_s *>(event)->text_1;
     }};
     listen(IMS_NOTI_CALL_ERROR, recorder);
-    emit(kInterface, "CallError", parse("(iis)", "(1, 2, 'kept for later')"));
+    emit(kCallEvents.interface, "CallError", parse("(iis)", "(1, 2, 'kept for later')"));
     fence();
     EXPECT_STREQ(text, "kept for later");
     std::free(text);
@@ -56,9 +54,10 @@ TEST_F(CallNotification, TextsThatAreNotBase64DoNoHarm) {
     listen(IMS_NOTI_CALL_USSD_INDICATION, recorder);
     listen(IMS_NOTI_CALL_CHANGE_REQUEST, recorder);
     for (const char *text : {"=", "====", "Q", "QQ", "not base64 at all!", "\xe2\x82\xac", " "}) {
-        emit(kInterface, "CallUssdIndication",
+        emit(kCallEvents.interface, "CallUssdIndication",
              Variant{share(g_variant_new("(iiis)", 1, 2, 3, text))});
-        emit(kInterface, "CallChangeRequest", Variant{share(g_variant_new("(iis)", 1, 2, text))});
+        emit(kCallEvents.interface, "CallChangeRequest",
+             Variant{share(g_variant_new("(iis)", 1, 2, text))});
     }
     fence();
     EXPECT_EQ(recorder.count(IMS_NOTI_CALL_USSD_INDICATION), 7U);
@@ -75,7 +74,8 @@ TEST_F(CallNotification, LargeTextsAreDecodedWhole) {
                   bytes);
     }};
     listen(IMS_NOTI_CALL_USSD_INDICATION, recorder);
-    emit(kInterface, "CallUssdIndication", share(g_variant_new("(iiis)", 1, 2, 3, text)));
+    emit(kCallEvents.interface, "CallUssdIndication",
+         share(g_variant_new("(iiis)", 1, 2, 3, text)));
     g_free(text);
     fence();
     EXPECT_EQ(recorder.count(), 1U);
@@ -84,9 +84,9 @@ TEST_F(CallNotification, LargeTextsAreDecodedWhole) {
 TEST_F(CallNotification, OnlyTheRegisteredKindArrives) {
     NotificationRecorder recorder;
     listen(IMS_NOTI_CALL_ENDED, recorder);
-    emit(kInterface, "CallAlerting", parse("(i)", "(1,)"));
-    emit(kInterface, "CallEnded", parse("(ii)", "(1, 2)"));
-    emit(kInterface, "CallEndedAgain", parse("(ii)", "(1, 2)"));
+    emit(kCallEvents.interface, "CallAlerting", parse("(i)", "(1,)"));
+    emit(kCallEvents.interface, "CallEnded", parse("(ii)", "(1, 2)"));
+    emit(kCallEvents.interface, "CallEndedAgain", parse("(ii)", "(1, 2)"));
     emit("org.kelvo.ims.Sms", "CallEnded", parse("(ii)", "(1, 2)"));
     fence();
     EXPECT_EQ(recorder.count(), 1U);

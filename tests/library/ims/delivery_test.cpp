@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: Apache-2.0
 // When, where and in which order answers and notifications arrive.
+#include "tests/library/ims/notification_table.hpp"
 #include "tests/support/expectations.hpp"
 #include "tests/support/with_peer.hpp"
 
@@ -8,7 +9,6 @@
 namespace test {
 namespace {
 
-constexpr const char *kInterface = "org.kelvo.ims.Call";
 constexpr const char *kHold = "org.kelvo.ims.Call.HoldCall";
 constexpr const char *kResume = "org.kelvo.ims.Call.ResumeCall";
 
@@ -20,7 +20,7 @@ class Delivery : public WithPeer {
     }
 
     void emit_ended(int session) {
-        emit(kInterface, "CallEnded", share(g_variant_new("(ii)", session, 16)));
+        emit(kCall, "CallEnded", share(g_variant_new("(ii)", session, 16)));
     }
 };
 
@@ -228,7 +228,7 @@ TEST_F(Delivery, ANotificationArrivesInTheContextOfItsSubscription) {
     context.reset();
     listen(IMS_NOTI_CALL_ALERTING, here);
     emit_ended(1);
-    emit(kInterface, "CallAlerting", parse("(i)", "(1,)"));
+    emit(kCall, "CallAlerting", parse("(i)", "(1,)"));
     fence();
     EXPECT_EQ(there.count(), 0U);
     EXPECT_EQ(here.count(), 1U);
@@ -251,7 +251,7 @@ TEST_F(Delivery, AHandleWorksWhollyInAnotherThread) {
         ResponseRecorder recorder;
         ASSERT_EQ(ims_call_hold_call(handle, 7, ResponseRecorder::callback, &recorder),
                   IMS_ERROR_NONE);
-        peer().emit_signal("/org/kelvo/ims/sub5", kInterface, "CallEnded", parse("(ii)", "(1, 2)"));
+        peer().emit_signal("/org/kelvo/ims/sub5", kCall, "CallEnded", parse("(ii)", "(1, 2)"));
         pump_until([&] { return recorder.count() == 1 && signals.count() == 1; },
                    "answer and signal in the thread", context.get());
         EXPECT_EQ(ims_deinit(handle), IMS_ERROR_NONE);
@@ -264,8 +264,8 @@ TEST_F(Delivery, SignalsOfOthersAreNotDelivered) {
     NotificationRecorder recorder;
     listen(IMS_NOTI_CALL_ENDED, recorder);
     BusClient foreign{bus().address()};
-    foreign.emit_signal(kPath, kInterface, "CallEnded", parse("(ii)", "(1, 2)"));
-    foreign.emit_signal(kPath, kInterface, "CallEnded", parse("(ii)", "(1, 2)"),
+    foreign.emit_signal(kPath, kCall, "CallEnded", parse("(ii)", "(1, 2)"));
+    foreign.emit_signal(kPath, kCall, "CallEnded", parse("(ii)", "(1, 2)"),
                         shared().unique_name().c_str());
     foreign.settle();
     fence();
@@ -281,7 +281,7 @@ TEST_F(Delivery, SignalsOfOtherSlotsAreNotDelivered) {
     listen(IMS_NOTI_CALL_ENDED, recorder);
     for (const char *path : {"/org/kelvo/ims/sub0", "/org/kelvo/ims/sub33", "/org/kelvo/ims",
                              "/org/kelvo/ims/sub3/call1", "/"})
-        peer().emit_signal(path, kInterface, "CallEnded", parse("(ii)", "(1, 2)"));
+        peer().emit_signal(path, kCall, "CallEnded", parse("(ii)", "(1, 2)"));
     fence();
     EXPECT_EQ(recorder.count(), 0U);
     EXPECT_TRUE(take_log().empty());
@@ -313,7 +313,7 @@ TEST_F(Delivery, HandlesOfTwoSlotsReceiveTheirOwnSignals) {
     NotificationRecorder four;
     listen(handle_, IMS_NOTI_CALL_ENDED, three);
     listen(other, IMS_NOTI_CALL_ENDED, four);
-    peer().emit_signal("/org/kelvo/ims/sub4", kInterface, "CallEnded", parse("(ii)", "(1, 2)"));
+    peer().emit_signal("/org/kelvo/ims/sub4", kCall, "CallEnded", parse("(ii)", "(1, 2)"));
     fence();
     EXPECT_EQ(three.count(), 0U);
     EXPECT_EQ(four.count(), 1U);

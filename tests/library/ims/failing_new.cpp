@@ -6,22 +6,21 @@
 
 bool out_of_memory = false;
 
-#define TEST_EXPORT __attribute__((visibility("default")))
-
-TEST_EXPORT void *operator new(std::size_t size, const std::nothrow_t &) noexcept {
+[[gnu::visibility("default")]] void *operator new(std::size_t size,
+                                                  const std::nothrow_t &) noexcept {
     return out_of_memory ? nullptr : std::malloc(size);
 }
-TEST_EXPORT void *operator new(std::size_t size) {
+[[gnu::visibility("default")]] void *operator new(std::size_t size) {
     if (void *memory = std::malloc(size))
         return memory;
     throw std::bad_alloc{};
 }
-TEST_EXPORT void operator delete(void *memory) noexcept {
+[[gnu::visibility("default")]] void operator delete(void *memory) noexcept {
     std::free(memory);
 }
-TEST_EXPORT void operator delete(void *memory, std::size_t) noexcept {
+[[gnu::visibility("default")]] void operator delete(void *memory, std::size_t) noexcept {
     std::free(memory);
 }
-TEST_EXPORT void operator delete(void *memory, const std::nothrow_t &) noexcept {
+[[gnu::visibility("default")]] void operator delete(void *memory, const std::nothrow_t &) noexcept {
     std::free(memory);
 }

@@ -2,12 +2,11 @@
 // The host's feature query and logger. The query reads its file once in a process, so each answer
 // is had from a process of its own.
 #include "platform.h"
+#include "tests/support/files.hpp"
 
 #include <gtest/gtest.h>
 
 #include <cstdlib>
-#include <filesystem>
-#include <fstream>
 #include <string>
 
 namespace {
@@ -20,20 +19,14 @@ class HostPlatform : public ::testing::Test {
   protected:
     void SetUp() override {
         GTEST_FLAG_SET(death_test_style, "threadsafe");
-        std::string pattern = "/tmp/ims-test-XXXXXX";
-        ASSERT_NE(mkdtemp(pattern.data()), nullptr);
-        directory_ = pattern;
         setenv("KELVO_IMS_FEATURE_FILE", path().c_str(), 1);
     }
 
-    void TearDown() override {
-        unsetenv("KELVO_IMS_FEATURE_FILE");
-        std::filesystem::remove_all(directory_);
-    }
+    void TearDown() override { unsetenv("KELVO_IMS_FEATURE_FILE"); }
 
-    std::string path() const { return directory_ + "/features.conf"; }
+    std::string path() const { return directory_.file("features.conf"); }
 
-    void write(const std::string &text) const { std::ofstream{path()} << text; }
+    void write(const std::string &text) const { test::put_content(path(), text); }
 
     // For EXPECT_EXIT: the answer as the exit status.
     [[noreturn]] static void exit_with_answer(const char *key) {
@@ -44,7 +37,7 @@ class HostPlatform : public ::testing::Test {
     }
 
   private:
-    std::string directory_;
+    test::TemporaryDirectory directory_;
 };
 
 TEST_F(HostPlatform, TheFeatureIsOnWithoutAFile) {

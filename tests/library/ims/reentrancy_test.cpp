@@ -1,13 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
 // Ending notifications and releasing the handle inside a callback, with more signals waiting.
+#include "tests/library/ims/notification_table.hpp"
 #include "tests/support/with_peer.hpp"
 
 #include <optional>
 
 namespace test {
 namespace {
-
-constexpr const char *kInterface = "org.kelvo.ims.Call";
 
 class Reentrancy : public WithPeer {
   protected:
@@ -19,8 +18,8 @@ class Reentrancy : public WithPeer {
     // Three of each kind, none delivered yet.
     void queue_signals() {
         for (int i = 1; i <= 3; ++i) {
-            emit(kInterface, "CallEnded", share(g_variant_new("(ii)", i, 16)));
-            emit(kInterface, "CallAlerting", share(g_variant_new("(i)", i)));
+            emit(kCall, "CallEnded", share(g_variant_new("(ii)", i, 16)));
+            emit(kCall, "CallAlerting", share(g_variant_new("(i)", i)));
         }
         queue_up();
     }
@@ -106,7 +105,7 @@ TEST_F(Reentrancy, SetAfterUnsetInACallbackHearsWhatComesAfterwards) {
     queue_signals();
     fence();
     shared().settle();
-    emit(kInterface, "CallEnded", parse("(ii)", "(9, 16)"));
+    emit(kCall, "CallEnded", parse("(ii)", "(9, 16)"));
     fence();
     EXPECT_EQ(first.count(), 1U);
     ASSERT_FALSE(heard.empty());
@@ -121,10 +120,10 @@ TEST_F(Reentrancy, SetOfAnotherKindInACallbackWorks) {
                   IMS_ERROR_NONE);
     }};
     listen(IMS_NOTI_CALL_ENDED, ended);
-    emit(kInterface, "CallEnded", parse("(ii)", "(1, 16)"));
+    emit(kCall, "CallEnded", parse("(ii)", "(1, 16)"));
     fence();
     shared().settle();
-    emit(kInterface, "CallAlerting", parse("(i)", "(1,)"));
+    emit(kCall, "CallAlerting", parse("(i)", "(1,)"));
     fence();
     EXPECT_EQ(ended.count(), 1U);
     EXPECT_EQ(alerting.count(), 1U);

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // The signal callback called as the bus never calls it, and a table that fails.
 #include "src/notifications.hpp"
+#include "tests/library/ims/notification_table.hpp"
 #include "tests/support/bus_observer.hpp"
 #include "tests/support/expectations.hpp"
 #include "tests/support/with_peer.hpp"
@@ -13,8 +14,6 @@ namespace {
 // Removals from this one fail.
 GHashTable *failing_table = nullptr;
 
-constexpr const char *kInterface = "org.kelvo.ims.Call";
-
 class Routing : public WithPeer {
   protected:
     void SetUp() override {
@@ -26,7 +25,7 @@ class Routing : public WithPeer {
     void route(void *user_data) {
         const GDBusSignalCallback callback = observed_subscriptions().at(0).callback;
         const Variant parameters = parse("(ii)", "(3, 16)");
-        callback(nullptr, ":1.1", kPath, kInterface, "CallEnded", parameters.get(), user_data);
+        callback(nullptr, ":1.1", kPath, kCall, "CallEnded", parameters.get(), user_data);
     }
 
     // What the bus keeps for it.

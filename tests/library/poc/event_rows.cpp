@@ -31,7 +31,7 @@ void expect_peer(const ims_poc_peer_info_s *peer, const ims_poc_peer_info_s &exp
 }
 
 // The two parties of the rows below.
-constexpr ims_poc_peer_info_s kA{1, "sip:a@example.org", "Zo\xc3\xab", false, nullptr};
+constexpr ims_poc_peer_info_s kPeerA{1, "sip:a@example.org", "Zo\xc3\xab", false, nullptr};
 constexpr ims_poc_peer_info_s kGroup{-2, "sip:group@example.org", nullptr, true, nullptr};
 #define PEER_A                                                                                     \
     "{'uri_type': <int64 1>, 'uri': <'sip:a@example.org'>, 'display_name': <'Zo\xc3\xab'>, "       \
@@ -73,7 +73,7 @@ void is_established(const void *event) {
     expect_set(call.int_set_1, {1, 2, 3, 4});
     EXPECT_EQ(call.flag_3, Flag);
     expect_set(call.int_set_2, {5, 6, 7, 8});
-    expect_peer(call.peer, kA);
+    expect_peer(call.peer, kPeerA);
 }
 
 void is_ended(const void *event) {
@@ -151,7 +151,7 @@ void is_participant_info(const void *event) {
 void is_incoming_msg(const void *event) {
     const auto &message = as<ims_poc_incoming_msg_s>(event);
     EXPECT_EQ(message.value_1, 1);
-    expect_peer(message.peer_1, kA);
+    expect_peer(message.peer_1, kPeerA);
     EXPECT_STREQ(message.text_1, "one");
     EXPECT_EQ(message.value_2, 2);
     EXPECT_STREQ(message.text_2, "two");
@@ -175,7 +175,7 @@ void is_incoming_msg(const void *event) {
 void is_msg_notification(const void *event) {
     const auto &notification = as<ims_poc_msg_event_s>(event);
     EXPECT_EQ(notification.value_1, 1);
-    expect_peer(notification.peer_1, kA);
+    expect_peer(notification.peer_1, kPeerA);
     EXPECT_STREQ(notification.text_1, "one");
     EXPECT_EQ(notification.value_2, 2);
     EXPECT_EQ(notification.value_3, -3);
@@ -185,7 +185,7 @@ void is_msg_notification(const void *event) {
 void is_incoming_file(const void *event) {
     const auto &transfer = as<ims_poc_incoming_file_s>(event);
     EXPECT_EQ(transfer.value_1, 1);
-    expect_peer(transfer.peer_1, kA);
+    expect_peer(transfer.peer_1, kPeerA);
     ASSERT_NE(transfer.attributes, nullptr);
     const ims_poc_file_attributes_s &file = *transfer.attributes;
     EXPECT_STREQ(file.file_name, "map.png");

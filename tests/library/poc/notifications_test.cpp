@@ -20,17 +20,17 @@ TEST(PocEventRows, CoverEveryPushToTalkNotification) {
     EXPECT_EQ(ids_of(poc_event_rows()), expected);
 }
 
-using Set = std::array<std::int32_t, IMS_POC_INT_SET_SIZE>;
+using FourNumbers = std::array<std::int32_t, IMS_POC_INT_SET_SIZE>;
 
 class PocNotification : public WithPeer {
   protected:
     // What becomes of this set in a modification.
-    void expect_set(const char *boxed, const Set &expected) {
+    void expect_set(const char *boxed, const FourNumbers &expected) {
         SCOPED_TRACE(boxed);
         NotificationRecorder recorder{[&](const Notified &, void *event) {
             const auto &modify = *static_cast<ims_poc_modify_request_s *>(event);
             EXPECT_EQ(std::to_array(modify.int_set_1), expected);
-            EXPECT_EQ(std::to_array(modify.int_set_2), (Set{5, 6, 7, 8}));
+            EXPECT_EQ(std::to_array(modify.int_set_2), (FourNumbers{5, 6, 7, 8}));
         }};
         listen(IMS_NOTI_POC_CALL_MODIFY_REQUEST, recorder);
         emit(kPocEvents.interface, "PocCallModifyRequest",

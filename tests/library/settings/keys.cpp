@@ -8,7 +8,7 @@
 namespace test {
 namespace {
 
-const KeyRow kSettings[] = {
+const KeyRow kSettingsKeys[] = {
     {"id", 'i', offsetof(ims_global_settings_s, id)},
     {"name", 's', offsetof(ims_global_settings_s, name)},
     {"network", 's', offsetof(ims_global_settings_s, network)},
@@ -377,7 +377,7 @@ const KeyRow kSettings[] = {
     {"conference_factory_uri", 's', offsetof(ims_global_settings_s, conference_factory_uri)},
 };
 
-const KeyRow kProfile[] = {
+const KeyRow kProfileKeys[] = {
     {"id", 'i', offsetof(ims_profile_s, id)},
     {"enabled", 'i', offsetof(ims_profile_s, enabled)},
     {"name", 's', offsetof(ims_profile_s, name)},
@@ -434,11 +434,11 @@ const KeyRow kProfile[] = {
 } // namespace
 
 std::span<const KeyRow> settings_keys() {
-    return kSettings;
+    return kSettingsKeys;
 }
 
 std::span<const KeyRow> profile_keys() {
-    return kProfile;
+    return kProfileKeys;
 }
 
 } // namespace test

@@ -8,7 +8,7 @@
 namespace test {
 namespace {
 
-constexpr Module kModule{.unit = "ims_settings.cpp", .interface = "org.kelvo.ims.Settings"};
+constexpr Module kSettings{.unit = "ims_settings.cpp", .interface = "org.kelvo.ims.Settings"};
 
 template <typename Record>
 Record filled(std::span<const KeyRow> keys) {
@@ -17,8 +17,8 @@ Record filled(std::span<const KeyRow> keys) {
     return record;
 }
 
-const ims_global_settings_s kSet = filled<ims_global_settings_s>(settings_keys());
-const ims_profile_s kProfile = filled<ims_profile_s>(profile_keys());
+const ims_global_settings_s kSampleSet = filled<ims_global_settings_s>(settings_keys());
+const ims_profile_s kSampleProfile = filled<ims_profile_s>(profile_keys());
 
 constexpr std::int32_t kEnvironment = 3;
 const char *const kSetName = "a set";
@@ -70,33 +70,33 @@ std::vector<BadText> bad_profiles() {
 
 std::vector<RequestRow> settings_request_rows() {
     std::vector<RequestRow> rows{
-        {.function = request<ims_update_global_settings, kSet>(),
+        {.function = request<ims_update_global_settings, kSampleSet>(),
          .method = "UpdateGlobalSettings",
          .type = "(a{sv})",
          .arguments = written_settings(Direction::kUpdate),
          .bad_texts = bad_sets()},
-        {.function = request<ims_add_global_settings, kSet>(),
+        {.function = request<ims_add_global_settings, kSampleSet>(),
          .method = "AddGlobalSettings",
          .type = "(a{sv})",
          .arguments = written_settings(Direction::kAdd),
          .bad_texts = bad_sets()},
-        {.function = request<ims_delete_global_settings, kSet>(),
+        {.function = request<ims_delete_global_settings, kSampleSet>(),
          .method = "DeleteGlobalSettings",
          .type = "(s)",
          .arguments = "('text 2',)",
          .checked = Checked::kHandle,
          .bad_texts = {bad_text<&ims_global_settings_s::name>()}},
-        {.function = request<ims_update_profile, kProfile>(),
+        {.function = request<ims_update_profile, kSampleProfile>(),
          .method = "UpdateProfile",
          .type = "(a{sv})",
          .arguments = written_profile(),
          .bad_texts = bad_profiles()},
-        {.function = request<ims_add_profile, kProfile>(),
+        {.function = request<ims_add_profile, kSampleProfile>(),
          .method = "AddProfile",
          .type = "(a{sv})",
          .arguments = written_profile(),
          .bad_texts = bad_profiles()},
-        {.function = request<ims_delete_profile, kProfile>(),
+        {.function = request<ims_delete_profile, kSampleProfile>(),
          .method = "DeleteProfile",
          .type = "(i)",
          .arguments = "(-68999,)",
@@ -109,7 +109,7 @@ std::vector<RequestRow> settings_request_rows() {
     // The handlers of the whole unit carry its name, which the functions do not.
     for (RequestRow &row : rows)
         row.handler = "on_response_settings_" + without_prefix(row.function.name);
-    return requests_of(kModule, rows);
+    return requests_of(kSettings, rows);
 }
 
 std::vector<QueryRow> settings_query_rows() {
@@ -129,7 +129,7 @@ std::vector<QueryRow> settings_query_rows() {
          .refused_reply = "(6, 1, [{'id': <1>}])",
          .refused_message = "Failed to get profile Info: 6"},
     };
-    return queries_of(kModule, rows);
+    return queries_of(kSettings, rows);
 }
 
 } // namespace test

@@ -4,7 +4,7 @@
 namespace test {
 namespace {
 
-constexpr ims_ss_query_s kQuery{1, 2};
+constexpr ims_ss_query_s kAsked{1, 2};
 
 constexpr const char *kWaitingKeys[] = {"ss_class", "ss_status"};
 constexpr const char *kForwardingKeys[] = {"ss_class",      "ss_status",     "cf_type",
@@ -27,7 +27,7 @@ const Service kServices[] = {
      "Failed to get forwarding status: ", "Forwarding status list count is NOT valid - Count: ",
      kForwardingKeys, true,
      [](ims_h handle, ims_response_cb callback, void *user_data) {
-         return ims_ss_get_call_forwarding(handle, &kQuery, callback, user_data);
+         return ims_ss_get_call_forwarding(handle, &kAsked, callback, user_data);
      },
      [](const ims_ss_status_list_s &list) -> const void * { return list.entries.call_forwarding; },
      [](const ims_ss_status_list_s &list, std::size_t at) {
@@ -40,7 +40,7 @@ const Service kServices[] = {
      "Failed to get barring status: ", "Barring status list count is NOT valid - Count: ",
      kBarringKeys, false,
      [](ims_h handle, ims_response_cb callback, void *user_data) {
-         return ims_ss_get_call_barring(handle, &kQuery, callback, user_data);
+         return ims_ss_get_call_barring(handle, &kAsked, callback, user_data);
      },
      [](const ims_ss_status_list_s &list) -> const void * { return list.entries.call_barring; },
      [](const ims_ss_status_list_s &list, std::size_t at) {

@@ -10,7 +10,7 @@ namespace {
 
 using SsDeathTest = UnguardedTest;
 
-constexpr ims_ss_cw_info_s kWaiting{1, 2};
+constexpr ims_ss_cw_info_s kSomeWaiting{1, 2};
 
 TEST_F(SsDeathTest, SetCallWaitingWithANullRecordIsNotGuarded) {
     ims_client_s client{};
@@ -18,7 +18,7 @@ TEST_F(SsDeathTest, SetCallWaitingWithANullRecordIsNotGuarded) {
 }
 
 TEST_F(SsDeathTest, SetCallWaitingWithANullHandleIsNotGuarded) {
-    EXPECT_DEATH(ims_ss_set_call_waiting(nullptr, &kWaiting, nullptr, nullptr), "");
+    EXPECT_DEATH(ims_ss_set_call_waiting(nullptr, &kSomeWaiting, nullptr, nullptr), "");
 }
 
 TEST_F(SsDeathTest, GetCallWaitingWithANullHandleIsNotGuarded) {

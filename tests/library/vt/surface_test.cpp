@@ -30,20 +30,20 @@ INSTANTIATE_TEST_SUITE_P(Vt, Surfaces,
                                            Surface{"Far", ims_vt_set_far_end_surface}),
                          [](const auto &tested) { return tested.param.name; });
 
-constexpr std::int32_t kEntries[] = {INT_MIN, -1, 0, INT_MAX};
+constexpr std::int32_t kExtremes[] = {INT_MIN, -1, 0, INT_MAX};
 
 TEST_P(Surfaces, SendTheFirstEntriesInTheirOrder) {
-    expect({7, 4, kEntries}, "(7, 4, <[-2147483648, -1, 0, 2147483647]>)");
-    expect({7, 2, kEntries}, "(7, 2, <[-2147483648, -1]>)");
+    expect({7, 4, kExtremes}, "(7, 4, <[-2147483648, -1, 0, 2147483647]>)");
+    expect({7, 2, kExtremes}, "(7, 2, <[-2147483648, -1]>)");
 }
 
 TEST_P(Surfaces, OfCountNoneSendAnEmptyArray) {
-    expect({7, 0, kEntries}, "(7, 0, <@ai []>)");
+    expect({7, 0, kExtremes}, "(7, 0, <@ai []>)");
     expect({7, 0, nullptr}, "(7, 0, <@ai []>)");
 }
 
 TEST_P(Surfaces, OfANegativeCountSendAnEmptyArrayAndTheCountAsItIs) {
-    expect({7, -1, kEntries}, "(7, -1, <@ai []>)");
+    expect({7, -1, kExtremes}, "(7, -1, <@ai []>)");
     expect({7, INT_MIN, nullptr}, "(7, -2147483648, <@ai []>)");
 }
 

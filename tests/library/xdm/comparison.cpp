@@ -171,7 +171,7 @@ void expect_same(const ims_xdm_group_rule_s &sent, const ims_xdm_group_rule_s &r
 
 } // namespace
 
-void expect_same(const ims_xdm_group_info_s &sent, const ims_xdm_group_info_s &received) {
+void expect_same_document(const ims_xdm_group_info_s &sent, const ims_xdm_group_info_s &received) {
     EXPECT_STREQ(sent.group_uri, received.group_uri);
     EXPECT_STREQ(sent.channel_id, received.channel_id);
     EXPECT_STREQ(sent.version, received.version);

@@ -40,7 +40,7 @@ TEST_F(RoundTrip, KeepsAnyDocument) {
         ResponseRecorder fetched{[&group](const Response &response, void *data) {
             ASSERT_EQ(response.result, 0);
             ASSERT_NE(data, nullptr);
-            expect_same(group, *static_cast<ims_xdm_group_info_s *>(data));
+            expect_same_document(group, *static_cast<ims_xdm_group_info_s *>(data));
         }};
         ASSERT_EQ(ims_xdm_fetch_shared_group(handle_, &group, ResponseRecorder::callback, &fetched),
                   IMS_ERROR_NONE);

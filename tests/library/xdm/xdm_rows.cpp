@@ -31,17 +31,18 @@ void expect_the_group(void *data) {
 
 // The parts that a spoilt record points to have to last as long as the call.
 std::vector<BadText> bad_documents() {
-    using Group = ims_xdm_group_info_s;
-    return {spoilt<Group>("group_uri", [](Group &group) { set_inline(group.group_uri, kNotUtf8); }),
-            bad_text<&Group::channel_id>(),
-            spoilt<Group>("a reference of the members",
-                          [](Group &group) {
-                              static char *references[] = {text("good"), text(kNotUtf8)};
-                              static ims_xdm_member_list_s members = kMembers;
-                              members.entry_ref = references;
-                              group.group_member_list = &members;
-                          }),
-            spoilt<Group>("a rank of an identity of a rule", [](Group &group) {
+    using Document = ims_xdm_group_info_s;
+    return {spoilt<Document>("group_uri",
+                             [](Document &group) { set_inline(group.group_uri, kNotUtf8); }),
+            bad_text<&Document::channel_id>(),
+            spoilt<Document>("a reference of the members",
+                             [](Document &group) {
+                                 static char *references[] = {text("good"), text(kNotUtf8)};
+                                 static ims_xdm_member_list_s members = kMembers;
+                                 members.entry_ref = references;
+                                 group.group_member_list = &members;
+                             }),
+            spoilt<Document>("a rank of an identity of a rule", [](Document &group) {
                 static ims_xdm_member_entry_s member = kAlice;
                 member.status.rank = text(kNotUtf8);
                 static ims_xdm_identity_entries_s entries{&member, 1};

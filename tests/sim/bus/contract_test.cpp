@@ -2,10 +2,9 @@
 // What the running stand-in says about itself is what the contract's files say, and every method
 // that it names answers in the type that it names.
 #include "tests/sim/bus/bus_client.hpp"
+#include "tests/support/files.hpp"
 
 #include <filesystem>
-#include <fstream>
-#include <iterator>
 
 namespace sim::test {
 namespace {
@@ -23,8 +22,7 @@ class BusContract : public Served {
 
 // The interface as its file has it, with every comment.
 std::string interface_of(const std::filesystem::path &path) {
-    std::ifstream file(path);
-    const std::string text{std::istreambuf_iterator<char>(file), {}};
+    const std::string text = ::test::content_of(path);
     const std::string begin = "<node>\n";
     const auto from = text.find(begin) + begin.size();
     return text.substr(from, text.find("</node>") - from);

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 // The program itself: its two commands, their exit statuses and what they leave behind.
 #include "tests/sim/bus/bus_client.hpp"
+#include "tests/support/files.hpp"
 
 #include <csignal>
 #include <filesystem>
@@ -180,16 +181,14 @@ TEST(Run, EndsWhatTheCommandLeftRunning) {
 }
 
 TEST(Run, KeepsNothingInTheFileSystem) {
-    std::string pattern = (std::filesystem::temp_directory_path() / "sim-test-XXXXXX").string();
-    const std::filesystem::path directory = mkdtemp(pattern.data());
+    const ::test::TemporaryDirectory directory;
     Program program({"run", "--", "sh", "-c", "echo here; read x"},
-                    {{"TMPDIR", directory.string()}, {"XDG_RUNTIME_DIR", directory.string()}});
+                    {{"TMPDIR", directory.path()}, {"XDG_RUNTIME_DIR", directory.path()}});
     program.read_line();
-    EXPECT_TRUE(std::filesystem::is_empty(directory));
+    EXPECT_TRUE(std::filesystem::is_empty(directory.path()));
     program.close_input();
     program.wait();
-    EXPECT_TRUE(std::filesystem::is_empty(directory));
-    std::filesystem::remove(directory);
+    EXPECT_TRUE(std::filesystem::is_empty(directory.path()));
 }
 
 TEST(Run, ManyAtOnceDoNotMeet) {
