@@ -7,6 +7,7 @@
 #include <gtest/gtest.h>
 
 #include <cstdlib>
+#include <filesystem>
 #include <string>
 
 namespace {
@@ -29,9 +30,11 @@ class HostPlatform : public ::testing::Test {
     void write(const std::string &text) const { test::put_content(path(), text); }
 
     // For EXPECT_EXIT: the answer as the exit status.
-    [[noreturn]] static void exit_with_answer(const char *key) {
+    [[noreturn]] void exit_with_answer(const char *key) const {
         bool enabled = false;
-        if (system_info_get_custom_bool(key, &enabled) != 0)
+        const bool is_known = system_info_get_custom_bool(key, &enabled) == 0;
+        std::filesystem::remove_all(directory_.path()); // exit() ends no fixture
+        if (!is_known)
             std::exit(kFailed);
         std::exit(enabled ? kOn : kOff);
     }
