@@ -1,6 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "sim/network.hpp"
 
+#include "sim/group/store.hpp"
+#include "sim/settings/store.hpp"
+
 #include <utility>
 
 namespace sim {
@@ -25,6 +28,15 @@ Network::Network(NetworkOptions options, Timers &timers, const NetworkSinks &sin
     registrations.when_lost([this](int slot) { take_away(slot); });
     registrations.when_registered([this](int slot) { centre.deliver_stored(slot); });
     ptt_directory.add_groups([this](std::string_view uri) { return groups.participants_of(uri); });
+}
+
+std::optional<std::string> Network::keep_in(const std::string &directory) {
+    const auto store = Store::open(directory);
+    if (!store)
+        return store.refusal().reason;
+    if (auto error = keep_settings(*store, settings))
+        return error;
+    return keep_groups(*store, groups);
 }
 
 // What a slot loses with its radio, in the order in which it is told.

@@ -20,6 +20,7 @@
 
 #include <chrono>
 #include <cstdint>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -45,6 +46,10 @@ struct Network {
     Network(NetworkOptions options, Timers &timers, const NetworkSinks &sinks);
     Network(const Network &) = delete;
     Network &operator=(const Network &) = delete;
+
+    // Gives the models what is kept in a directory and keeps their changes there. What went wrong,
+    // or nothing.
+    std::optional<std::string> keep_in(const std::string &directory);
 
     NumberPlan plan;
     Registrations registrations;

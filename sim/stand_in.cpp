@@ -2,8 +2,6 @@
 #include "sim/stand_in.hpp"
 
 #include "sim/call/signals.hpp"
-#include "sim/group/store.hpp"
-#include "sim/settings/store.hpp"
 
 #include <ctime>
 
@@ -55,14 +53,7 @@ StandIn::StandIn(const Options &options, const Log &log, MainLoop &loop)
 }
 
 std::optional<std::string> StandIn::restore(const std::string &state_directory) {
-    if (state_directory.empty())
-        return std::nullopt;
-    const auto store = Store::open(state_directory);
-    if (!store)
-        return store.refusal().reason;
-    if (auto error = keep_settings(*store, network_.settings))
-        return error;
-    return keep_groups(*store, network_.groups);
+    return state_directory.empty() ? std::nullopt : network_.keep_in(state_directory);
 }
 
 std::optional<std::string> StandIn::start(const std::string &address,
