@@ -1,75 +1,50 @@
 // SPDX-License-Identifier: Apache-2.0
-// What slots receive: at once, or once they are there again.
-#include "sim/sms/service_centre.hpp"
+#include "sim/sms/mailbox.hpp"
 
+#include <algorithm>
 #include <iterator>
 
 namespace sim {
 
-namespace {
-
-constexpr std::chrono::seconds kReportTime{30};
-
-IncomingKind kind_of(const std::variant<tpdu::Deliver, tpdu::StatusReport> &content) {
-    return std::holds_alternative<tpdu::Deliver>(content) ? IncomingKind::kMessage
-                                                          : IncomingKind::kStatusReport;
+void Mailbox::store_first(std::vector<Mail> mails) {
+    stored_.insert(stored_.begin(), std::make_move_iterator(mails.begin()),
+                   std::make_move_iterator(mails.end()));
 }
 
-} // namespace
-
-void ServiceCentre::post(int slot, Mail mail) {
-    if (registrations_.registered(slot))
-        deliver(slot, std::move(mail));
-    else
-        boxes_[slot].stored.push_back(std::move(mail));
+std::optional<Mail> Mailbox::take_stored() {
+    if (stored_.empty())
+        return std::nullopt;
+    Mail mail = std::move(stored_.front());
+    stored_.pop_front();
+    return mail;
 }
 
-void ServiceCentre::deliver(int slot, Mail mail) {
-    Mailbox &here = boxes_[slot];
-    const std::int32_t number = here.next_received++;
-    const bool more = mail.more_follow || !here.stored.empty();
-    const auto octets = std::visit(
-        [&](auto &content) {
-            content.more_messages = more;
-            return tpdu::encode(content).value();
-        },
-        mail.content);
-    const IncomingKind kind = kind_of(mail.content);
-    mail.patience = timers_.after_unscaled(kReportTime, [this, slot, number] {
-        const auto node = boxes_[slot].delivered.extract(number);
-        if (node.mapped().message)
-            conclude(*node.mapped().message, message_status::kNoResponse);
-    });
-    here.delivered.emplace(number, std::move(mail));
-    sink_(slot, IncomingSms{octets, number, kind});
+void Mailbox::await_report(std::int32_t number, Mail mail) {
+    delivered_.emplace(number, std::move(mail));
 }
 
-void ServiceCentre::deliver_stored(int slot) {
-    auto &stored = boxes_[slot].stored;
-    while (!stored.empty()) {
-        Mail mail = std::move(stored.front());
-        stored.pop_front();
-        deliver(slot, std::move(mail));
-    }
+std::optional<std::pair<std::int32_t, Mail>> Mailbox::take_delivered(std::int32_t number) {
+    auto node = number == 0 && !delivered_.empty() ? delivered_.extract(delivered_.begin())
+                                                   : delivered_.extract(number);
+    if (node.empty())
+        return std::nullopt;
+    return std::pair(node.key(), std::move(node.mapped()));
 }
 
-// The device may have lost what it has not reported on.
-void ServiceCentre::take_back(int slot) {
-    Mailbox &here = boxes_[slot];
-    auto delivered = std::exchange(here.delivered, {});
-    std::deque<Mail> again;
-    for (auto &[number, mail] : delivered) {
-        mail.patience.cancel();
-        if (kind_of(mail.content) == IncomingKind::kStatusReport)
-            continue;
-        const bool expired = mail.message && !held_.at(*mail.message).expiry.pending();
-        if (expired)
-            conclude(*mail.message, message_status::kExpired);
-        else
-            again.push_back(std::move(mail));
-    }
-    here.stored.insert(here.stored.begin(), std::make_move_iterator(again.begin()),
-                       std::make_move_iterator(again.end()));
+std::vector<Mail> Mailbox::take_all_delivered() {
+    std::vector<Mail> mails;
+    for (auto &[number, mail] : std::exchange(delivered_, {}))
+        mails.push_back(std::move(mail));
+    return mails;
+}
+
+bool Mailbox::has_delivered(MessageId message) const {
+    return std::ranges::any_of(delivered_,
+                               [&](const auto &entry) { return entry.second.message == message; });
+}
+
+void Mailbox::discard_stored(MessageId message) {
+    std::erase_if(stored_, [&](const Mail &mail) { return mail.message == message; });
 }
 
 } // namespace sim

@@ -1,8 +1,9 @@
 // SPDX-License-Identifier: Apache-2.0
-// What slots ask of the service centre, and what becomes of the messages that they send.
 #include "sim/sms/service_centre.hpp"
 
 #include <algorithm>
+#include <utility>
+#include <vector>
 
 namespace sim {
 
@@ -15,6 +16,7 @@ constexpr auto kForwardTime = 200ms;
 constexpr auto kPartyTime = 500ms;
 constexpr auto kStatusReportTime = 200ms;
 constexpr auto kEchoTime = 1s;
+constexpr auto kReportTime = 30s;
 constexpr auto kDefaultLifetime = std::chrono::hours(48);
 
 constexpr SubmitRefusal kDuplicate{21, 0xC5, false};
@@ -57,7 +59,7 @@ bool single_shot(const tpdu::Validity &validity) {
 ServiceCentre::ServiceCentre(const NumberPlan &plan, Timers &timers,
                              const Registrations &registrations, std::int64_t epoch, Sink sink)
     : plan_(plan), timers_(timers), registrations_(registrations), epoch_(epoch),
-      sink_(std::move(sink)), boxes_(plan.slots()), errands_(timers) {}
+      sink_(std::move(sink)), next_sent_(plan.slots(), 1), boxes_(plan.slots()), errands_(timers) {}
 
 std::int64_t ServiceCentre::now_in_seconds() const {
     // The end of what a TPDU can say; a network that is fast enough gets there.
@@ -93,7 +95,7 @@ Answer<SubmitReceipt> ServiceCentre::submit(int slot, const SubmitRequest &reque
     Message &message = held_[id];
     message.id = id;
     message.sender = slot;
-    message.number = boxes_[slot].next_sent++;
+    message.number = next_sent_[slot]++;
     message.submit = *submit;
     message.more_follow = request.option == 1;
     message.taken = now();
@@ -225,10 +227,9 @@ void ServiceCentre::send_from_network(int slot, tpdu::Deliver message) {
 void ServiceCentre::expire(Id id) {
     for (auto &mailbox : boxes_) {
         // Once delivered, its fate is the receiver's to tell.
-        const auto is_it = [&](const auto &entry) { return entry.second.message == id; };
-        if (std::ranges::any_of(mailbox.delivered, is_it))
+        if (mailbox.has_delivered(id))
             return;
-        std::erase_if(mailbox.stored, [&](const Mail &mail) { return mail.message == id; });
+        mailbox.discard_stored(id);
     }
     conclude(id, message_status::kExpired);
 }
@@ -263,19 +264,66 @@ Answer<std::int32_t> ServiceCentre::report(int slot, const ReportRequest &reques
         if (const auto decoded = tpdu::decode_deliver_report(request.tpdu, kind); !decoded)
             return refuse(Result::kInvalidArgument, "this is no SMS-DELIVER-REPORT of {}: {}",
                           request.code == 0 ? "success" : "failure", decoded.error().message);
-    auto &waiting = boxes_[slot].delivered;
-    const auto found = request.option == 0 ? waiting.begin() : waiting.find(request.option);
-    if (found == waiting.end())
+    const auto found = boxes_[slot].take_delivered(request.option);
+    if (!found)
         return request.option == 0 ? refuse(Result::kWrongState, "no message waits for a report")
                                    : refuse(Result::kWrongState, "no message {} waits for a report",
                                             request.option);
-    const auto [number, mail] = std::move(*found);
-    waiting.erase(found);
+    const auto &[number, mail] = *found;
     sink_(slot, DeliveryReportAck{number, request.code});
     if (mail.message)
         conclude(*mail.message,
                  request.code == 0 ? message_status::kReceived : message_status::kErrorInDevice);
     return number;
+}
+
+void ServiceCentre::post(int slot, Mail mail) {
+    if (registrations_.registered(slot))
+        deliver(slot, std::move(mail));
+    else
+        boxes_[slot].store(std::move(mail));
+}
+
+void ServiceCentre::deliver(int slot, Mail mail) {
+    Mailbox &box = boxes_[slot];
+    const std::int32_t number = box.next_number();
+    const bool more = mail.more_follow || box.stores_more();
+    const auto octets = std::visit(
+        [&](auto &content) {
+            content.more_messages = more;
+            return tpdu::encode(content).value();
+        },
+        mail.content);
+    const auto kind =
+        mail.is_status_report() ? IncomingKind::kStatusReport : IncomingKind::kMessage;
+    mail.patience = timers_.after_unscaled(kReportTime, [this, slot, number] {
+        const auto given_up = boxes_[slot].take_delivered(number);
+        if (given_up->second.message)
+            conclude(*given_up->second.message, message_status::kNoResponse);
+    });
+    box.await_report(number, std::move(mail));
+    sink_(slot, IncomingSms{octets, number, kind});
+}
+
+void ServiceCentre::deliver_stored(int slot) {
+    while (auto mail = boxes_[slot].take_stored())
+        deliver(slot, *std::move(mail));
+}
+
+// The device may have lost what it has not reported on.
+void ServiceCentre::take_back(int slot) {
+    std::vector<Mail> again;
+    for (Mail &mail : boxes_[slot].take_all_delivered()) {
+        mail.patience.cancel();
+        if (mail.is_status_report())
+            continue;
+        const bool expired = mail.message && !held_.at(*mail.message).expiry.pending();
+        if (expired)
+            conclude(*mail.message, message_status::kExpired);
+        else
+            again.push_back(std::move(mail));
+    }
+    boxes_[slot].store_first(std::move(again));
 }
 
 } // namespace sim

@@ -7,11 +7,11 @@
 #include "sim/base/per_slot.hpp"
 #include "sim/base/result.hpp"
 #include "sim/registration/registrations.hpp"
+#include "sim/sms/mailbox.hpp"
 #include "sim/sms/parties.hpp"
 #include "tpdu/tpdu.hpp"
 
 #include <cstdint>
-#include <deque>
 #include <functional>
 #include <map>
 #include <optional>
@@ -70,7 +70,7 @@ struct DeliveryReportAck {
 using MessageEvent = std::variant<IncomingSms, SendSmsAck, DeliveryReportAck>;
 
 // Takes messages from the slots, keeps them while they cannot be delivered, delivers them, and
-// tells the senders what became of them.
+// tells the senders what became of them. The network's, but for when a slot may send.
 class ServiceCentre {
   public:
     using Sink = std::function<void(int slot, const MessageEvent &event)>;
@@ -90,7 +90,7 @@ class ServiceCentre {
     void take_back(int slot);
 
   private:
-    using Id = std::uint64_t;
+    using Id = MessageId;
 
     // What a slot has sent, from then until its fate is known.
     struct Message {
@@ -103,21 +103,6 @@ class ServiceCentre {
         bool accepted = false;
         Timer step;
         Timer expiry;
-    };
-
-    // What a slot is to receive or has received.
-    struct Mail {
-        std::variant<tpdu::Deliver, tpdu::StatusReport> content;
-        std::optional<Id> message; // whose fate it decides
-        bool more_follow = false;
-        Timer patience; // for the report, once it is delivered
-    };
-
-    struct Mailbox {
-        std::int32_t next_sent = 1;
-        std::int32_t next_received = 1;
-        std::deque<Mail> stored;
-        std::map<std::int32_t, Mail> delivered; // those that wait for a report, by number
     };
 
     tpdu::Timestamp now() const;
@@ -144,6 +129,7 @@ class ServiceCentre {
     const Registrations &registrations_;
     std::int64_t epoch_;
     Sink sink_;
+    PerSlot<std::int32_t> next_sent_;
     PerSlot<Mailbox> boxes_;
     Id next_id_ = 1;
     std::map<Id, Message> held_;
