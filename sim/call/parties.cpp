@@ -61,7 +61,7 @@ constexpr Party kParties[] = {
 constexpr Party kEmergencyService{"", "emergency service: answers at once", kAnswersAtOnce, false};
 constexpr Party kSlotParty{"", "another slot", kIsSlot};
 constexpr Party kOwnNumber{"", "the caller's own number: busy", kIsBusy};
-constexpr Party kAnybody{"", "answers", kAnswers};
+constexpr Party kAnyNumber{"", "answers", kAnswers};
 
 } // namespace
 
@@ -76,7 +76,7 @@ const Party &party_at(const NumberPlan &plan, int caller, std::string_view numbe
         return *slot == caller ? kOwnNumber : kSlotParty;
     const auto named = std::ranges::find_if(
         kParties, [&](const Party &party) { return same_number(party.number, number); });
-    return named != std::end(kParties) ? *named : kAnybody;
+    return named != std::end(kParties) ? *named : kAnyNumber;
 }
 
 } // namespace sim

@@ -9,7 +9,7 @@ namespace {
 
 constexpr std::chrono::milliseconds kNetworkTime{500};
 constexpr std::chrono::seconds kUserTime{60};
-constexpr std::string_view kOwnNumber = "{number}";
+constexpr std::string_view kNumberMark = "{number}";
 
 // A path is the code and the replies that led there.
 struct Page {
@@ -20,9 +20,9 @@ struct Page {
 
 constexpr Page kPages[] = {
     {"*100#", "Your balance is 12.50"},         {"*101#", "1 Balance\n2 My number\n3 Data", true},
-    {"*101#/1", "Your balance is 12.50"},       {"*101#/2", kOwnNumber},
+    {"*101#/1", "Your balance is 12.50"},       {"*101#/2", kNumberMark},
     {"*101#/3", "1 Today\n2 This month", true}, {"*101#/3/1", "120 MB used today"},
-    {"*101#/3/2", "2.4 GB used this month"},    {"*102#", kOwnNumber},
+    {"*101#/3/2", "2.4 GB used this month"},    {"*102#", kNumberMark},
 };
 
 bool is_code(std::string_view text) {
@@ -111,7 +111,7 @@ void UssdService::turn_page(int slot) {
         here.timer = timers_.after_unscaled(kUserTime, [this, slot] { release(slot, "No reply"); });
     }
     indicate(slot, page->asks ? UssdAnswer::kReplyExpected : UssdAnswer::kFinal,
-             page->text == kOwnNumber ? plan_.number_of(slot) : std::string(page->text));
+             page->text == kNumberMark ? plan_.number_of(slot) : std::string(page->text));
 }
 
 void UssdService::release(int slot, std::string why) {

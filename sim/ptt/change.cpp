@@ -9,8 +9,8 @@ namespace sim {
 
 namespace {
 
-constexpr std::chrono::seconds kPatience{15};
-constexpr std::chrono::milliseconds kPartyAnswers{500};
+constexpr std::chrono::seconds kChangePatience{15};
+constexpr std::chrono::milliseconds kPartyDecidesChange{500};
 
 } // namespace
 
@@ -44,8 +44,8 @@ void PttChanges::offer(PttCall &call, PttParticipant &asker, const PttModifyRequ
     change.asker = asker.ref.who;
     change.request = request;
     change.request.media = or_usual(request.media);
-    change.patience =
-        timers_.after_unscaled(kPatience, [this, id = call.id] { conclude(*sessions_.find(id)); });
+    change.patience = timers_.after_unscaled(
+        kChangePatience, [this, id = call.id] { conclude(*sessions_.find(id)); });
     for (auto &[who, other] : call.participants) {
         if (!other.connected() || who == asker.ref.who)
             continue;
@@ -55,7 +55,7 @@ void PttChanges::offer(PttCall &call, PttParticipant &asker, const PttModifyRequ
         sessions_.emit(other, offer);
         if (!other.is_slot())
             other.patience =
-                timers_.after(kPartyAnswers, [this, ref = other.ref] { party_answers(ref); });
+                timers_.after(kPartyDecidesChange, [this, ref = other.ref] { party_answers(ref); });
     }
     if (change.waiting.empty()) {
         change.accepted = true;

@@ -10,9 +10,9 @@ namespace {
 using namespace std::chrono_literals;
 
 constexpr auto kOfferTime = 300ms;
-constexpr auto kPartyAnswers = 500ms;
+constexpr auto kPartyDecidesFile = 500ms;
 constexpr auto kStepTime = 250ms;
-constexpr auto kPatience = 60s;
+constexpr auto kOfferPatience = 60s;
 constexpr std::int32_t kSmallestStep = 128 * 1024;
 constexpr std::int32_t kMostSteps = 16;
 
@@ -117,17 +117,17 @@ void PttFiles::present_to_slot(LegRef ref) {
 
 void PttFiles::expect_answer(LegRef ref) {
     find(ref)->timer = timers_.after_unscaled(
-        kPatience, [this, ref] { finish(ref, PttFileEnd::kNoAnswer, PttFileEnd::kNoAnswer); });
+        kOfferPatience, [this, ref] { finish(ref, PttFileEnd::kNoAnswer, PttFileEnd::kNoAnswer); });
 }
 
 void PttFiles::present_to_party(LegRef ref) {
     Leg &leg = *find(ref);
     const auto end_with = [&](PttFileEnd why) {
-        leg.timer = timers_.after(kPartyAnswers, [this, ref, why] { finish(ref, why, why); });
+        leg.timer = timers_.after(kPartyDecidesFile, [this, ref, why] { finish(ref, why, why); });
     };
     switch (leg.to.party->welcome) {
     case PttWelcome::kTakes:
-        leg.timer = timers_.after(kPartyAnswers, [this, ref] { run(ref); });
+        leg.timer = timers_.after(kPartyDecidesFile, [this, ref] { run(ref); });
         return;
     case PttWelcome::kBusy:
     case PttWelcome::kDeclines:

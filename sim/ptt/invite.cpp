@@ -9,7 +9,7 @@ namespace {
 
 using namespace std::chrono_literals;
 
-constexpr auto kPartyAnswers = 500ms;
+constexpr auto kPartyAnswersCall = 500ms;
 constexpr auto kPartyDeclines = 2s;
 constexpr auto kStays = 3s;
 constexpr auto kSilentAtFirst = 1s;
@@ -72,7 +72,7 @@ void PttCalls::invite_party(PttCall &call, PttParticipant &participant) {
     switch (participant.contact.party->welcome) {
     case PttWelcome::kTakes:
         alert(call, participant);
-        participant.step = timers_.after(kPartyAnswers, [this, ref] { connect(ref); });
+        participant.step = timers_.after(kPartyAnswersCall, [this, ref] { connect(ref); });
         return;
     case PttWelcome::kBusy:
         return leave(ref, PttEndReason::kBusy, PttEndReason::kBusy);

@@ -24,14 +24,14 @@ constexpr PttParty kParties[] = {
     {"+15550213", PttWelcome::kTakes, PttHabit::kEchoes},
     {"+15550214", PttWelcome::kTakes, PttHabit::kTalks},
 };
-constexpr PttParty kAnybody{};
+constexpr PttParty kAnyNumber{};
 
 } // namespace
 
 const PttParty &ptt_party_at(std::string_view number) {
     const auto found = std::ranges::find_if(
         kParties, [&](const PttParty &party) { return same_number(party.number, number); });
-    return found == std::end(kParties) ? kAnybody : *found;
+    return found == std::end(kParties) ? kAnyNumber : *found;
 }
 
 const PttParty &ptt_nobody() {

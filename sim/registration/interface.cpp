@@ -22,7 +22,7 @@ ResultLast<RegistrationInfo> get_registration_info(const Registrations &registra
     return {registrations.info(slot)};
 }
 
-constexpr SignalTable kSignals{
+constexpr SignalTable kRegistrationSignals{
     SignalRow<RegistrationInfo>{"RegistrationStatus"},
     SignalRow<EmergencyRegistrationStatus>{"EmergencyRegistrationStatus"},
 };
@@ -45,11 +45,12 @@ Interface RegistrationInterface::describe() {
         {"GetRegistrationInfo", ask<get_registration_info>, kConnection},
         {"EnableFlightMode", ask<&Registrations::enable_flight_mode>, kConnection},
     };
-    return {kName, bind_methods(kMethods, *this, applications_, registrations_), kSignals.infos()};
+    return {kName, bind_methods(kMethods, *this, applications_, registrations_),
+            kRegistrationSignals.infos()};
 }
 
 Signal to_signal(const RegistrationEvent &event) {
-    return kSignals.signal_of(event);
+    return kRegistrationSignals.signal_of(event);
 }
 
 } // namespace sim

@@ -26,16 +26,16 @@ constexpr MethodRow<Logins> kMethods[] = {
     {"GetLoginState", ask<get_login_state>, kLastArgument},
 };
 
-constexpr SignalTable kSignals{SignalRow<LoginState>{"LoginState"}};
+constexpr SignalTable kLoginSignals{SignalRow<LoginState>{"LoginState"}};
 
 } // namespace
 
 Interface LoginInterface::describe() {
-    return {kName, bind_methods(kMethods, logins_), kSignals.infos()};
+    return {kName, bind_methods(kMethods, logins_), kLoginSignals.infos()};
 }
 
 Signal to_signal(const LoginState &event) {
-    return kSignals.signal_of(event);
+    return kLoginSignals.signal_of(event);
 }
 
 } // namespace sim

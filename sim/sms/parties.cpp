@@ -25,14 +25,14 @@ constexpr MessageParty kParties[] = {
     {"+15550213", MessageFate::kEchoed},
 };
 
-constexpr MessageParty kAnybody{"", MessageFate::kReceived};
+constexpr MessageParty kAnyNumber{"", MessageFate::kReceived};
 
 } // namespace
 
 const MessageParty &message_party_at(std::string_view number) {
     const auto found = std::ranges::find_if(
         kParties, [&](const MessageParty &party) { return same_number(party.number, number); });
-    return found == std::end(kParties) ? kAnybody : *found;
+    return found == std::end(kParties) ? kAnyNumber : *found;
 }
 
 const MessageParty &message_nobody() {

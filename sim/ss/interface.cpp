@@ -18,14 +18,14 @@ namespace {
 
 using enum Caller;
 
-constexpr std::size_t kBarringPassword = 4;
+constexpr std::size_t kPasswordIndex = 4;
 
 constexpr MethodRow<SupplementaryServices> kMethods[] = {
     {"SetCallWaiting", ask<&SupplementaryServices::set_waiting>, kFirstArgument},
     {"GetCallWaiting", ask<&SupplementaryServices::waiting>, kFirstArgument},
     {"SetCallForwarding", ask<&SupplementaryServices::set_forwarding>, kFirstArgument},
     {"GetCallForwarding", ask<&SupplementaryServices::forwarding>, kFirstArgument},
-    {"SetCallBarring", ask<&SupplementaryServices::set_barring>, kFirstArgument, kBarringPassword},
+    {"SetCallBarring", ask<&SupplementaryServices::set_barring>, kFirstArgument, kPasswordIndex},
     {"GetCallBarring", ask<&SupplementaryServices::barring>, kFirstArgument},
 };
 
