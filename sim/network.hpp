@@ -51,20 +51,25 @@ struct Network {
     // or nothing.
     std::optional<std::string> keep_in(const std::string &directory);
 
-    NumberPlan plan;
+    NumberPlan plan; // the network's
+    // What the devices are in the network.
     Registrations registrations;
     Logins logins;
+    // Calls: the network forwards and bars them and answers codes; the devices show video.
     SupplementaryServices services;
     CallModel calls;
     UssdService ussd;
     VideoTelephony video;
+    // The network's service centre.
     ServiceCentre centre;
+    // The network's groups and its push-to-talk server; the devices record.
     GroupModel groups;
     PttDirectory ptt_directory;
     PttCalls ptt;
     PttRecorder ptt_recorder;
     PttMessages ptt_messages;
     PttFiles ptt_files;
+    // The devices'.
     SettingsModel settings;
 
   private:

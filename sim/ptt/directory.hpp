@@ -32,7 +32,7 @@ struct PttContact {
 using ParticipantsOf =
     std::function<std::optional<std::vector<std::string>>(std::string_view group_uri)>;
 
-// Who the parties and the groups are.
+// The push-to-talk server's: who the parties and the groups are.
 class PttDirectory {
   public:
     static constexpr std::string_view kGroupHost = "groups.invalid";

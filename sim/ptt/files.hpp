@@ -31,7 +31,7 @@ struct PttFileReceipt {
 };
 
 // Files between parties and into calls. No bytes are read or written: a file is what its
-// attributes say, and takes its time.
+// attributes say, and takes its time. The server's, but for what a slot may ask when.
 class PttFiles {
   public:
     PttFiles(const PttDirectory &directory, PttCalls &calls, Timers &timers,

@@ -43,7 +43,7 @@ struct PttNoticeRequest {
 };
 
 // Messages between parties and into calls, and what the senders are told of them. Nothing is
-// stored for parties that cannot be reached.
+// stored for parties that cannot be reached. The server's, but for what a slot may ask when.
 class PttMessages {
   public:
     PttMessages(const PttDirectory &directory, PttCalls &calls, Timers &timers,

@@ -30,7 +30,8 @@ struct PttRecordingInfo {
     std::string path;
 };
 
-// Recordings of calls. There is no sound, so what a file holds is who spoke when, a line each.
+// The device's recordings of calls. There is no sound, so what a file holds is who spoke when, a
+// line each.
 class PttRecorder {
   public:
     PttRecorder(PttCalls &calls, Timers &timers) : calls_(calls), timers_(timers) {}

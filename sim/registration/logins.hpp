@@ -26,7 +26,7 @@ struct LoginState {
     bool operator==(const LoginState &) const = default;
 };
 
-// Who is logged in: at most one user of each kind on a slot.
+// Who is logged in: at most one user of each kind on a slot. The device's.
 class Logins {
   public:
     using Sink = std::function<void(int slot, const LoginState &event)>;

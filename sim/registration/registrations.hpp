@@ -35,7 +35,7 @@ struct EmergencyRegistrationStatus {
 
 using RegistrationEvent = std::variant<RegistrationInfo, EmergencyRegistrationStatus>;
 
-// Which slots the network knows, and which have their radio off.
+// Which slots the network knows, and which have their radio off. The device's.
 class Registrations {
   public:
     using Sink = std::function<void(int slot, const RegistrationEvent &event)>;

@@ -25,8 +25,8 @@ struct SlotSettings {
     bool operator==(const SlotSettings &) const = default;
 };
 
-// The settings sets, profiles and network environment of each slot. A request changes all that it
-// names or nothing.
+// The settings sets, profiles and network environment of each slot, which the device keeps. A
+// request changes all that it names or nothing.
 class SettingsModel {
   public:
     // Makes a slot's settings durable. What went wrong, or nothing.

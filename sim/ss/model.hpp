@@ -63,7 +63,8 @@ struct BarringEntry {
     bool operator==(const BarringEntry &) const = default;
 };
 
-// Call waiting, forwarding and barring of all slots, and what they mean for a call.
+// Call waiting, forwarding and barring of all slots, and what they mean for a call. The network's:
+// it applies them on the side that they belong to.
 class SupplementaryServices {
   public:
     SupplementaryServices(const NumberPlan &plan, const Registrations &registrations);

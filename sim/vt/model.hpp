@@ -74,8 +74,8 @@ struct Swipe {
     std::int32_t milliseconds = 0;
 };
 
-// The video engine of all slots: what belongs to a video call while it is one. A request that makes
-// no sense in the present state is refused and changes nothing.
+// The device's video engine of all slots: what belongs to a video call while it is one. A request
+// that makes no sense in the present state is refused and changes nothing.
 class VideoTelephony {
   public:
     VideoTelephony(const CallModel &calls, int slots) : calls_(calls), slots_(slots) {}
