@@ -7,6 +7,7 @@
 #include "sim/call/session.hpp"
 
 #include <functional>
+#include <utility>
 #include <vector>
 
 namespace sim {

@@ -91,36 +91,38 @@ send_notice(PttMessages &messages, int slot, int32_t number, const string &messa
     return std::tuple(number, notice, *told);
 }
 
-constexpr MethodRow<PttCalls, PttFloorControl, PttChanges, PttRecorder, PttMessages, PttFiles>
-    kMethods[] = {
-        {"PocMakeCall", ask<make_call>, kConnection},
-        {"PocMakeAdHocConfCall", ask<make_ad_hoc_call, int32_t>, kConnection},
-        {"PocAddUsersToAdHocConfCall", ask<add_users>, kConnection},
-        {"PocRemoveUsersFromAdHocConfCall", ask<remove_users>, kConnection},
-        {"PocCallConvertToCrisisCall", ask<&PttCalls::convert_to_crisis>, kConnection},
-        {"PocAnswerCall", ask<&PttCalls::answer>, kConnection},
-        {"PocRejectCall", ask<&PttCalls::reject>, kConnection},
-        {"PocEndCall", ask<&PttCalls::end>, kConnection},
-        {"PocRequestFloor", ask<&PttFloorControl::request>, kConnection},
-        {"PocReleaseFloor", ask<&PttFloorControl::release, FourIntegers>, kConnection},
-        {"PocRequestFloorStatus", ask<request_floor_status>, kConnection},
-        {"PocModifyCall", ask<&PttChanges::modify>, kConnection},
-        {"PocAcceptModifyCall", ask<&PttChanges::accept>, kConnection},
-        {"PocRejectModifyCall", ask<&PttChanges::reject>, kConnection},
-        {"PocSetChannel", ask<&PttCalls::set_channel>, kConnection},
-        {"PocStartCallRecording", ask<&PttRecorder::start>, kConnection},
-        {"PocPauseCallRecording", ask<&PttRecorder::pause>, kConnection},
-        {"PocResumeCallRecording", ask<&PttRecorder::resume>, kConnection},
-        {"PocStopCallRecording", ask<&PttRecorder::stop>, kConnection},
-        {"PocCancelCallRecording", ask<&PttRecorder::cancel>, kConnection},
-        {"PocSendMsg", ask<&PttMessages::send>, kConnection},
-        {"PocSendReceivedMsgNoti", ask<send_notice>, kConnection},
-        {"PocTransferFile", ask<&PttFiles::offer>, kConnection},
-        {"PocAcceptFileTransfer", ask<&PttFiles::accept>, kConnection},
-        // Spelt so.
-        {"PocARejectFileTransfer", ask<&PttFiles::reject>, kConnection},
-        {"PocCancelFileTransfer", ask<&PttFiles::cancel>, kConnection},
-        {"PocSendKeepAlive", ask<&PttCalls::keep_alive>, kConnection},
+using PttMethod =
+    MethodRow<PttCalls, PttFloorControl, PttChanges, PttRecorder, PttMessages, PttFiles>;
+
+constexpr PttMethod kMethods[] = {
+    {"PocMakeCall", ask<make_call>, kConnection},
+    {"PocMakeAdHocConfCall", ask<make_ad_hoc_call, int32_t>, kConnection},
+    {"PocAddUsersToAdHocConfCall", ask<add_users>, kConnection},
+    {"PocRemoveUsersFromAdHocConfCall", ask<remove_users>, kConnection},
+    {"PocCallConvertToCrisisCall", ask<&PttCalls::convert_to_crisis>, kConnection},
+    {"PocAnswerCall", ask<&PttCalls::answer>, kConnection},
+    {"PocRejectCall", ask<&PttCalls::reject>, kConnection},
+    {"PocEndCall", ask<&PttCalls::end>, kConnection},
+    {"PocRequestFloor", ask<&PttFloorControl::request>, kConnection},
+    {"PocReleaseFloor", ask<&PttFloorControl::release, FourIntegers>, kConnection},
+    {"PocRequestFloorStatus", ask<request_floor_status>, kConnection},
+    {"PocModifyCall", ask<&PttChanges::modify>, kConnection},
+    {"PocAcceptModifyCall", ask<&PttChanges::accept>, kConnection},
+    {"PocRejectModifyCall", ask<&PttChanges::reject>, kConnection},
+    {"PocSetChannel", ask<&PttCalls::set_channel>, kConnection},
+    {"PocStartCallRecording", ask<&PttRecorder::start>, kConnection},
+    {"PocPauseCallRecording", ask<&PttRecorder::pause>, kConnection},
+    {"PocResumeCallRecording", ask<&PttRecorder::resume>, kConnection},
+    {"PocStopCallRecording", ask<&PttRecorder::stop>, kConnection},
+    {"PocCancelCallRecording", ask<&PttRecorder::cancel>, kConnection},
+    {"PocSendMsg", ask<&PttMessages::send>, kConnection},
+    {"PocSendReceivedMsgNoti", ask<send_notice>, kConnection},
+    {"PocTransferFile", ask<&PttFiles::offer>, kConnection},
+    {"PocAcceptFileTransfer", ask<&PttFiles::accept>, kConnection},
+    // Spelt so.
+    {"PocARejectFileTransfer", ask<&PttFiles::reject>, kConnection},
+    {"PocCancelFileTransfer", ask<&PttFiles::cancel>, kConnection},
+    {"PocSendKeepAlive", ask<&PttCalls::keep_alive>, kConnection},
 };
 
 auto floor_members(const PttFloorEvent &e) {
