@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "tests/library/call/call_rows.hpp"
 
+#include "tests/support/data_checks.hpp"
+
 #include <glib.h>
 #include <gtest/gtest.h>
 
@@ -38,10 +40,6 @@ constexpr ims_call_participant_s kBadSecond{kNotUtf8, nullptr};
 constexpr ims_call_participant_s kBadFirst{"sip:a@example.org", &kBadSecond};
 
 // "(ii)" "(0, 7)"
-void is_pointer_to_seven(void *data) {
-    ASSERT_NE(data, nullptr);
-    EXPECT_EQ(*static_cast<std::int32_t *>(data), 7);
-}
 void is_seven_itself(void *data) {
     EXPECT_EQ(data, reinterpret_cast<void *>(std::intptr_t{7}));
 }
@@ -94,7 +92,7 @@ std::vector<RequestRow> call_life_rows() {
                        bad_text<&Make::text_4>()},
          .reply_type = "(ii)",
          .reply = "(0, 7)",
-         .check_data = is_pointer_to_seven},
+         .check_data = points_to<7>},
         {.function = request<ims_call_send_ussd, kUssd>(),
          .method = "SendUssd",
          .type = "(iiis)",
@@ -208,7 +206,7 @@ std::vector<RequestRow> media_rows() {
          .arguments = "(42, 7)",
          .reply_type = "(ii)",
          .reply = "(0, 7)",
-         .check_data = is_pointer_to_seven},
+         .check_data = points_to<7>},
     };
 }
 
@@ -267,14 +265,14 @@ std::vector<RequestRow> conference_rows() {
          .arguments = "(42, 7, 8, 9)",
          .reply_type = "(ii)",
          .reply = "(0, 7)",
-         .check_data = is_pointer_to_seven},
+         .check_data = points_to<7>},
         {.function = request<ims_call_merge_calls>(),
          .method = "MergeCalls",
          .type = "(i)",
          .arguments = "(42,)",
          .reply_type = "(ii)",
          .reply = "(0, 7)",
-         .check_data = is_pointer_to_seven},
+         .check_data = points_to<7>},
         {.function = request<ims_call_add_participant_to_nway_conference_call, kPair>(),
          .method = "AddParticipantToNwayConferenceCall",
          .type = "(iii)",

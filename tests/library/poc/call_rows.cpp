@@ -1,6 +1,8 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "tests/library/poc/poc_rows.hpp"
 
+#include "tests/support/data_checks.hpp"
+
 #include <gtest/gtest.h>
 
 namespace test {
@@ -32,11 +34,6 @@ constexpr ims_poc_floor_query_s kQuery{5, {7, 8, 9, 10, 11}};
     "<'render'>, 'content_id': <'id'>, 'content_encoding_type': <'8bit'>, "                        \
     "'content_description': <'a note'>, 'content': <'Welcome'>}>)"
 #define MEDIA_AS_SENT "(false, true, 7, -8, <[1, 2, 3, 4]>, <[5, 6, 7, 2147483647]>)"
-
-void is_pointer_to_seven(void *data) {
-    ASSERT_NE(data, nullptr);
-    EXPECT_EQ(*static_cast<std::int32_t *>(data), 7);
-}
 
 // "(0, [...])" below
 void is_status_list(void *data) {
@@ -84,7 +81,7 @@ std::vector<RequestRow> making_rows() {
          .bad_texts = {bad_text<&Make::text_1>(), bad_text<&Make::text_2>()},
          .reply_type = "(ii)",
          .reply = "(0, 7)",
-         .check_data = is_pointer_to_seven},
+         .check_data = points_to<7>},
         {.function = request<ims_poc_make_ad_hoc_call, kAdHoc>(),
          .method = "PocMakeAdHocConfCall",
          .type = "(vbvssbibivi)",
@@ -95,7 +92,7 @@ std::vector<RequestRow> making_rows() {
                        bad_part<&AdHoc::user_list, kBadSecond>("second user")},
          .reply_type = "(ii)",
          .reply = "(0, 7)",
-         .check_data = is_pointer_to_seven},
+         .check_data = points_to<7>},
         {.function = request<ims_poc_add_users_to_ad_hoc_call, kUsers>(),
          .method = "PocAddUsersToAdHocConfCall",
          .type = "(iiiviv)",

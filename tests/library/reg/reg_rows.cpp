@@ -1,18 +1,12 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "tests/library/reg/reg_rows.hpp"
 
-#include <gtest/gtest.h>
+#include "tests/support/data_checks.hpp"
 
 namespace test {
 namespace {
 
 constexpr Module kReg{.unit = "ims_reg.cpp", .interface = "org.kelvo.ims.Registration"};
-
-// "(ii)" "(0, 9)"
-void is_pointer_to_nine(void *data) {
-    ASSERT_NE(data, nullptr);
-    EXPECT_EQ(*static_cast<std::int32_t *>(data), 9);
-}
 
 } // namespace
 
@@ -25,7 +19,7 @@ std::vector<RequestRow> reg_request_rows() {
          .method = "RegisterApplication",
          .reply_type = "(ii)",
          .reply = "(0, 9)",
-         .check_data = is_pointer_to_nine},
+         .check_data = points_to<9>},
     };
     return requests_of(kReg, rows);
 }

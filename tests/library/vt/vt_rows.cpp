@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: Apache-2.0
 #include "tests/library/vt/vt_rows.hpp"
 
-#include <gtest/gtest.h>
+#include "tests/support/data_checks.hpp"
 
 namespace test {
 namespace {
@@ -23,12 +23,6 @@ constexpr ims_vt_pix_map_re_use_s kReUse{7, 2, 3};
 constexpr ims_vt_pix_map_s kPixMap{7, 2};
 constexpr ims_vt_window_s kWindow{7, 1, -2, 3, -4, 5};
 constexpr ims_vt_buffer_s kBuffer{7, "buffer"};
-
-// "(ii)" "(0, 40)"
-void is_pointer_to_forty(void *data) {
-    ASSERT_NE(data, nullptr);
-    EXPECT_EQ(*static_cast<std::int32_t *>(data), 40);
-}
 
 std::vector<RequestRow> camera_rows() {
     return {
@@ -63,7 +57,7 @@ std::vector<RequestRow> camera_rows() {
          .arguments = "(7, 1)",
          .reply_type = "(ii)",
          .reply = "(0, 40)",
-         .check_data = is_pointer_to_forty,
+         .check_data = points_to<40>,
          .handler = "on_response_vt_get_zoom"},
         {.function = request<ims_vt_set_zoom, kZoom>(),
          .method = "SetZoom",
