@@ -12,7 +12,7 @@ namespace sim::test {
 namespace {
 
 constexpr int kUpdatesARound = 12;
-constexpr int kPatienceMilliseconds = 20000;
+constexpr int kPollMilliseconds = 20000;
 
 // What the program does in its directory, as it does it.
 class DirectoryWatch {
@@ -31,7 +31,7 @@ class DirectoryWatch {
     void wait_for(std::uint32_t event, int times) {
         while (times > 0) {
             pollfd waiting{descriptor_, POLLIN, 0};
-            ASSERT_EQ(poll(&waiting, 1, kPatienceMilliseconds), 1) << "nothing is written";
+            ASSERT_EQ(poll(&waiting, 1, kPollMilliseconds), 1) << "nothing is written";
             alignas(inotify_event) char events[4096];
             const auto length = read(descriptor_, events, sizeof events);
             ASSERT_GT(length, 0);
@@ -65,7 +65,7 @@ struct Stream {
         ++open;
         g_dbus_connection_call(
             client.connection(), kServiceName, slot_path(0).c_str(), kept.interface, kept.method,
-            arguments.get(), nullptr, G_DBUS_CALL_FLAGS_NO_AUTO_START, kPatienceMilliseconds,
+            arguments.get(), nullptr, G_DBUS_CALL_FLAGS_NO_AUTO_START, kPollMilliseconds,
             nullptr,
             [](GObject *connection, GAsyncResult *result, gpointer data) {
                 const std::unique_ptr<Context> context(static_cast<Context *>(data));
