@@ -96,7 +96,7 @@ Status GroupModel::edit(std::string_view uri, const Edit &edit) {
     const auto group = find_group(next.groups, uri);
     if (group == next.groups.end())
         return unknown_group(uri);
-    if (const auto edited = edit(*group); !edited)
+    if (auto edited = edit(*group); !edited)
         return edited;
     if (const auto contradiction = find_contradiction(*group))
         return refuse(Result::kInvalidArgument, "{}", *contradiction);

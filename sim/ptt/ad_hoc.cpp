@@ -79,7 +79,7 @@ Answer<std::int32_t> PttCalls::make_ad_hoc_call(int slot, const PttAdHocRequest 
 }
 
 Answer<PttSessions::Place> PttCalls::owned_ad_hoc(int slot, std::int32_t session) {
-    const auto place = sessions_.connected(slot, session);
+    auto place = sessions_.connected(slot, session);
     if (!place)
         return place;
     if (place->call.type != PttCallType::kAdHoc)

@@ -20,10 +20,15 @@ PttParticipant *PttSessions::find(PttRef ref) {
     return call ? call->find(ref.who) : nullptr;
 }
 
+PttSessions::Place PttSessions::place_of(PttRef ref) {
+    PttCall &call = calls_.at(ref.call);
+    return {call, call.participants.at(ref.who)};
+}
+
 Answer<PttSessions::Place> PttSessions::existing(int slot, std::int32_t session) {
     const auto found = lines_[slot].sessions.find(session);
     if (found != lines_[slot].sessions.end())
-        return Place{*find(found->second.call), *find(found->second)};
+        return place_of(found->second);
     std::string ids;
     for (const auto &[id, ref] : lines_[slot].sessions)
         ids += fmt::format("{}{}", ids.empty() ? "" : ", ", id);
@@ -32,7 +37,7 @@ Answer<PttSessions::Place> PttSessions::existing(int slot, std::int32_t session)
 }
 
 Answer<PttSessions::Place> PttSessions::connected(int slot, std::int32_t session) {
-    const auto place = existing(slot, session);
+    auto place = existing(slot, session);
     if (place && !place->self.connected())
         return refuse(Result::kWrongState, "session {} is not established yet", session);
     return place;

@@ -137,6 +137,8 @@ class PttSessions {
                      std::string_view status) const;
 
   private:
+    Place place_of(PttRef ref);
+
     Sink sink_;
     PerSlot<PttLine> lines_;
     std::map<int, PttCall> calls_;

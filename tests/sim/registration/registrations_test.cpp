@@ -92,6 +92,23 @@ TEST_F(Registering, FlightModeEndsEverythingBeforeItIsAnnounced) {
     EXPECT_THAT(calls_.list(1), IsEmpty());
 }
 
+TEST_F(Registering, FlightModeEndsPushToTalkAfterCalls) {
+    using testing::StartsWith;
+    connect(0, 1);
+    expect_accepted(network_.ptt.make_call(0, {{}, "+15550221", PttCallType::kOneToOne}));
+    // Who never answers leaves the file where it is.
+    PttFileOffer offer;
+    offer.targets = {{0, "+15550207", {}, false}};
+    offer.attributes.name = "notes.txt";
+    offer.attributes.size = 1;
+    expect_accepted(network_.ptt_files.offer(0, offer));
+    advance(5s);
+    forget_events();
+    expect_accepted(registrations_.enable_flight_mode(0));
+    EXPECT_THAT(take(0), ElementsAre(StartsWith("CallEnded (1,"), StartsWith("PocCallEnded (1,"),
+                                     StartsWith("PocFileTransferTerminated (1,"), kFlightMode));
+}
+
 TEST_F(Registering, FlightModeEndsCallsOfEveryKind) {
     // A conference with its members, and a call that waits.
     const auto held = connect(0, 1);
