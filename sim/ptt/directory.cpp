@@ -17,6 +17,7 @@ std::optional<std::vector<std::string>> PttDirectory::built_in(std::string_view 
     if (group_uri != fmt::format("{}@{}", name, kGroupHost))
         return std::nullopt;
     std::vector<std::string> members;
+    members.reserve(static_cast<std::size_t>(plan_.slots()) + std::size(kSimulatedMembers));
     for (int slot = 0; slot < plan_.slots(); ++slot)
         members.push_back(uri_of(slot));
     if (name == "sip:network")
