@@ -78,7 +78,7 @@ Status VideoTelephony::set_window(int slot, int id, const VideoWindow &window) {
     return Done{};
 }
 
-Status VideoTelephony::swap(int slot, int id) {
+Status VideoTelephony::swap_ends(int slot, int id) {
     const auto found = video(slot, id);
     if (!found)
         return found.refusal();

@@ -37,7 +37,7 @@ constexpr MethodRow<Vt> kMethods[] = {
     {"StopRecordVideo", ask<&Vt::end_recording>, kConnection},
     {"StartFileCast", ask<&Vt::start_cast>, kConnection},
     {"StopFileCast", ask<&Vt::stop_cast>, kConnection},
-    {"SwapVideoSurface", ask<&Vt::swap>, kConnection},
+    {"SwapVideoSurface", ask<&Vt::swap_ends>, kConnection},
     {"SwipeVideo", ask<&Vt::swipe>, kConnection},
     {"SetNearEndSurface", ask<&set_surface<VideoEnd::kNear>>, kConnection},
     {"SetFarEndSurface", ask<&set_surface<VideoEnd::kFar>>, kConnection},

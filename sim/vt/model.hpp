@@ -110,7 +110,7 @@ class VideoTelephony {
     Status re_use_pixmap(int slot, int id, VideoEnd end, std::int32_t pixmap);
     Status release_pixmap(int slot, int id, std::int32_t pixmap);
     Status set_window(int slot, int id, const VideoWindow &window);
-    Status swap(int slot, int id);
+    Status swap_ends(int slot, int id);
     Status swipe(int slot, int id, const Swipe &swipe);
     Status set_active(int slot, int id);
     Status set_camera_buffer(int slot, int id, const std::string &name);

@@ -65,8 +65,7 @@ struct Stream {
         ++open;
         g_dbus_connection_call(
             client.connection(), kServiceName, slot_path(0).c_str(), kept.interface, kept.method,
-            arguments.get(), nullptr, G_DBUS_CALL_FLAGS_NO_AUTO_START, kPollMilliseconds,
-            nullptr,
+            arguments.get(), nullptr, G_DBUS_CALL_FLAGS_NO_AUTO_START, kPollMilliseconds, nullptr,
             [](GObject *connection, GAsyncResult *result, gpointer data) {
                 const std::unique_ptr<Context> context(static_cast<Context *>(data));
                 const auto reply = Variant::adopt(

@@ -44,7 +44,7 @@ class VideoCall : public NetworkTest {
                 video_.re_use_pixmap(slot, id, VideoEnd::kNear, 5),
                 video_.release_pixmap(slot, id, 5),
                 video_.set_window(slot, id, {VideoEnd::kFar, 7, 640, 480, 0}),
-                video_.swap(slot, id),
+                video_.swap_ends(slot, id),
                 video_.swipe(slot, id, {0, 0, 10, 10, 100}),
                 video_.set_active(slot, id),
                 video_.set_camera_buffer(slot, id, "camera"),
@@ -256,11 +256,11 @@ TEST_F(VideoCall, WindowsAreSetAndTakenAway) {
 
 TEST_F(VideoCall, EndsSwapWhenBothAreDrawn) {
     expect_accepted(video_.set_surface(0, id_, VideoEnd::kNear, 1, {{4}}));
-    wrong_state(video_.swap(0, id_), "set both first");
+    wrong_state(video_.swap_ends(0, id_), "set both first");
     expect_accepted(video_.set_window(0, id_, {VideoEnd::kFar, 1, 640, 480, 0}));
-    expect_accepted(video_.swap(0, id_));
+    expect_accepted(video_.swap_ends(0, id_));
     EXPECT_TRUE(state().swapped);
-    expect_accepted(video_.swap(0, id_));
+    expect_accepted(video_.swap_ends(0, id_));
     EXPECT_FALSE(state().swapped);
 }
 
