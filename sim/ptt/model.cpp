@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: Apache-2.0
-// Placing, answering and ending. Inviting is in invite.cpp.
+// Calls from being placed to their end, and channels. Inviting is in invite.cpp.
 #include "sim/ptt/model.hpp"
 
 #include "sim/ptt/media.hpp"
