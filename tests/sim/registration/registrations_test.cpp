@@ -95,6 +95,7 @@ TEST_F(Registering, FlightModeEndsEverythingBeforeItIsAnnounced) {
 TEST_F(Registering, FlightModeEndsPushToTalkAfterCalls) {
     using testing::StartsWith;
     connect(0, 1);
+    expect_accepted(logins_.login(0, "alice", "secret", LoginKind::kIms));
     expect_accepted(network_.ptt.make_call(0, {{}, "+15550221", PttCallType::kOneToOne}));
     // Who never answers leaves the file where it is.
     PttFileOffer offer;
@@ -105,7 +106,8 @@ TEST_F(Registering, FlightModeEndsPushToTalkAfterCalls) {
     advance(5s);
     forget_events();
     expect_accepted(registrations_.enable_flight_mode(0));
-    EXPECT_THAT(take(0), ElementsAre(StartsWith("CallEnded (1,"), StartsWith("PocCallEnded (1,"),
+    EXPECT_THAT(take(0), ElementsAre(StartsWith("CallEnded (1,"), StartsWith("LoginState (0,"),
+                                     StartsWith("PocCallEnded (1,"),
                                      StartsWith("PocFileTransferTerminated (1,"), kFlightMode));
 }
 
