@@ -21,6 +21,7 @@
 
 #include <functional>
 #include <optional>
+#include <span>
 #include <string>
 
 namespace sim {

@@ -6,9 +6,12 @@
 #include "sim/bus/interface.hpp"
 
 #include <concepts>
+#include <cstddef>
+#include <cstdint>
 #include <functional>
 #include <optional>
 #include <span>
+#include <string>
 #include <string_view>
 #include <tuple>
 #include <type_traits>

@@ -10,7 +10,6 @@
 #include <span>
 #include <string_view>
 #include <tuple>
-#include <utility>
 #include <variant>
 
 // From a model's event to a signal on the bus: a row says which signal stands for which event, and

@@ -5,6 +5,8 @@
 #include "sim/call/model.hpp"
 #include "sim/call/ussd.hpp"
 
+#include <string_view>
+
 namespace sim {
 
 // org.kelvo.ims.Call: requests to the model, answers and events to the bus.

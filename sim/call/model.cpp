@@ -2,7 +2,6 @@
 // Calls from their first number to their end.
 #include "sim/call/model.hpp"
 
-#include <algorithm>
 #include <utility>
 
 namespace sim {

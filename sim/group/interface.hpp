@@ -6,6 +6,9 @@
 #include "sim/group/model.hpp"
 #include "sim/registration/registrations.hpp"
 
+#include <string>
+#include <utility>
+
 namespace sim {
 
 // org.kelvo.ims.Xdm. Its requests carry no application id.

@@ -8,6 +8,8 @@
 #include "sim/ptt/model.hpp"
 #include "sim/ptt/recorder.hpp"
 
+#include <string_view>
+
 namespace sim {
 
 // org.kelvo.ims.Poc: requests to the models, answers and events to the bus.

@@ -4,9 +4,10 @@
 #include "sim/base/result.hpp"
 #include "sim/ptt/values.hpp"
 
-#include <algorithm>
 #include <chrono>
+#include <cstdint>
 #include <optional>
+#include <string_view>
 
 // The sets of four integers: what they may hold and what follows from them.
 namespace sim {

@@ -10,7 +10,6 @@
 #include "sim/registration/registrations.hpp"
 
 #include <cstdint>
-#include <functional>
 #include <map>
 #include <string>
 #include <vector>

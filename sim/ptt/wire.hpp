@@ -9,6 +9,7 @@
 #include "sim/ptt/recorder.hpp"
 
 #include <cstdint>
+#include <string_view>
 #include <vector>
 
 // Push-to-talk's values inside variants: dictionaries whose integers are 64-bit, lists of them,

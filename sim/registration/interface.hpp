@@ -5,6 +5,8 @@
 #include "sim/bus/interface.hpp"
 #include "sim/registration/registrations.hpp"
 
+#include <string_view>
+
 namespace sim {
 
 // org.kelvo.ims.Registration: the applications, and the device in the network.

@@ -4,6 +4,8 @@
 #include "sim/bus/interface.hpp"
 #include "sim/registration/logins.hpp"
 
+#include <string_view>
+
 namespace sim {
 
 // org.kelvo.ims.Login

@@ -3,6 +3,11 @@
 
 #include "sim/settings/fields.hpp"
 
+#include <cstdint>
+#include <span>
+#include <string_view>
+#include <variant>
+
 namespace sim {
 
 // A key of a field table with its shipped value, which also says its type.

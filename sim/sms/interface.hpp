@@ -4,6 +4,8 @@
 #include "sim/bus/interface.hpp"
 #include "sim/sms/service_centre.hpp"
 
+#include <string_view>
+
 namespace sim {
 
 // org.kelvo.ims.Sms

@@ -4,6 +4,8 @@
 #include "sim/bus/interface.hpp"
 #include "sim/ss/model.hpp"
 
+#include <string_view>
+
 namespace sim {
 
 // org.kelvo.ims.Ss
