@@ -100,9 +100,7 @@ struct Module {
 
     template <std::size_t Size>
     consteval Module(const char *on_interface, Decoder decoder, const Notification (&rows)[Size])
-        : interface {
-        on_interface
-    }, decode{decoder}, notifications{rows} {
+        : interface(on_interface), decode(decoder), notifications(rows) {
         for (std::size_t at = 0; at < Size; ++at) {
             if (rows[at].id != rows[0].id + static_cast<int>(at))
                 throw "an id does not follow the one before it";
