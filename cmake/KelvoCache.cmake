@@ -1,8 +1,10 @@
 # SPDX-License-Identifier: Apache-2.0
-# What has been compiled once, in any build directory here, is not compiled again.
+# With IMS_CCACHE, what ccache still knows is not compiled again: after a clean, or a change that was
+# taken back. A launcher that was named when configuring stays.
 find_program(IMS_CCACHE_PROGRAM ccache)
 mark_as_advanced(IMS_CCACHE_PROGRAM)
-if(IMS_CCACHE AND IMS_CCACHE_PROGRAM AND NOT CMAKE_CXX_COMPILER_LAUNCHER)
+if(IMS_CCACHE AND IMS_CCACHE_PROGRAM
+    AND NOT CMAKE_C_COMPILER_LAUNCHER AND NOT CMAKE_CXX_COMPILER_LAUNCHER)
   # Precompiled headers hide from ccache which macros they use; nothing here uses the time.
   set(launcher ${CMAKE_COMMAND} -E env CCACHE_SLOPPINESS=pch_defines,time_macros
     ${IMS_CCACHE_PROGRAM})

@@ -191,7 +191,8 @@ def main():
     copy_tree()
 
     run(["cmake", "-S", COPY, "-B", BUILD, "-G", "Ninja", "-DIMS_WERROR=ON",
-         "-DIMS_JOIN_FOLDERS=ON", f"-DBUILD_TESTING={'ON' if tests else 'OFF'}"])
+         "-DIMS_JOIN_FOLDERS=ON", "-DIMS_CCACHE=ON",
+         f"-DBUILD_TESTING={'ON' if tests else 'OFF'}"])
     run(["cmake", "--build", BUILD, "--target", *PROGRAMS, *(TESTS if tests else [])])
 
     sim, ctl = BUILD / "bin/ims-sim", BUILD / "bin/imsctl"
