@@ -4,10 +4,10 @@
 //
 // An exported function admits its arguments, packs its tuple and requests:
 //
-//     if (const int refused = admit({handle, info}))
+//     if (const int refused = admit({handle}))
 //         return refused;
-//     return request(handle, kInterface, "AnswerCall", pack<"(ii)">(handle->app_id, info->...),
-//                    {answer<"on_response_call_answer_call", "(ii)", kSecondByPointer>, callback,
+//     return request(handle, kInterface, "MergeCalls", pack<"(i)">(handle->app_id),
+//                    {answer<"on_response_call_merge_calls", "(ii)", kSecondByPointer>, callback,
 //                     user_data});
 //
 // answer<> is the handler of the response: its name as log lines have it, the signature of the
