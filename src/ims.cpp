@@ -36,9 +36,6 @@ struct Signal {
     const char *interface;
     const char *member;
     Decoder decode;
-
-    // As the table of subscriptions has it.
-    Text text() const noexcept { return Text{g_strdup_printf("%s:%s", interface, member)}; }
 };
 
 // No member for an id that nobody can ask for.
@@ -50,13 +47,29 @@ Signal find_signal(int noti_id) noexcept {
     return {};
 }
 
+// A signal as the table of subscriptions has it.
+Text signal_text(const char *interface, const char *member) noexcept {
+    return Text{g_strdup_printf("%s:%s", interface, member)};
+}
+
 // GDBus delivers what is waiting only while the subscription lasts, so its record is there.
-void on_signal_callback(GDBusConnection *, const char *, const char *, const char *, const char *,
-                        GVariant *parameters, gpointer user_data) noexcept {
+void on_signal_callback(GDBusConnection *, const char *, const char *, const char *interface,
+                        const char *member, GVariant *parameters, gpointer user_data) noexcept {
     const auto *subscription = static_cast<const ims_noti_cb_info_s *>(user_data);
     if (subscription == nullptr) {
         log_error(here(), "Invalid parameter");
         return;
+    }
+    // Another signal than the one that was subscribed to goes where the table says.
+    if (!g_str_equal(member, subscription->member) ||
+        !g_str_equal(interface, subscription->interface)) {
+        const Text noti_str = signal_text(interface, member);
+        subscription = static_cast<const ims_noti_cb_info_s *>(
+            g_hash_table_lookup(subscription->handle->noti_table.get(), noti_str.get()));
+        if (subscription == nullptr) {
+            log_error(here(), "can't find noti_str(%s) callback info", noti_str.get());
+            return;
+        }
     }
     subscription->decode(subscription->handle, subscription->noti_id, parameters, subscription);
 }
@@ -120,13 +133,14 @@ int ims_set_notification_cb(ims_h handle, int noti_id, ims_notification_cb callb
     const Signal signal = find_signal(noti_id);
     if (signal.member == nullptr)
         return invalid_parameter();
-    Text noti_str = signal.text();
+    Text noti_str = signal_text(signal.interface, signal.member);
     if (g_hash_table_contains(handle->noti_table.get(), noti_str.get())) {
         log_error(here(), "noti_str[%s] is already registered", noti_str.get());
         return IMS_ERROR_INVALID_PARAMETER;
     }
     auto *subscription = g_new(ims_noti_cb_info_s, 1);
-    *subscription = {0, callback, user_data, handle, signal.decode, noti_id};
+    *subscription = {
+        0, callback, user_data, handle, signal.interface, signal.member, signal.decode, noti_id};
     subscription->subscription_id = g_dbus_connection_signal_subscribe(
         handle->connection.get(), kServiceName, signal.interface, signal.member,
         handle->object_path.get(), nullptr, G_DBUS_SIGNAL_FLAGS_NONE, on_signal_callback,
@@ -143,7 +157,7 @@ int ims_unset_notification_cb(ims_h handle, int noti_id) {
     const Signal signal = find_signal(noti_id);
     if (signal.member == nullptr)
         return invalid_parameter();
-    const Text noti_str = signal.text();
+    const Text noti_str = signal_text(signal.interface, signal.member);
     const auto *subscription = static_cast<const ims_noti_cb_info_s *>(
         g_hash_table_lookup(handle->noti_table.get(), noti_str.get()));
     if (subscription == nullptr) {

@@ -4,8 +4,8 @@
 //     constexpr Notification kEvents[] = {
 //         {IMS_NOTI_CALL_ENDED, "CallEnded", emit<"(ii)", ims_call_ended_s>},
 //
-// A subscription keeps where its signals go: the handle, the decoder of the module, and the id by
-// which the decoder finds the row, at its place in the table.
+// A subscription keeps its signal and where that goes: the handle, the decoder of the module, and
+// the id by which the decoder finds the row, at its place in the table.
 #pragma once
 
 #include "client.hpp"
@@ -30,6 +30,8 @@ struct ims_noti_cb_info_s {
     ims_notification_cb callback;
     void *user_data;
     ims_h handle = nullptr;
+    const char *interface = nullptr; // with the member, the signal
+    const char *member = nullptr;
     ims::Decoder decode = nullptr;
     int noti_id = 0;
 };

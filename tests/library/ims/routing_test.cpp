@@ -22,10 +22,12 @@ class Routing : public WithPeer {
     }
 
     // As the bus does with every signal that the subscription is for.
-    void route(void *user_data) {
+    void route(void *user_data) { route(user_data, kCall, "CallEnded"); }
+
+    void route(void *user_data, const char *interface, const char *member) {
         const GDBusSignalCallback callback = observed_subscriptions().at(0).callback;
         const Variant parameters = parse("(ii)", "(3, 16)");
-        callback(nullptr, ":1.1", kPath, kCall, "CallEnded", parameters.get(), user_data);
+        callback(nullptr, ":1.1", kPath, interface, member, parameters.get(), user_data);
     }
 
     // What the bus keeps for it.
@@ -44,12 +46,35 @@ TEST_F(Routing, GivesASignalToTheCallbackOfItsSubscription) {
     EXPECT_TRUE(take_log().empty());
 }
 
-TEST_F(Routing, LooksNothingUpInTheTable) {
+TEST_F(Routing, LooksItsOwnSignalUpNowhere) {
     ims_noti_cb_info_s elsewhere = subscription();
     EXPECT_EQ(ims_unset_notification_cb(handle_, IMS_NOTI_CALL_ENDED), IMS_ERROR_NONE);
     route(&elsewhere);
     EXPECT_EQ(recorder_.count(), 1U);
     EXPECT_TRUE(take_log().empty());
+}
+
+TEST_F(Routing, LogsASignalWithoutAnEntry) {
+    route(&subscription(), kCall, "CallBusy");
+    EXPECT_EQ(recorder_.count(), 0U);
+    expect_one_line("ims.cpp", "on_signal_callback",
+                    "can't find noti_str(org.kelvo.ims.Call:CallBusy) callback info");
+}
+
+TEST_F(Routing, LogsASignalOfAnotherInterface) {
+    route(&subscription(), kPoc, "CallEnded");
+    EXPECT_EQ(recorder_.count(), 0U);
+    expect_one_line("ims.cpp", "on_signal_callback",
+                    "can't find noti_str(org.kelvo.ims.Poc:CallEnded) callback info");
+}
+
+TEST_F(Routing, GivesASignalOfAnotherSubscriptionToItsCallback) {
+    NotificationRecorder other;
+    listen(IMS_NOTI_CALL_SWITCHED, other);
+    route(&subscription(), kCall, "CallSwitched");
+    EXPECT_EQ(recorder_.count(), 0U);
+    ASSERT_EQ(other.count(), 1U);
+    EXPECT_EQ(other.all()[0].id, IMS_NOTI_CALL_SWITCHED);
 }
 
 TEST_F(Routing, LogsASignalOfNoSubscription) {
