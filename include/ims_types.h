@@ -75,8 +75,8 @@
  * What is *defined by the service* the library passes through unchanged and checks in no way: ids,
  * kinds, reasons, states, units and ranges, and every field with a neutral name such as `value_1`,
  * `flag_1`, `text_1` or `member_1`. The definitions of the stand-in service, `ims-sim`, are in
- * docs/stand-in.md, in the order of the methods' and signals' members. What a callback gets as its
- * result is the service's too; only 0, 1 and 2 have a meaning here.
+ * docs/stand-in.md and the pages that it lists, in the order of the methods' and signals' members.
+ * What a callback gets as its result is the service's too; only 0, 1 and 2 have a meaning here.
  *
  * @section ims_threads Threads
  *

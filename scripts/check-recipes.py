@@ -58,7 +58,7 @@ RECIPES = {
          "}\n\n"),
         ("sim/vt/interface.cpp", "    {\"StopCamera\", ",
          "    {\"TakeSample\", ask<&Vt::take_sample>, kConnection},\n"),
-        ("docs/stand-in.md", "| StopCamera |",
+        ("docs/stand-in/vt.md", "| StopCamera |",
          "| TakeSample | value | nothing | 10 a negative value |\n"),
         ("tests/library/vt/vt_rows.cpp",
          "        {.function = request<ims_vt_stop_camera, kSession>(),\n",
