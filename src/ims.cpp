@@ -31,25 +31,28 @@ using Client = std::unique_ptr<ims_client_s, ClientReleaser>;
 constexpr const Module *kModules[] = {&kRegModule, &kCallModule, &kSmsModule, &kPocModule,
                                       &kLoginModule};
 
-// The signal that brings an event.
-struct Signal {
-    const char *interface;
-    const char *member;
-    Decoder decode;
-};
-
-// No member for an id that nobody can ask for.
-Signal find_signal(int noti_id) noexcept {
-    for (const Module *module : kModules) {
-        if (const Notification *notification = module->find(noti_id))
-            return {module->interface, notification->member, module->decode};
-    }
-    return {};
-}
-
 // A signal as the table of subscriptions has it.
 Text signal_text(const char *interface, const char *member) noexcept {
     return Text{g_strdup_printf("%s:%s", interface, member)};
+}
+
+// The signal that brings an event.
+struct Signal {
+    const Module *module;
+    const Notification *row;
+
+    // As the table of subscriptions has it.
+    Text text() const noexcept { return signal_text(module->interface, row->member); }
+};
+
+// NULL for an id that nobody can ask for.
+Signal find_signal(int noti_id) noexcept {
+    for (const Module *module : kModules) {
+        const Notification *row = module->find(noti_id);
+        if (row != nullptr && row->member != nullptr)
+            return {module, row};
+    }
+    return {};
 }
 
 // GDBus delivers what is waiting only while the subscription lasts, so its record is there.
@@ -61,8 +64,8 @@ void on_signal_callback(GDBusConnection *, const char *, const char *, const cha
         return;
     }
     // Another signal than the one that was subscribed to goes where the table says.
-    if (!g_str_equal(member, subscription->member) ||
-        !g_str_equal(interface, subscription->interface)) {
+    if (!g_str_equal(member, subscription->row->member) ||
+        !g_str_equal(interface, subscription->module->interface)) {
         const Text noti_str = signal_text(interface, member);
         subscription = static_cast<const ims_noti_cb_info_s *>(
             g_hash_table_lookup(subscription->handle->noti_table.get(), noti_str.get()));
@@ -71,7 +74,8 @@ void on_signal_callback(GDBusConnection *, const char *, const char *, const cha
             return;
         }
     }
-    subscription->decode(subscription->handle, subscription->noti_id, parameters, subscription);
+    subscription->module->decode(subscription->handle, subscription->row->id, parameters,
+                                 subscription);
 }
 
 // For g_hash_table_foreach_remove(): TRUE removes the entry.
@@ -131,18 +135,17 @@ int ims_set_notification_cb(ims_h handle, int noti_id, ims_notification_cb callb
     if (const int refused = admit({reinterpret_cast<const void *>(callback), handle}))
         return refused;
     const Signal signal = find_signal(noti_id);
-    if (signal.member == nullptr)
+    if (signal.row == nullptr)
         return invalid_parameter();
-    Text noti_str = signal_text(signal.interface, signal.member);
+    Text noti_str = signal.text();
     if (g_hash_table_contains(handle->noti_table.get(), noti_str.get())) {
         log_error(here(), "noti_str[%s] is already registered", noti_str.get());
         return IMS_ERROR_INVALID_PARAMETER;
     }
     auto *subscription = g_new(ims_noti_cb_info_s, 1);
-    *subscription = {
-        0, callback, user_data, handle, signal.interface, signal.member, signal.decode, noti_id};
+    *subscription = {0, callback, user_data, handle, signal.module, signal.row};
     subscription->subscription_id = g_dbus_connection_signal_subscribe(
-        handle->connection.get(), kServiceName, signal.interface, signal.member,
+        handle->connection.get(), kServiceName, signal.module->interface, signal.row->member,
         handle->object_path.get(), nullptr, G_DBUS_SIGNAL_FLAGS_NONE, on_signal_callback,
         subscription, nullptr);
     g_hash_table_insert(handle->noti_table.get(), noti_str.release(), subscription);
@@ -155,9 +158,9 @@ int ims_unset_notification_cb(ims_h handle, int noti_id) {
     if (!handle->connection)
         return invalid_parameter();
     const Signal signal = find_signal(noti_id);
-    if (signal.member == nullptr)
+    if (signal.row == nullptr)
         return invalid_parameter();
-    const Text noti_str = signal_text(signal.interface, signal.member);
+    const Text noti_str = signal.text();
     const auto *subscription = static_cast<const ims_noti_cb_info_s *>(
         g_hash_table_lookup(handle->noti_table.get(), noti_str.get()));
     if (subscription == nullptr) {

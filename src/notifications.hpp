@@ -4,8 +4,8 @@
 //     constexpr Notification kEvents[] = {
 //         {IMS_NOTI_CALL_ENDED, "CallEnded", emit<"(ii)", ims_call_ended_s>},
 //
-// A subscription keeps its signal and where that goes: the handle, the decoder of the module, and
-// the id by which the decoder finds the row, at its place in the table.
+// A subscription keeps its row, the module, whose decoder finds the row by its id, at its place in
+// the table, and the handle.
 #pragma once
 
 #include "client.hpp"
@@ -22,6 +22,9 @@ namespace ims {
 using Decoder = void (*)(ims_h handle, int noti_id, GVariant *parameters,
                          const ims_noti_cb_info_s *subscription);
 
+struct Module;
+struct Notification;
+
 } // namespace ims
 
 // One subscription to a signal, which is given it as its user data.
@@ -30,10 +33,8 @@ struct ims_noti_cb_info_s {
     ims_notification_cb callback;
     void *user_data;
     ims_h handle = nullptr;
-    const char *interface = nullptr; // with the member, the signal
-    const char *member = nullptr;
-    ims::Decoder decode = nullptr;
-    int noti_id = 0;
+    const ims::Module *module = nullptr;
+    const ims::Notification *row = nullptr;
 };
 
 namespace ims {

@@ -64,7 +64,7 @@ TEST_P(Notifications, AreSubscribedToExactlyTheirSignal) {
     EXPECT_EQ(kept.callback, kCallback);
     EXPECT_EQ(kept.user_data, nullptr);
     EXPECT_EQ(kept.handle, handle_);
-    EXPECT_EQ(kept.noti_id, row.id);
+    EXPECT_EQ(kept.row->id, row.id);
     EXPECT_FALSE(subscriptions[0].has_free_function);
     EXPECT_FALSE(subscriptions[0].is_ended);
     EXPECT_TRUE(take_log().empty());

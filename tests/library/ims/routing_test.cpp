@@ -86,7 +86,8 @@ TEST_F(Routing, LogsASignalOfNoSubscription) {
 // The call decoder returns for it without a line.
 TEST_F(Routing, GivesTheDecoderAnIdThatNoEventHas) {
     ims_noti_cb_info_s unheard_of = subscription();
-    unheard_of.noti_id = 0;
+    const ims::Notification no_event{0, "CallEnded", nullptr};
+    unheard_of.row = &no_event;
     route(&unheard_of);
     EXPECT_EQ(recorder_.count(), 0U);
     EXPECT_TRUE(take_log().empty());
